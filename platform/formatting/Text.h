@@ -1,0 +1,22 @@
+// Internal to this folder: conversions between the UTF-16 of the formatters and UTF-8.
+#pragma once
+
+#include <cmath>
+#include <string>
+#include <string_view>
+
+namespace ax::formatting {
+
+std::string utf8From(std::u16string_view text);
+std::u16string utf16From(std::string_view text);  // ill-formed bytes become U+FFFD
+
+// The current locale's name with the Gregorian calendar, the one calendar used here.
+std::string gregorianLocaleName();
+
+// Times farther from 1970 than this, about 28,500 years, and NaN are not formatted.
+constexpr double kFarthestTime = 9e11;
+inline bool isFormattableTime(double seconds) {
+  return std::abs(seconds) <= kFarthestTime;
+}
+
+}  // namespace ax::formatting
