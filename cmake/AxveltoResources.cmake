@@ -1,4 +1,5 @@
-# axvelto_string_table(<target> <folder of .txt sources> <output folder, relative to the build tree>)
+# axvelto_string_table(<target> <folder of .txt sources> <output folder, relative to the build tree>
+#                      [NO_INSTALL])
 # compiles one ICU resource bundle per language and installs them under the same relative folder.
 
 find_program(GENRB genrb REQUIRED)
@@ -20,5 +21,7 @@ function(axvelto_string_table target sources output)
   string(MAKE_C_IDENTIFIER "${target}-${output}" name)
   add_custom_target(${name} ALL DEPENDS ${compiled})
   add_dependencies(${target} ${name})
-  install(FILES ${compiled} DESTINATION ${output})
+  if(NOT "NO_INSTALL" IN_LIST ARGN)
+    install(FILES ${compiled} DESTINATION ${output})
+  endif()
 endfunction()

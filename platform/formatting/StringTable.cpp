@@ -73,10 +73,8 @@ const StringTable::Texts& StringTable::textsOf(const std::string& file) const {
     const char* key = nullptr;
     int32_t length = 0;
     const char16_t* text = ures_getNextString(bundle.get(), &length, &key, &status);
-    if (status == U_RESOURCE_TYPE_MISMATCH)
-      status = U_ZERO_ERROR;  // a table within: not a text
-    else if (U_SUCCESS(status) && key != nullptr)
-      texts.emplace(key, utf8From({text, static_cast<std::size_t>(length)}));
+    if (text == nullptr || key == nullptr) continue;  // a table within
+    texts.emplace(key, utf8From({text, static_cast<std::size_t>(length)}));
   }
   return texts;
 }

@@ -1,0 +1,127 @@
+#include "platform/formatting/Dates.h"
+
+#include <gtest/gtest.h>
+
+#include <limits>
+
+#include "platform/formatting/CalendarMath.h"
+#include "platform/formatting/DateIntervals.h"
+#include "tests/formatting/RegionScope.h"
+
+namespace ax::formatting {
+
+constexpr double kInfinity = std::numeric_limits<double>::infinity();
+
+TEST(Dates, orderFieldsAsTheRegionDoes) {
+  const struct {
+    const char* locale;
+    const char* weekday;
+    const char* dayOfMonth;
+    const char* whole;
+  } cases[] = {{"en_US", "Sunday", "March 8", "Sunday, Mar 8, 2026"},
+               {"de_DE", "Sonntag", "8. März", "Sonntag, 8. März 2026"},
+               {"fr_FR", "dimanche", "8 mars", "dimanche 8 mars 2026"},
+               {"es_ES", "domingo", "8 de marzo", "domingo, 8 de mar de 2026"},
+               {"ja_JP", "日曜日", "3月8日", "2026年3月8日日曜日"},
+               {"ar_EG", "الأحد", "٨ مارس", "الأحد، ٨ مارس ٢٠٢٦"}};
+  for (const auto& c : cases) {
+    const RegionScope scope(c.locale);
+    const double time = *timeFromIso("2026-03-08T14:30:00Z");
+    EXPECT_EQ(dateString(time, "EEEE"), c.weekday);
+    EXPECT_EQ(dateString(time, "dMMMM"), c.dayOfMonth);
+    EXPECT_EQ(dateString(time, "EEEE, MMM d, yyyy"), c.whole);
+  }
+}
+
+TEST(Dates, belongToTheZoneAndTheGregorianCalendar) {
+  const double time = *timeFromIso("2026-03-08T02:00:00Z");
+  const RegionScope newYork("en_US", "America/New_York");
+  EXPECT_EQ(dateString(time, "EEEE"), "Saturday");
+  setCurrentRegion({"en_US", "Asia/Kathmandu"});
+  EXPECT_EQ(dateString(time, "EEEE"), "Sunday");
+  setCurrentRegion({"th_TH", "UTC"});
+  EXPECT_NE(dateString(time, "yyyy").find("2026"), std::string::npos);
+}
+
+TEST(Dates, haveFourStyles) {
+  const RegionScope scope("en_US");
+  const double time = *timeFromIso("2026-03-08");
+  EXPECT_EQ(dateStyleString(time, DateStyle::shortStyle), "3/8/26");
+  EXPECT_EQ(dateStyleString(time, DateStyle::mediumStyle), "Mar 8, 2026");
+  EXPECT_EQ(dateStyleString(time, DateStyle::longStyle), "March 8, 2026");
+  EXPECT_EQ(dateStyleString(time, DateStyle::fullStyle), "Sunday, March 8, 2026");
+  EXPECT_EQ(dateStyleString(time, DateStyle{9}), "");
+}
+
+TEST(Dates, withoutATimeAreEmpty) {
+  EXPECT_EQ(dateString(kInfinity, "EEEE"), "");
+  EXPECT_EQ(dateString(std::numeric_limits<double>::quiet_NaN(), "EEEE"), "");
+  EXPECT_EQ(dateString(0, ""), "");
+  EXPECT_EQ(dateIntervalString(0, kInfinity, "ha"), "");
+}
+
+TEST(Dates, readMonthNumbersAndNothingElse) {
+  for (const char* locale : {"en_US", "ar_EG", "ja_JP"}) {
+    const RegionScope scope(locale, "America/New_York");
+    EXPECT_EQ(parseDate("3", "MM"), timeFromIso("2000-03-01")) << locale;
+    EXPECT_EQ(parseDate("03", "MM"), timeFromIso("2000-03-01")) << locale;
+    EXPECT_EQ(parseDate("٣", "MM"), timeFromIso("2000-03-01")) << locale;
+    EXPECT_EQ(parseDate("12", "MM"), timeFromIso("2000-12-01")) << locale;
+    for (const char* text : {"", "0", "13", "-3", "3x", "x"})
+      EXPECT_EQ(parseDate(text, "MM"), std::nullopt) << text;
+  }
+}
+
+TEST(Dates, readWholeDates) {
+  const RegionScope scope("en_US", "Europe/Berlin");
+  EXPECT_EQ(parseDate("2026-03-29", "yyyy-MM-dd"), timeFromIso("2026-03-29"));
+  EXPECT_EQ(parseDate("2026-02-30", "yyyy-MM-dd"), std::nullopt);
+  EXPECT_EQ(parseDate("March 49", "MMMM yy"), timeFromIso("2049-03-01"));
+  EXPECT_EQ(parseDate("March 50", "MMMM yy"), timeFromIso("1950-03-01"));
+}
+
+TEST(Dates, nameTheWeekdays) {
+  const RegionScope scope("en_US");
+  ASSERT_EQ(weekdaySymbols().size(), 7u);
+  EXPECT_EQ(weekdaySymbols().front(), "Sunday");
+  EXPECT_EQ(&standaloneWeekdaySymbols(), &standaloneWeekdaySymbols());
+  setCurrentRegion({"fr_FR", "UTC"});
+  ASSERT_EQ(standaloneWeekdaySymbols().size(), 7u);
+  EXPECT_EQ(standaloneWeekdaySymbols().back(), "samedi");
+  EXPECT_EQ(weekdaySymbols().back(), "samedi");
+}
+
+TEST(DateIntervals, sayOnceWhatBothEndsShare) {
+  const RegionScope scope("en_US", "America/New_York");
+  const auto span = [](const char* start, const char* end, const char* dateTemplate) {
+    return plainSpaces(dateIntervalString(*timeFromIso(start), *timeFromIso(end), dateTemplate));
+  };
+  EXPECT_EQ(span("2026-03-07T00:00:00", "2026-03-07T03:00:00", "hxa"), "12 – 3 AM");
+  EXPECT_EQ(span("2026-03-07T09:00:00", "2026-03-07T12:00:00", "hxa"), "9 AM – 12 PM");
+  EXPECT_EQ(span("2026-03-07T21:00:00", "2026-03-07T23:59:59", "h:mma"), "9:00 – 11:59 PM");
+  EXPECT_EQ(span("2026-03-01T00:00:00", "2026-03-31T00:00:00", "MMMMdyyyy"), "March 1 – 31, 2026");
+  EXPECT_EQ(span("2025-12-31T00:00:00", "2026-01-06T00:00:00", "MMMMdyyyy"),
+            "December 31, 2025 – January 6, 2026");
+  EXPECT_EQ(span("2026-03-07T02:00:00", "2026-03-07T02:00:00", "hxa"), "2 AM");
+  EXPECT_EQ(span("2026-11-01T01:00:00-04:00", "2026-11-01T01:00:00-05:00", "hxa"), "1 AM");
+  EXPECT_EQ(span("2026-03-07T05:00:00", "2026-03-07T02:00:00", "ha"), "5 – 2 AM");
+}
+
+TEST(DateIntervals, followTheLanguage) {
+  const struct {
+    const char* locale;
+    const char* hours;
+    const char* days;
+  } cases[] = {{"de_DE", "12 – 3 Uhr AM", "1.–4. Januar 1970"},
+               {"fr_FR", "12 – 3 AM", "1–4 janvier 1970"},
+               {"es_ES", "12–3 a. m.", "1–4 de enero de 1970"},
+               {"ja_JP", "午前0時～3時", "1970年1月1日～4日"},
+               {"ar_EG", "١٢–٣ ص", "١–٤ يناير، ١٩٧٠"}};
+  for (const auto& c : cases) {
+    const RegionScope scope(c.locale);
+    EXPECT_EQ(plainSpaces(dateIntervalString(0, 10800, "hxa")), c.hours);
+    EXPECT_EQ(dateIntervalString(0, 3 * 86400, "MMMMdyyyy"), c.days);
+  }
+}
+
+}  // namespace ax::formatting
