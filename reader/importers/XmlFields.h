@@ -1,0 +1,45 @@
+#pragma once
+
+#include <limits>
+#include <optional>
+#include <pugixml.hpp>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace ax::reader {
+
+// Reading elements by local name: a file may put any of its elements behind a namespace prefix. An element
+// that is missing reads as a null node, and a null node has no children and no text.
+
+std::string_view localName(pugi::xml_node node);
+
+// The first child element of that name; along a path such as "Creator/Name", the first child's first child.
+pugi::xml_node childNamed(pugi::xml_node node, std::string_view name);
+pugi::xml_node childAt(pugi::xml_node node, std::string_view path);
+std::vector<pugi::xml_node> childrenNamed(pugi::xml_node node, std::string_view name);
+
+// The element anywhere below `node`, in the order of the file.
+pugi::xml_node descendantNamed(pugi::xml_node node, std::string_view name);
+
+// The element's own text without surrounding blanks.
+std::string textOf(pugi::xml_node node);
+
+// The first line that says something, with runs of blanks made one: fit to be spoken.
+std::string lineOf(std::string_view text);
+
+// Closed at both ends.
+struct NumberLimits {
+  double least;
+  double most;
+};
+constexpr double beyondAnyRecord = 1e12;
+constexpr NumberLimits notNegative{0, beyondAnyRecord};
+constexpr NumberLimits positive{std::numeric_limits<double>::min(), beyondAnyRecord};
+constexpr NumberLimits latitudes{-90, 90};
+constexpr NumberLimits longitudes{-180, 180};
+
+// A decimal number with nothing but blanks around it, in the notation of XML whatever the locale.
+std::optional<double> parseNumber(std::string_view text, NumberLimits limits);
+
+}  // namespace ax::reader
