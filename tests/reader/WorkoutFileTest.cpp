@@ -88,7 +88,7 @@ constexpr std::string_view pausedRun = R"(
  </t:Activity>
 </t:Activities></t:TrainingCenterDatabase>)";
 
-TEST(TcxFile, readsLapsPausesAndPrefixedElements) {
+TEST(TcxFile, ReadsLapsPausesAndPrefixedElements) {
   const WorkoutActivity run = readOne(pausedRun);
   EXPECT_EQ(run.title, "Along the canal");
   EXPECT_EQ(run.sport, "running");
@@ -113,7 +113,7 @@ TEST(TcxFile, readsLapsPausesAndPrefixedElements) {
   EXPECT_EQ(run.segments[1].count, 1U);
 }
 
-TEST(TcxFile, leavesOutValuesThatCannotBe) {
+TEST(TcxFile, LeavesOutValuesThatCannotBe) {
   for (const char* rate : {"0", "-3", "nan", "inf", "1e999", "12,5", "12 bpm", ""}) {
     const auto beats = "<HeartRateBpm><Value>" + std::string(rate) + "</Value></HeartRateBpm>";
     const auto run = readOne(inLap("<Track>" + tcxPoint(0, beats + position("60", "+10")) + "</Track>"));
@@ -127,7 +127,7 @@ TEST(TcxFile, leavesOutValuesThatCannotBe) {
   }
 }
 
-TEST(TcxFile, measuresWhatTheLapsDoNotTell) {
+TEST(TcxFile, MeasuresWhatTheLapsDoNotTell) {
   const std::string recorded = "<Track>" + tcxPoint(0, "<DistanceMeters>5</DistanceMeters>") + tcxPoint(9) +
                                tcxPoint(20, "<DistanceMeters>70</DistanceMeters>") + "</Track>";
   const auto zeroLap = readOne(inLap("<DistanceMeters>0.0</DistanceMeters>" + recorded));
@@ -153,7 +153,7 @@ TEST(TcxFile, measuresWhatTheLapsDoNotTell) {
   EXPECT_EQ(still.metres, 0);
 }
 
-TEST(TcxFile, measuresLapsThatCountFromZeroAgain) {
+TEST(TcxFile, MeasuresLapsThatCountFromZeroAgain) {
   const auto track = [](const char* metres, int second) {
     return "<Track>" + tcxPoint(second, "<DistanceMeters>" + std::string(metres) + "</DistanceMeters>") +
            "</Track></Lap>";
@@ -167,7 +167,7 @@ TEST(TcxFile, measuresLapsThatCountFromZeroAgain) {
   EXPECT_EQ(run.laps[2].metres, 100);
 }
 
-TEST(TcxFile, takesTimesInAnyOrder) {
+TEST(TcxFile, TakesTimesInAnyOrder) {
   const auto run = readOne(inLap("<Track>" + tcxPoint(30) + tcxPoint(10) + tcxPoint(10) + tcxPoint(50) +
                                  tcxPoint(40) + "</Track>"));
   EXPECT_EQ(run.start, seven + 10);
@@ -176,7 +176,7 @@ TEST(TcxFile, takesTimesInAnyOrder) {
   EXPECT_EQ(run.points[0].time, seven + 30);
 }
 
-TEST(TcxFile, readsEveryActivityThatTellsSomething) {
+TEST(TcxFile, ReadsEveryActivityThatTellsSomething) {
   const std::string lap = "<Lap StartTime='2026-03-08T07:00:00Z'><TotalTimeSeconds>600</TotalTimeSeconds>";
   const std::string leg =
       "<Activity Sport='Swimming'>" + lap + "<Track>" + tcxPoint(1) + "</Track></Lap></Activity>";
@@ -193,7 +193,7 @@ TEST(TcxFile, readsEveryActivityThatTellsSomething) {
   EXPECT_EQ(file.activities[2].sourceName, "Log");
 }
 
-TEST(GpxFile, readsTracksSegmentsAndHeartRates) {
+TEST(GpxFile, ReadsTracksSegmentsAndHeartRates) {
   const std::string direct = "<extensions><hr>100</hr></extensions>";
   const std::string nested =
       "<g:extensions><p:TrackPointExtension><p:atemp>9</p:atemp><p:hr> 101.5 </p:hr>"
@@ -228,14 +228,14 @@ TEST(GpxFile, readsTracksSegmentsAndHeartRates) {
   EXPECT_EQ(file.activities[1].start, seven);
 }
 
-TEST(GpxFile, countsTheWholeSpanWhenEverySegmentIsOnePoint) {
+TEST(GpxFile, CountsTheWholeSpanWhenEverySegmentIsOnePoint) {
   const auto walk =
       readOne(inGpx("<trk><type>walking</type><trkseg>" + gpxPoint("50", "2026-03-08T07:00:00Z") +
                     "</trkseg><trkseg>" + gpxPoint("50", "2026-03-08T07:10:00Z") + "</trkseg></trk>"));
   EXPECT_EQ(walk.activeSeconds, 600);
 }
 
-TEST(WorkoutFileReader, understandsTheEncodingsThatFilesComeIn) {
+TEST(WorkoutFileReader, UnderstandsTheEncodingsThatFilesComeIn) {
   const std::string start = "<?xml version='1.0'?>" + inGpx("<trk><name>Caf");
   const std::string cut = start.substr(0, start.size() - std::string("</gpx>").size());
   const std::string rest =
@@ -255,7 +255,7 @@ struct FaultCase {
   std::string bytes, what, place, expected;
 };
 
-TEST(WorkoutFileReader, tellsWhatIsWrongWithAFileAndWhere) {
+TEST(WorkoutFileReader, TellsWhatIsWrongWithAFileAndWhere) {
   const FaultCase cases[] = {
       {"", "there is no element", "line 1, column 1", "an XML document"},
       {"<?xml version='1.0'?>\n <k:kml xmlns:k='u'/>", "the root element is kml", "line 2, column 3",
@@ -286,14 +286,14 @@ TEST(WorkoutFileReader, tellsWhatIsWrongWithAFileAndWhere) {
   }
 }
 
-TEST(WorkoutFileReader, refusesAFileCutAnywhere) {
+TEST(WorkoutFileReader, RefusesAFileCutAnywhere) {
   for (std::size_t length = 0; length < pausedRun.size(); ++length) {
     const WorkoutFileResult result = readWorkoutFile(pausedRun.substr(0, length), "test");
     ASSERT_TRUE(std::holds_alternative<WorkoutFileFault>(result)) << length;
   }
 }
 
-TEST(IsoTime, readsOffsetsAndFractionsAndRefusesTheRest) {
+TEST(IsoTime, ReadsOffsetsAndFractionsAndRefusesTheRest) {
   for (const char* text :
        {"2026-03-08T07:00:00Z", "2026-03-08T07:00:00", "2026-03-08T07:00Z", " 2026-03-08 07:00:00z\n",
         "2026-03-08T12:30:00+05:30", "2026-03-07T23:00:00.000-0800", "2026-03-08T08:00:00,0+01"}) {
@@ -309,7 +309,7 @@ TEST(IsoTime, readsOffsetsAndFractionsAndRefusesTheRest) {
   }
 }
 
-TEST(Sport, knowsTheWordsOfFiles) {
+TEST(Sport, KnowsTheWordsOfFiles) {
   const std::pair<const char*, const char*> cases[] = {{"Running", "running"},
                                                        {"TrailRun", "running"},
                                                        {"Biking", "cycling"},
