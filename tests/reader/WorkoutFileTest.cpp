@@ -293,7 +293,7 @@ TEST(WorkoutFileReader, RefusesAFileCutAnywhere) {
   }
 }
 
-TEST(IsoTime, ReadsOffsetsAndFractionsAndRefusesTheRest) {
+TEST(WorkoutIsoTime, ReadsOffsetsAndFractionsAndRefusesTheRest) {
   for (const char* text :
        {"2026-03-08T07:00:00Z", "2026-03-08T07:00:00", "2026-03-08T07:00Z", " 2026-03-08 07:00:00z\n",
         "2026-03-08T12:30:00+05:30", "2026-03-07T23:00:00.000-0800", "2026-03-08T08:00:00,0+01"}) {
@@ -309,7 +309,7 @@ TEST(IsoTime, ReadsOffsetsAndFractionsAndRefusesTheRest) {
   }
 }
 
-TEST(Sport, KnowsTheWordsOfFiles) {
+TEST(WorkoutSport, KnowsTheWordsOfFiles) {
   const std::pair<const char*, const char*> cases[] = {{"Running", "running"},
                                                        {"TrailRun", "running"},
                                                        {"Biking", "cycling"},
