@@ -12,15 +12,11 @@ namespace {
 
 constexpr double kDay = 86400;
 
-double usable(double time) {
-  return std::isnan(time) ? 0 : std::clamp(time, -kFarthestTime, kFarthestTime);
-}
-
 }  // namespace
 
 CalendarFields calendarFields(double time) {
   using namespace std::chrono;
-  time = usable(time);
+  time = boundedTime(time);
   const auto local = static_cast<std::int64_t>(std::floor(time + zoneRangeAt(time).offset));
   const sys_days day = floor<days>(sys_seconds(seconds(local)));
   const year_month_day date(day);
@@ -35,7 +31,7 @@ CalendarFields calendarFields(double time) {
 }
 
 double startOfDay(double time) {
-  time = usable(time);
+  time = boundedTime(time);
   const ZoneRange& range = zoneRangeAt(time);
   const double localMidnight = std::floor((time + range.offset) / kDay) * kDay;
   const double beforeChange = localMidnight - range.formerOffset;
@@ -44,16 +40,16 @@ double startOfDay(double time) {
 }
 
 std::int64_t dayNumber(double time) {
-  time = usable(time);
+  time = boundedTime(time);
   return static_cast<std::int64_t>(std::floor((time + zoneRangeAt(time).offset) / kDay));
 }
 
 double zoneOffset(double time) {
-  return zoneRangeAt(usable(time)).offset;
+  return zoneRangeAt(boundedTime(time)).offset;
 }
 
 double daylightSavingOffset(double time) {
-  return zoneRangeAt(usable(time)).daylight;
+  return zoneRangeAt(boundedTime(time)).daylight;
 }
 
 }  // namespace ax::formatting

@@ -7,6 +7,7 @@
 #include <cstdlib>
 
 #include "platform/formatting/CalendarMath.h"
+#include "platform/formatting/Text.h"
 #include "platform/formatting/ZoneRanges.h"
 
 namespace ax::formatting {
@@ -123,11 +124,7 @@ std::optional<double> timeFromIso(std::string_view text) {
 }
 
 std::string isoFromTime(double time) {
-  const CalendarFields fields = calendarFields(time);
-  char text[48];
-  std::snprintf(text, sizeof text, "%04d-%02d-%02dT%02d:%02d:%02d", fields.year, fields.month, fields.day,
-                fields.hour, fields.minute, fields.second);
-  return text;
+  return isoOfLocal(boundedTime(time) + zoneOffset(time));
 }
 
 std::string isoWithOffset(double time) {
@@ -135,7 +132,7 @@ std::string isoWithOffset(double time) {
   char offset[16];
   std::snprintf(offset, sizeof offset, "%c%02d:%02d", minutes < 0 ? '-' : '+', std::abs(minutes) / 60,
                 std::abs(minutes) % 60);
-  return isoOfLocal(time + minutes * 60.0) + offset;
+  return isoOfLocal(boundedTime(time) + minutes * 60.0) + offset;
 }
 
 }  // namespace ax::formatting

@@ -1,6 +1,7 @@
 // Internal to this folder: conversions between the UTF-16 of the formatters and UTF-8.
 #pragma once
 
+#include <algorithm>
 #include <cmath>
 #include <string>
 #include <string_view>
@@ -17,6 +18,11 @@ std::string gregorianLocaleName();
 constexpr double kFarthestTime = 9e11;
 inline bool isFormattableTime(double seconds) {
   return std::abs(seconds) <= kFarthestTime;
+}
+
+// For arithmetic that must answer something: NaN counts as 0, what is too far as the limit.
+inline double boundedTime(double seconds) {
+  return std::isnan(seconds) ? 0 : std::clamp(seconds, -kFarthestTime, kFarthestTime);
 }
 
 }  // namespace ax::formatting

@@ -18,12 +18,12 @@ namespace {
 
 constexpr double kEver = std::numeric_limits<double>::infinity();
 
-// Readings come in runs, so a handful of stretches serves them; the oldest makes room.
+// Readings come in runs, so a few stretches serve them; the oldest makes room.
 struct ZoneClock {
   std::uint64_t generation = 0;
   std::unique_ptr<icu::TimeZone> zone;
   const icu::BasicTimeZone* rules = nullptr;  // `zone`, when its changes can be told
-  std::array<ZoneRange, 8> ranges;
+  std::array<ZoneRange, 32> ranges;
   std::size_t held = 0;
   std::size_t next = 0;
   std::size_t last = 0;
