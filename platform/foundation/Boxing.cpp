@@ -1,0 +1,67 @@
+#include "platform/runtime/Boxing.h"
+
+#include "platform/foundation/Number.h"
+#include "platform/foundation/Value.h"
+#include "platform/runtime/ClassBuilder.h"
+
+namespace ax {
+
+Class& Value::staticClass() {
+  static Class& result = ClassBuilder<Value>("Value", Object::staticClass()).build();
+  return result;
+}
+
+bool Value::isEqual(const Object& other) const {
+  const Value* value = cast<Value>(const_cast<Object*>(&other));
+  return value != nullptr && value->content_ == content_;
+}
+
+Ref<Object> box(bool value) { return number(value); }
+Ref<Object> box(std::int32_t value) { return number(value); }
+Ref<Object> box(std::int64_t value) { return number(value); }
+Ref<Object> box(std::uint32_t value) { return number(value); }
+Ref<Object> box(std::uint64_t value) { return number(value); }
+Ref<Object> box(float value) { return number(value); }
+Ref<Object> box(double value) { return number(value); }
+Ref<Object> box(Point value) { return make<Value>(value); }
+Ref<Object> box(Size value) { return make<Value>(value); }
+Ref<Object> box(Rect value) { return make<Value>(value); }
+Ref<Object> box(Insets value) { return make<Value>(value); }
+Ref<Object> box(Selector value) { return value ? Ref<Object>(make<Value>(value)) : nullptr; }
+Ref<Object> box(const Class* value) { return Ref<Object>(const_cast<Class*>(value)); }
+
+namespace {
+
+template <class T>
+T unboxValue(const Ref<Object>& object) {
+  const Value* value = cast<Value>(object.get());
+  return value == nullptr ? T() : value->get<T>();
+}
+
+}  // namespace
+
+bool unboxBool(const Ref<Object>& object) {
+  const Number* number = cast<Number>(object.get());
+  return number != nullptr && number->boolValue();
+}
+
+std::int64_t unboxInt(const Ref<Object>& object) {
+  const Number* number = cast<Number>(object.get());
+  return number == nullptr ? 0 : number->int64Value();
+}
+
+double unboxDouble(const Ref<Object>& object) {
+  const Number* number = cast<Number>(object.get());
+  return number == nullptr ? 0 : number->doubleValue();
+}
+
+Point unboxPoint(const Ref<Object>& object) { return unboxValue<Point>(object); }
+Size unboxSize(const Ref<Object>& object) { return unboxValue<Size>(object); }
+Rect unboxRect(const Ref<Object>& object) { return unboxValue<Rect>(object); }
+Insets unboxInsets(const Ref<Object>& object) { return unboxValue<Insets>(object); }
+Selector unboxSelector(const Ref<Object>& object) { return unboxValue<Selector>(object); }
+const Class* unboxClass(const Ref<Object>& object) { return cast<Class>(object.get()); }
+
+static const RegisteredClass<Value> registered;
+
+}  // namespace ax

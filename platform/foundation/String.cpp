@@ -1,0 +1,60 @@
+#include "platform/foundation/String.h"
+
+#include <array>
+
+#include "platform/runtime/ClassBuilder.h"
+#include "platform/runtime/KeyReading.h"
+
+namespace ax {
+
+Class& String::staticClass() {
+  static Class& result = ClassBuilder<String>("String", Object::staticClass()).build();
+  return result;
+}
+
+bool String::isEqual(const Object& other) const {
+  const String* text = cast<String>(const_cast<Object*>(&other));
+  return text != nullptr && text->text_ == text_;
+}
+
+Ref<String> emptyString() {
+  static const Ref<String>& empty = *new Ref<String>(string(""));
+  return empty;
+}
+
+std::vector<Ref<String>> componentsSeparatedByNewlines(const String& text) {
+  static constexpr std::array<std::string_view, 7> newlines = {"\n", "\r", "\v", "\f", "\xC2\x85", "\xE2\x80\xA8",
+                                                              "\xE2\x80\xA9"};
+  std::vector<Ref<String>> pieces;
+  const std::string_view all = text.text();
+  std::size_t start = 0;
+  for (std::size_t i = 0; i < all.size();) {
+    std::size_t length = 0;
+    for (std::string_view newline : newlines) {
+      if (all.substr(i).starts_with(newline)) length = newline.size();
+    }
+    if (length == 0) {
+      ++i;
+      continue;
+    }
+    pieces.push_back(string(std::string(all.substr(start, i - start))));
+    start = i += length;
+  }
+  pieces.push_back(string(std::string(all.substr(start))));
+  return pieces;
+}
+
+Ref<String> stringByRemoving(const Ref<String>& text, std::string_view part) {
+  if (!text || !text->contains(part)) return text;
+  std::string kept = text->text();
+  for (std::size_t at = kept.find(part); at != std::string::npos; at = kept.find(part, at)) {
+    kept.erase(at, part.size());
+  }
+  return string(std::move(kept));
+}
+
+Ref<String> safeStringForKey(Receiver receiver, Key key) { return cast<String>(safeValueForKey(receiver, key)); }
+
+static const RegisteredClass<String> registered;
+
+}  // namespace ax

@@ -1,0 +1,100 @@
+#include "platform/health/Unit.h"
+
+#include <array>
+
+#include "platform/foundation/Bundle.h"
+#include "platform/runtime/ClassBuilder.h"
+
+namespace ax {
+
+namespace {
+
+struct SimpleUnit {
+  std::string_view text;
+  double factor;
+  char dimension;  // energy, time, length, mass, volume, temperature; a blank for a plain number
+};
+
+constexpr std::array simpleUnits = {
+    SimpleUnit{"kcal", 4184, 'E'},   SimpleUnit{"cal", 4.184, 'E'},     SimpleUnit{"kJ", 1000, 'E'},
+    SimpleUnit{"s", 1, 'T'},         SimpleUnit{"min", 60, 'T'},        SimpleUnit{"hr", 3600, 'T'},
+    SimpleUnit{"m", 1, 'L'},         SimpleUnit{"km", 1000, 'L'},       SimpleUnit{"mi", 1609.344, 'L'},
+    SimpleUnit{"ft", 0.3048, 'L'},   SimpleUnit{"yd", 0.9144, 'L'},     SimpleUnit{"g", 0.001, 'M'},
+    SimpleUnit{"kg", 1, 'M'},        SimpleUnit{"lb", 0.45359237, 'M'}, SimpleUnit{"ml", 0.001, 'V'},
+    SimpleUnit{"L", 1, 'V'},         SimpleUnit{"count", 1, ' '},       SimpleUnit{"%", 0.01, ' '},
+};
+
+std::string_view prefixText(MetricPrefix prefix) {
+  switch (prefix) {
+    case MetricPrefix::milli:
+      return "m";
+    case MetricPrefix::kilo:
+      return "k";
+    case MetricPrefix::none:
+      break;
+  }
+  return "";
+}
+
+Ref<Unit> simpleUnit(std::string_view text) {
+  for (const SimpleUnit& unit : simpleUnits) {
+    if (unit.text != text) continue;
+    Unit::Dimension dimension;
+    if (unit.dimension != ' ') dimension[unit.dimension] = 1;
+    return make<Unit>(std::string(text), unit.factor, dimension);
+  }
+  return nullptr;
+}
+
+}  // namespace
+
+Class& Unit::staticClass() {
+  static Class& result = ClassBuilder<Unit>("Unit", Object::staticClass())
+                             .method<&Unit::unitString>("unitString")
+                             .classMethod<&Unit::minuteUnit>("minuteUnit")
+                             .build();
+  return result;
+}
+
+Ref<Unit> Unit::unitFromString(std::string_view text) {
+  const std::size_t slash = text.find('/');
+  Ref<Unit> unit = simpleUnit(text.substr(0, slash));
+  while (unit && text.find('/') != std::string_view::npos) {
+    text.remove_prefix(text.find('/') + 1);
+    const Ref<Unit> divisor = simpleUnit(text.substr(0, text.find('/')));
+    unit = divisor ? unit->unitDividedByUnit(*divisor) : nullptr;
+  }
+  return unit;
+}
+
+Ref<Unit> Unit::literUnitWithMetricPrefix(MetricPrefix prefix) {
+  return unitFromString(prefix == MetricPrefix::none ? "L" : std::string(prefixText(prefix)) + "l");
+}
+Ref<Unit> Unit::gramUnitWithMetricPrefix(MetricPrefix prefix) {
+  return unitFromString(std::string(prefixText(prefix)) + "g");
+}
+Ref<Unit> Unit::meterUnitWithMetricPrefix(MetricPrefix prefix) {
+  return unitFromString(std::string(prefixText(prefix)) + "m");
+}
+
+Ref<Unit> Unit::unitDividedByUnit(const Unit& divisor) const {
+  Dimension dimension = dimension_;
+  for (const auto& [quantity, power] : divisor.dimension_) {
+    if ((dimension[quantity] -= power) == 0) dimension.erase(quantity);
+  }
+  return make<Unit>(unitString_ + "/" + divisor.unitString_, factor_ / divisor.factor_, std::move(dimension));
+}
+
+bool Unit::isEqual(const Object& other) const {
+  const Unit* unit = cast<Unit>(const_cast<Object*>(&other));
+  return unit != nullptr && unit->unitString_ == unitString_;
+}
+
+std::string Unit::description() const {
+  const Ref<String> spoken = platformString("unit." + unitString_);
+  return spoken ? spoken->text() : unitString_;
+}
+
+static const RegisteredClass<Unit> registered;
+
+}  // namespace ax

@@ -1,0 +1,49 @@
+#pragma once
+
+#include <map>
+
+#include "platform/foundation/String.h"
+
+namespace ax {
+
+enum class MetricPrefix { none, milli, kilo };
+
+// A unit of measurement: a product of powers of base units, with a factor to the base. Its description is
+// its spoken name in the reader's language where there is one, else its unit string.
+class Unit final : public Object {
+ public:
+  static Class& staticClass();
+  // What the unit measures: the power of each base quantity.
+  using Dimension = std::map<char, int>;
+
+  Unit(std::string unitString, double factor, Dimension dimension)
+      : unitString_(std::move(unitString)), factor_(factor), dimension_(std::move(dimension)) {}
+
+  // Nil for a text that names no unit: "kcal", "min", "km", "ml/kg/min", "count/min" are some that do.
+  static Ref<Unit> unitFromString(std::string_view text);
+
+  static Ref<Unit> kilocalorieUnit() { return unitFromString("kcal"); }
+  static Ref<Unit> minuteUnit() { return unitFromString("min"); }
+  static Ref<Unit> hourUnit() { return unitFromString("hr"); }
+  static Ref<Unit> countUnit() { return unitFromString("count"); }
+  static Ref<Unit> meterUnit() { return unitFromString("m"); }
+  static Ref<Unit> literUnitWithMetricPrefix(MetricPrefix prefix);
+  static Ref<Unit> gramUnitWithMetricPrefix(MetricPrefix prefix);
+  static Ref<Unit> meterUnitWithMetricPrefix(MetricPrefix prefix);
+  Ref<Unit> unitDividedByUnit(const Unit& divisor) const;
+
+  const std::string& text() const { return unitString_; }
+  Ref<String> unitString() const { return string(unitString_); }
+  double factor() const { return factor_; }
+  bool isCompatibleWithUnit(const Unit& other) const { return dimension_ == other.dimension_; }
+
+  bool isEqual(const Object& other) const override;
+  std::string description() const override;
+
+ private:
+  std::string unitString_;
+  double factor_;
+  Dimension dimension_;
+};
+
+}  // namespace ax

@@ -1,0 +1,123 @@
+#pragma once
+
+#include <deque>
+#include <functional>
+#include <string>
+#include <vector>
+
+#include "platform/runtime/Method.h"
+#include "platform/runtime/Object.h"
+#include "platform/runtime/SelectorTable.h"
+
+namespace ax {
+
+// A member that is reached by name: plain functions that read and write it, and its declared type (a class
+// name, or the type code of a scalar).
+struct InstanceVariable {
+  Selector selector = {};
+  std::string type = {};
+  Ref<Object> (*read)(const Object&) = nullptr;
+  bool (*write)(Object&, const Ref<Object>&) = nullptr;  // false: the value is of another kind
+};
+
+// How a class answers one key: an instance variable, a method without arguments, or neither.
+struct KeyReader {
+  Selector selector = {};
+  const InstanceVariable* variable = nullptr;
+  const Method* method = nullptr;
+};
+
+// A class of the process, known by its name. Class objects live as long as the process. A class is itself an
+// object: its class is its metaclass, which holds the class methods, so that messages and keys go to classes
+// as they go to instances.
+//
+// Classes are registered, grafted and hidden on one thread at a time; they may be looked up, and messages
+// sent, from any thread.
+class Class final : public Object {
+ public:
+  static Class& staticClass();
+
+  // The class registered under a name, or nil; hidden classes are not found by name.
+  static Class* named(std::string_view name);
+  static Class* namedEvenIfHidden(std::string_view name);
+  static std::vector<Class*> all();
+
+  // Registers a class; the name must be new. `factory` makes an instance, or is null for abstract classes.
+  static Class& add(std::string name, Class* superclass, Ref<Object> (*factory)());
+
+  const std::string& name() const { return name_; }
+  Class* superclass() const { return superclass_; }
+  bool isSubclassOf(const Class& other) const {
+    return other.depth_ < lineage_.size() && lineage_[other.depth_] == &other;
+  }
+  bool isMetaclass() const { return isMetaclass_; }
+  Class& metaclass() { return *metaclass_; }
+  const Class& metaclass() const { return *metaclass_; }
+  bool isHidden() const { return isHidden_; }
+  Ref<Object> instantiate() const { return factory_ == nullptr ? nullptr : factory_(); }
+
+  // The entry that answers a message; one without a function when the class lacks it. Never fails.
+  const Method& lookUp(Selector selector) const {
+    const Method* method = methodCache_.find(selector);
+    return method != nullptr ? *method : lookUpSlowly(selector);
+  }
+  // What the superclass answers at this moment.
+  const Method& lookUpInSuperclass(Selector selector) const {
+    return superclass_ == nullptr ? *selector.record()->missing : superclass_->lookUp(selector);
+  }
+  const Method* ownMethod(Selector selector) const { return methods_.find(selector); }
+  // Inherited ones included.
+  const InstanceVariable* instanceVariable(Selector selector) const;
+  const InstanceVariable* instanceVariableEvenIfHidden(Selector selector) const;
+  const KeyReader& readerForKey(Key key) const {
+    const KeyReader* reader = keyCache_.find(key);
+    return reader != nullptr ? *reader : readerForKeySlowly(key);
+  }
+  bool conformsTo(std::string_view protocol) const;
+  void forEachOwnMethod(const std::function<void(const Method&)>& visit) const;
+  void forEachOwnInstanceVariable(const std::function<void(const InstanceVariable&)>& visit) const;
+
+  // Puts an entry into the method table, in place of a former one with its selector. The caller's `owner` is
+  // overwritten. Returns the entry as it stands.
+  const Method& addMethod(Method method);
+  void addInstanceVariable(InstanceVariable variable);
+  void addProtocol(std::string name) { protocols_.push_back(std::move(name)); }
+  // Takes a class or a member out of everything that works by name, as if the host had renamed it. Objects
+  // that exist, or are made later, keep working. False when there is no such member.
+  void hide();
+  bool hideMember(std::string_view name);
+  bool hasHiddenMember(Selector selector) const;  // here or in a class above
+
+  std::string description() const override { return name_; }
+
+ private:
+  Class(std::string name, Class* superclass, Ref<Object> (*factory)());
+  const Method& lookUpSlowly(Selector selector) const;
+  const KeyReader& readerForKeySlowly(Key key) const;
+  void forgetCaches();
+
+  std::string name_;
+  Class* superclass_;
+  Class* metaclass_ = nullptr;
+  std::size_t depth_ = 0;
+  std::vector<const Class*> lineage_;  // from the root to this class
+  std::vector<Class*> subclasses_;
+  Ref<Object> (*factory_)();
+  bool isMetaclass_ = false;
+  bool isHidden_ = false;
+  SelectorTable<Method> methods_;
+  SelectorTable<InstanceVariable> variables_;
+  SelectorTable<InstanceVariable> hiddenVariables_;
+  SelectorTable<Method> hiddenMethods_;
+  std::vector<std::string> protocols_;
+  mutable SelectorTable<Method> methodCache_;
+  mutable SelectorTable<KeyReader> keyCache_;
+  std::deque<Method> ownedMethods_;
+  std::deque<InstanceVariable> ownedVariables_;
+  mutable std::deque<KeyReader> ownedReaders_;
+};
+
+// The class registered under a name, or nil.
+inline Class* safeClassFromString(std::string_view name) { return Class::named(name); }
+
+}  // namespace ax

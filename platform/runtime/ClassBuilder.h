@@ -1,0 +1,199 @@
+#pragma once
+
+#include "platform/runtime/Class.h"
+#include "platform/runtime/Signature.h"
+#include "platform/runtime/Weak.h"
+
+namespace ax {
+
+// From here on templates that turn C++ members into plain records of function pointers.
+namespace registration {
+
+template <class T>
+struct MemberType;
+template <class Owner, class T>
+struct MemberType<T Owner::*> {
+  using type = T;
+};
+
+template <class T>
+struct Declared {
+  static std::string type() { return std::string(encodingOf<T>()); }
+};
+template <class T>
+struct Declared<Ref<T>> {
+  static std::string type() { return T::staticClass().name(); }
+};
+template <class T>
+struct Declared<Weak<T>> : Declared<Ref<T>> {};
+
+template <class T>
+struct FieldAccess {
+  static Ref<Object> read(const T& field) { return box(field); }
+  static bool write(T& field, const Ref<Object>& value) {
+    field = unbox<T>(value);
+    return true;
+  }
+};
+template <class T>
+struct FieldAccess<Ref<T>> {
+  static Ref<Object> read(const Ref<T>& field) { return field; }
+  static bool write(Ref<T>& field, const Ref<Object>& value) {
+    field = cast<T>(value);
+    return field || !value;
+  }
+};
+template <class T>
+struct FieldAccess<Weak<T>> {
+  static Ref<Object> read(const Weak<T>& field) { return field.lock(); }
+  static bool write(Weak<T>& field, const Ref<Object>& value) {
+    field = cast<T>(value);
+    return field || !value;
+  }
+};
+
+template <class Owner, auto Member>
+struct Variable {
+  using Access = FieldAccess<typename MemberType<decltype(Member)>::type>;
+  static Ref<Object> read(const Object& self) { return Access::read(static_cast<const Owner&>(self).*Member); }
+  static bool write(Object& self, const Ref<Object>& value) {
+    return Access::write(static_cast<Owner&>(self).*Member, value);
+  }
+};
+
+// The canonical form of a result or an argument, and back.
+template <class T>
+CanonicalType<T> canonical(T&& value) {
+  return std::forward<T>(value);
+}
+template <class T>
+std::remove_cvref_t<T> specific(CanonicalType<T>& value) {
+  if constexpr (std::is_same_v<std::remove_cvref_t<T>, CanonicalType<T>>) {
+    return std::move(value);
+  } else {
+    return cast<typename std::remove_cvref_t<T>::Target>(std::move(value));
+  }
+}
+
+template <class R, class... A>
+Method record(Selector selector, CanonicalType<R> (*function)(Object&, const Method&, CanonicalType<A>...)) {
+  return {.selector = selector,
+          .signature = &signatureOf<R, A...>(),
+          .function = reinterpret_cast<GenericFunction>(function)};
+}
+
+template <class Owner, auto Function, class Type = decltype(Function)>
+struct InstanceMethod;
+template <class Owner, auto Function, class C, class R, class... A>
+struct InstanceMethod<Owner, Function, R (C::*)(A...)> {
+  static CanonicalType<R> call(Object& self, const Method&, CanonicalType<A>... arguments) {
+    return (static_cast<Owner&>(self).*Function)(specific<A>(arguments)...);
+  }
+  static Method make(Selector selector) { return record<R, A...>(selector, &call); }
+};
+template <class Owner, auto Function, class C, class R, class... A>
+struct InstanceMethod<Owner, Function, R (C::*)(A...) const>
+    : InstanceMethod<Owner, Function, R (C::*)(A...)> {};
+template <class Owner, auto Function, class C, class R, class... A>
+struct InstanceMethod<Owner, Function, R (*)(C&, A...)> {
+  static CanonicalType<R> call(Object& self, const Method&, CanonicalType<A>... arguments) {
+    return Function(static_cast<C&>(self), specific<A>(arguments)...);
+  }
+  static Method make(Selector selector) { return record<R, A...>(selector, &call); }
+};
+
+template <auto Function, class Type = decltype(Function)>
+struct ClassMethod;
+template <auto Function, class R, class... A>
+struct ClassMethod<Function, R (*)(A...)> {
+  static CanonicalType<R> call(Object&, const Method&, CanonicalType<A>... arguments) {
+    return Function(specific<A>(arguments)...);
+  }
+  static Method make(Selector selector) { return record<R, A...>(selector, &call); }
+};
+
+template <class T>
+Ref<Object> (*factoryOf())() {
+  if constexpr (std::is_default_constructible_v<T>) {
+    return [] { return Ref<Object>(make<T>()); };
+  } else {
+    return nullptr;
+  }
+}
+
+}  // namespace registration
+
+// Registers a C++ class, or more members of a registered one, under runtime names:
+//
+//   Class& Clock::staticClass() {
+//     static Class& result = ClassBuilder<Clock>("Clock", View::staticClass())
+//                                .instanceVariable<&Clock::label_>("_label")
+//                                .method<&Clock::tick>("tick")
+//                                .build();
+//     return result;
+//   }
+//   static const RegisteredClass<Clock> registered;
+//
+// A method may also be a free function that takes the receiver as `T&` first. Declared types and signatures
+// come from the C++ types: Ref<Label> is of type "Label", an object, "@", in a signature.
+template <class T>
+class ClassBuilder {
+ public:
+  explicit ClassBuilder(std::string name) : class_(Class::add(std::move(name), nullptr, nullptr)) {}
+  ClassBuilder(std::string name, Class& superclass)
+      : class_(Class::add(std::move(name), &superclass, registration::factoryOf<T>())) {}
+  // More members for a class that stands already.
+  explicit ClassBuilder(Class& existing) : class_(existing) {}
+
+  template <auto Member>
+  ClassBuilder& instanceVariable(std::string_view name) {
+    using Type = typename registration::MemberType<decltype(Member)>::type;
+    class_.addInstanceVariable({.selector = Selector::intern(name),
+                                .type = registration::Declared<Type>::type(),
+                                .read = &registration::Variable<T, Member>::read,
+                                .write = &registration::Variable<T, Member>::write});
+    return *this;
+  }
+
+  template <auto Function>
+  ClassBuilder& method(std::string_view name) {
+    class_.addMethod(registration::InstanceMethod<T, Function>::make(Selector::intern(name)));
+    return *this;
+  }
+
+  // A getter under `name` and a setter under `set<Name>:`.
+  template <auto Getter, auto Setter>
+  ClassBuilder& property(std::string_view name) {
+    return method<Getter>(name).template method<Setter>(setterName(name));
+  }
+
+  template <auto Function>
+  ClassBuilder& classMethod(std::string_view name) {
+    class_.metaclass().addMethod(registration::ClassMethod<Function>::make(Selector::intern(name)));
+    return *this;
+  }
+
+  ClassBuilder& conformsTo(std::string protocol) {
+    class_.addProtocol(std::move(protocol));
+    return *this;
+  }
+
+  Class& build() { return class_; }
+
+  static std::string setterName(std::string_view property) {
+    std::string name = "set" + std::string(property) + ":";
+    if (name[3] >= 'a' && name[3] <= 'z') name[3] = static_cast<char>(name[3] - 'a' + 'A');
+    return name;
+  }
+
+ private:
+  Class& class_;
+};
+
+// Stands at the end of a class's source file and registers it when its library is loaded.
+template <class T>
+struct RegisteredClass {
+  RegisteredClass() { T::staticClass(); }
+};
+
+}  // namespace ax

@@ -1,0 +1,78 @@
+#include "platform/runtime/KeyReading.h"
+
+#include <atomic>
+#include <cstdio>
+#include <mutex>
+#include <set>
+#include <tuple>
+
+#include "platform/runtime/Boxing.h"
+
+namespace ax {
+
+Ref<Object> Object::safeValueForKey(Key key) const {
+  if (!key) return nullptr;
+  const KeyReader& reader = isa_->readerForKey(key);
+  try {
+    if (reader.variable != nullptr) return reader.variable->read(*this);
+    if (reader.method == nullptr) return nullptr;
+    return reader.method->signature->invoke(const_cast<Object&>(*this), *reader.method, {});
+  } catch (...) {
+    return nullptr;
+  }
+}
+
+Ref<Object> Object::safeValueForKeyPath(std::string_view dottedKeys) const {
+  Ref<Object> value(const_cast<Object*>(this));
+  while (value) {
+    const std::size_t dot = dottedKeys.find('.');
+    value = value->safeValueForKey(dottedKeys.substr(0, dot));
+    if (dot == std::string_view::npos) break;
+    dottedKeys.remove_prefix(dot + 1);
+  }
+  return value;
+}
+
+bool Object::safeBoolForKey(Key key) const { return unboxBool(safeValueForKey(key)); }
+std::int64_t Object::safeIntForKey(Key key) const { return unboxInt(safeValueForKey(key)); }
+double Object::safeDoubleForKey(Key key) const { return unboxDouble(safeValueForKey(key)); }
+
+Ref<Object> safeValueForKey(Receiver receiver, Key key) {
+  return receiver.get() == nullptr ? nullptr : receiver.get()->safeValueForKey(key);
+}
+bool safeBoolForKey(Receiver receiver, Key key) { return unboxBool(safeValueForKey(receiver, key)); }
+std::int64_t safeIntForKey(Receiver receiver, Key key) { return unboxInt(safeValueForKey(receiver, key)); }
+double safeDoubleForKey(Receiver receiver, Key key) { return unboxDouble(safeValueForKey(receiver, key)); }
+
+namespace {
+std::atomic<std::size_t> mismatches = 0;
+}
+
+void reportCastMismatch(const Object& object, std::string_view expected, const std::source_location& place) {
+  ++mismatches;
+#ifndef NDEBUG
+  static std::mutex mutex;
+  static std::set<std::tuple<std::string_view, unsigned, unsigned>> reported;
+  const std::lock_guard lock(mutex);
+  if (!reported.emplace(place.file_name(), place.line(), place.column()).second) return;
+  std::string_view file = place.file_name();
+  file.remove_prefix(file.find_last_of('/') + 1);
+  std::fprintf(stderr, "AX Velto: %.*s:%u: expected an object of class %.*s, found %s\n", int(file.size()),
+               file.data(), place.line(), int(expected.size()), expected.data(), object.isa().name().c_str());
+#else
+  (void)object, (void)expected, (void)place;
+#endif
+}
+
+std::size_t castMismatches() { return mismatches; }
+
+Ref<Object> safeClass(std::string_view className, Ref<Object> object, bool* mismatch,
+                      const std::source_location& place) {
+  const bool isMismatch = object && !object->isKindOf(Class::named(className));
+  if (mismatch != nullptr) *mismatch = isMismatch;
+  if (!isMismatch) return object;
+  reportCastMismatch(*object, className, place);
+  return nullptr;
+}
+
+}  // namespace ax

@@ -1,0 +1,18 @@
+#pragma once
+
+#include <functional>
+#include <span>
+
+#include "platform/runtime/Class.h"
+
+namespace ax {
+
+// A reply computed from the boxed arguments; it may raise.
+using ScriptedAnswer = std::function<Ref<Object>(std::span<const Ref<Object>>)>;
+
+// Gives one object a reply of its own for a method that its class, or a class above it, declares; overrides
+// that were grafted onto the method stay in front of it and reach the reply as super. False when no class in
+// its line declares the method.
+bool setScriptedAnswer(Object& object, Selector selector, ScriptedAnswer answer);
+
+}  // namespace ax

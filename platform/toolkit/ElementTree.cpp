@@ -1,0 +1,135 @@
+#include "platform/toolkit/ElementTree.h"
+
+#include <algorithm>
+
+#include "platform/formatting/Region.h"
+#include "platform/toolkit/View.h"
+
+namespace ax {
+
+namespace {
+
+void collectSubviews(View& view, const ElementTest& test, Array::Items& found) {
+  for (const Ref<View>& subview : view.subviews()) {
+    if (test(*subview)) found.push_back(subview);
+    collectSubviews(*subview, test, found);
+  }
+}
+
+void collectDescendants(Object& parent, const ElementTest& test, Array::Items& found) {
+  const Ref<Array> listed = messages::accessibilityElements(parent);
+  for (const Ref<Object>& child : listed ? listed->items() : drawnChildren(parent)) {
+    if (test(*child)) found.push_back(child);
+    collectDescendants(*child, test, found);
+  }
+}
+
+bool isDrawn(Object& object) {
+  if (const View* view = cast<View>(&object)) return !view->isHidden() && view->alpha() > 0;
+  if (const Layer* layer = cast<Layer>(&object)) return !layer->isHidden() && layer->opacity() > 0;
+  return true;
+}
+
+struct Placed {
+  Ref<Object> element;
+  Rect frame;
+};
+
+bool beginsBefore(const Rect& a, const Rect& b, bool rightToLeft) {
+  return rightToLeft ? a.maxX() > b.maxX() : a.x < b.x;
+}
+
+bool standInOneRow(const Rect& upper, const Rect& lower) { return lower.y < upper.y + upper.height / 2 || lower.y == upper.y; }
+
+}  // namespace
+
+Ref<Object> _accessibilityFindAncestor(Receiver receiver, const ElementTest& test, bool startWithSelf) {
+  Ref<Object> object(receiver.get());
+  if (!startWithSelf) object = messages::accessibilityContainer(object);
+  while (object && !test(*object)) object = messages::accessibilityContainer(object);
+  return object;
+}
+
+Ref<Object> _accessibilityAncestorIsKindOf(Receiver receiver, const Class* ancestorClass) {
+  return _accessibilityFindAncestor(
+      receiver, [&](Object& object) { return object.isKindOf(ancestorClass); }, false);
+}
+
+Ref<Array> _accessibilityFindSubviewDescendantsPassingTest(Receiver receiver, const ElementTest& test) {
+  Array::Items found;
+  if (View* view = cast<View>(receiver.get())) collectSubviews(*view, test, found);
+  return array(std::move(found));
+}
+
+Ref<Array> _accessibilityFindUnsortedDescendantsPassingTest(Receiver receiver, const ElementTest& test) {
+  Array::Items found;
+  if (receiver.get() != nullptr) collectDescendants(*receiver.get(), test, found);
+  return array(std::move(found));
+}
+
+bool _accessibilityViewIsVisible(Receiver receiver) {
+  if (receiver.get() == nullptr) return false;
+  const AccessibilityProperties* properties = AccessibilityProperties::find(*receiver.get());
+  if (properties != nullptr && properties->isMarkedVisible && properties->overridesInvisibility) return true;
+  return !_accessibilityFindAncestor(receiver, [](Object& object) { return !isDrawn(object); }, true);
+}
+
+std::vector<Ref<Object>> drawnChildren(Object& parent) {
+  std::vector<Ref<Object>> children;
+  if (const View* view = cast<View>(&parent)) {
+    children.assign(view->subviews().begin(), view->subviews().end());
+    if (view->layerIfAny() != nullptr) {
+      const auto& layers = view->layerIfAny()->sublayers();
+      children.insert(children.end(), layers.begin(), layers.end());
+    }
+  } else if (const Layer* layer = cast<Layer>(&parent)) {
+    children.assign(layer->sublayers().begin(), layer->sublayers().end());
+  }
+  return children;
+}
+
+Rect frameForElements(const Ref<Array>& elements) {
+  Rect all;
+  if (!elements) return all;
+  for (std::size_t i = 0; i < elements->count(); ++i) {
+    const Rect frame = messages::accessibilityFrame(elements->at(i));
+    all = i == 0 ? frame : all.unionWith(frame);
+  }
+  return all;
+}
+
+Rect convertFrameToScreenCoordinates(Rect rect, Receiver view) {
+  const Responder* responder = cast<Responder>(view.get());
+  return responder == nullptr ? rect : responder->screenRect(rect);
+}
+
+int accessibilityCompareGeometry(Object& a, Object& b) {
+  const Rect first = messages::accessibilityFrame(a);
+  const Rect second = messages::accessibilityFrame(b);
+  const bool oneRow = first.y <= second.y ? standInOneRow(first, second) : standInOneRow(second, first);
+  if (!oneRow) return first.y < second.y ? -1 : 1;
+  const bool rightToLeft = formatting::currentLanguageIsRightToLeft();
+  if (beginsBefore(first, second, rightToLeft)) return -1;
+  return beginsBefore(second, first, rightToLeft) ? 1 : 0;
+}
+
+Ref<Array> sortedByGeometry(const Array& elements) {
+  std::vector<Placed> placed;
+  for (const Ref<Object>& element : elements) placed.push_back({element, messages::accessibilityFrame(element)});
+  std::stable_sort(placed.begin(), placed.end(),
+                   [](const Placed& a, const Placed& b) { return a.frame.y < b.frame.y; });
+  const bool rightToLeft = formatting::currentLanguageIsRightToLeft();
+  for (auto row = placed.begin(); row != placed.end();) {
+    const auto rowEnd = std::find_if(row, placed.end(),
+                                     [&](const Placed& p) { return !standInOneRow(row->frame, p.frame); });
+    std::stable_sort(row, rowEnd, [&](const Placed& a, const Placed& b) {
+      return beginsBefore(a.frame, b.frame, rightToLeft);
+    });
+    row = rowEnd;
+  }
+  Array::Items sorted;
+  for (Placed& p : placed) sorted.push_back(std::move(p.element));
+  return array(std::move(sorted));
+}
+
+}  // namespace ax

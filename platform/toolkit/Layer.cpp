@@ -1,0 +1,46 @@
+#include "platform/toolkit/Layer.h"
+
+#include "platform/runtime/ClassBuilder.h"
+#include "platform/toolkit/View.h"
+
+namespace ax {
+
+Class& Layer::staticClass() {
+  static Class& result = ClassBuilder<Layer>("Layer", Responder::staticClass())
+                             .property<&Layer::frame, &Layer::setFrame>("frame")
+                             .property<&Layer::opacity, &Layer::setOpacity>("opacity")
+                             .property<&Layer::opacity, &Layer::setOpacity>("alpha")
+                             .property<&Layer::isHidden, &Layer::setHidden>("hidden")
+                             .method<&Layer::sublayerArray>("sublayers")
+                             .build();
+  return result;
+}
+
+Layer::~Layer() {
+  for (const Ref<Layer>& layer : sublayers_) layer->superlayer_ = nullptr;
+}
+
+Ref<Array> Layer::sublayerArray() const { return array({sublayers_.begin(), sublayers_.end()}); }
+
+void Layer::addSublayer(const Ref<Layer>& layer) {
+  if (!layer || layer->superlayer_ != nullptr) return;
+  layer->superlayer_ = this;
+  sublayers_.push_back(layer);
+}
+
+Rect Layer::screenRect(Rect own) const {
+  if (owner_ != nullptr) return owner_->screenRect(own);
+  const Rect outer = own.movedBy({frame_.x, frame_.y});
+  return superlayer_ == nullptr ? outer : superlayer_->screenRect(outer);
+}
+
+Rect Layer::defaultFrame() { return screenRect({0, 0, frame_.width, frame_.height}); }
+
+Ref<Object> Layer::defaultContainer() {
+  if (owner_ != nullptr) return Ref<Object>(owner_);
+  return Ref<Object>(superlayer_);
+}
+
+static const RegisteredClass<Layer> registered;
+
+}  // namespace ax

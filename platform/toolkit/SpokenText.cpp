@@ -1,0 +1,141 @@
+#include "platform/toolkit/SpokenText.h"
+
+#include <algorithm>
+
+#include "platform/formatting/Lists.h"
+#include "platform/toolkit/AccessibilityMessages.h"
+#include "platform/toolkit/ElementTree.h"
+
+namespace ax {
+
+namespace {
+
+class Composition {
+ public:
+  void add(const Ref<String>& part) {
+    if (isEmpty(part)) return;
+    if (++count_ == 1) first_ = part;
+    if (count_ > 1) text_ += formatting::listSeparator();
+    if (const auto* spoken = cast<AccessibilityAttributedString>(part.get())) {
+      isAttributed_ = true;
+      for (TextAttribute attribute : spoken->attributes()) {
+        attribute.range.location += text_.size();
+        attributes_.push_back(std::move(attribute));
+      }
+    }
+    text_ += part->text();
+  }
+
+  Ref<String> result() {
+    if (count_ == 0) return emptyString();
+    if (count_ == 1) return first_;
+    if (!isAttributed_) return string(std::move(text_));
+    Ref<AccessibilityAttributedString> spoken = make<AccessibilityAttributedString>(std::move(text_));
+    for (const TextAttribute& attribute : attributes_) {
+      spoken->setAttributeForKeyWithRange(attribute.value, attribute.key, attribute.range);
+    }
+    return spoken;
+  }
+
+ private:
+  std::size_t count_ = 0;
+  bool isAttributed_ = false;
+  Ref<String> first_;
+  std::string text_;
+  std::vector<TextAttribute> attributes_;
+};
+
+Ref<String> spokenForm(const Ref<Object>& element) {
+  const Ref<String> label = messages::accessibilityLabel(element);
+  if (label) return label;
+  return Ref<String>(cast<String>(element.get()));
+}
+
+void addChildren(Object& parent, Composition& composition) {
+  const Ref<Array> listed = messages::accessibilityElements(parent);
+  for (const Ref<Object>& child : listed ? listed->items() : drawnChildren(parent)) {
+    if (!_accessibilityViewIsVisible(child)) continue;
+    if (messages::isAccessibilityElement(child)) {
+      composition.add(messages::accessibilityLabel(child));
+    } else {
+      addChildren(*child, composition);
+    }
+  }
+}
+
+struct SubhierarchyText {
+  bool headers;
+  bool focusableItems;
+  const Ref<Array>& exclusions;
+  Composition composition;
+
+  bool isExcluded(const Ref<Object>& object) const {
+    return exclusions && std::find(exclusions->begin(), exclusions->end(), object) != exclusions->end();
+  }
+
+  void addBelow(Object& parent) {
+    for (const Ref<Object>& child : drawnChildren(parent)) {
+      if (_accessibilityViewIsVisible(child) && !isExcluded(child)) add(child);
+    }
+  }
+
+  void add(const Ref<Object>& child) {
+    const bool isHeader = (messages::accessibilityTraits(child) & TraitHeader) != 0;
+    const bool isFocusable = !isHeader && messages::isAccessibilityElement(child);
+    if ((isHeader && !headers) || (isFocusable && !focusableItems)) return;
+    const Ref<String> label = messages::accessibilityLabel(child);
+    if (isEmpty(label)) return addBelow(*child);
+    composition.add(label);
+  }
+};
+
+}  // namespace
+
+const Ref<String>& stringForVariablesSentinel = *new Ref<String>(string("__AXStringForVariablesSentinel"));
+
+Ref<String> stringForVariables(std::initializer_list<Ref<String>> parts) {
+  Composition composition;
+  for (const Ref<String>& part : parts) {
+    if (part && part->isEqual(*stringForVariablesSentinel)) break;
+    composition.add(part);
+  }
+  return composition.result();
+}
+
+Ref<String> labelForElements(const Ref<Array>& elements) {
+  Composition composition;
+  if (elements) {
+    for (const Ref<Object>& element : *elements) composition.add(spokenForm(element));
+  }
+  return composition.result();
+}
+
+Ref<String> labelForElements(std::initializer_list<Ref<Object>> elements) {
+  return labelForElements(axArrayByIgnoringNilElementsWithCount(elements.size(), elements));
+}
+
+Ref<String> stringForAllChildren(Receiver view) {
+  Composition composition;
+  if (view.get() != nullptr) addChildren(*view.get(), composition);
+  return composition.result();
+}
+
+Ref<String> _accessibilityStringForLabelKeyValues(Receiver receiver, std::string_view keyList) {
+  constexpr std::string_view between = ", ";
+  Composition composition;
+  while (!keyList.empty()) {
+    const std::size_t end = std::min(keyList.find(between), keyList.size());
+    composition.add(messages::accessibilityLabel(safeValueForKey(receiver, Selector::find(keyList.substr(0, end)))));
+    keyList.remove_prefix(std::min(end + between.size(), keyList.size()));
+  }
+  return composition.result();
+}
+
+Ref<String> _accessibilityTextForSubhierarchyIncludingHeadersFocusableItemsExclusions(
+    Receiver receiver, bool headers, bool focusableItems, const Ref<Array>& exclusions) {
+  SubhierarchyText text{headers, focusableItems, exclusions, {}};
+  if (receiver.get() != nullptr) text.addBelow(*receiver.get());
+  return text.composition.result();
+}
+
+}  // namespace ax
