@@ -8,9 +8,8 @@
 namespace ax {
 
 Class& Array::staticClass() {
-  static Class& result = ClassBuilder<Array>("Array", Object::staticClass())
-                             .method<&Array::firstObject>("firstObject")
-                             .build();
+  static Class& result =
+      ClassBuilder<Array>("Array", Object::staticClass()).method<&Array::firstObject>("firstObject").build();
   return result;
 }
 
@@ -31,9 +30,12 @@ std::string Array::description() const {
   return text + ")";
 }
 
-Ref<Object> MutableArray::copy() { return array(items_); }
+Ref<Object> MutableArray::copy() {
+  return array(items_);
+}
 
-Ref<Array> axArrayByIgnoringNilElementsWithCount(std::size_t count, std::initializer_list<Ref<Object>> elements) {
+Ref<Array> axArrayByIgnoringNilElementsWithCount(std::size_t count,
+                                                 std::initializer_list<Ref<Object>> elements) {
   Array::Items kept;
   for (const Ref<Object>& element : std::span(elements.begin(), std::min(count, elements.size()))) {
     if (element) kept.push_back(element);
@@ -41,7 +43,9 @@ Ref<Array> axArrayByIgnoringNilElementsWithCount(std::size_t count, std::initial
   return array(std::move(kept));
 }
 
-Ref<Array> safeArrayForKey(Receiver receiver, Key key) { return cast<Array>(safeValueForKey(receiver, key)); }
+Ref<Array> safeArrayForKey(Receiver receiver, Key key) {
+  return cast<Array>(safeValueForKey(receiver, key));
+}
 
 static const RegisteredClass<Array> registered;
 static const RegisteredClass<MutableArray> registeredMutable;

@@ -47,10 +47,13 @@ class MutableArray final : public Array {
   Ref<Object> copy() override;
 };
 
-inline Ref<Array> array(Array::Items items) { return make<Array>(std::move(items)); }
+inline Ref<Array> array(Array::Items items) {
+  return make<Array>(std::move(items));
+}
 
 // A new list of the given elements that are not nil, in order.
-Ref<Array> axArrayByIgnoringNilElementsWithCount(std::size_t count, std::initializer_list<Ref<Object>> elements);
+Ref<Array> axArrayByIgnoringNilElementsWithCount(std::size_t count,
+                                                 std::initializer_list<Ref<Object>> elements);
 
 template <class Test>
 Ref<Array> ax_filteredArrayUsingBlock(const Array& all, Test test) {

@@ -18,7 +18,8 @@ Class& AttributedString::staticClass() {
 
 Class& AccessibilityAttributedString::staticClass() {
   static Class& result =
-      ClassBuilder<AccessibilityAttributedString>("AccessibilityAttributedString", String::staticClass()).build();
+      ClassBuilder<AccessibilityAttributedString>("AccessibilityAttributedString", String::staticClass())
+          .build();
   return result;
 }
 

@@ -16,19 +16,45 @@ bool Value::isEqual(const Object& other) const {
   return value != nullptr && value->content_ == content_;
 }
 
-Ref<Object> box(bool value) { return number(value); }
-Ref<Object> box(std::int32_t value) { return number(value); }
-Ref<Object> box(std::int64_t value) { return number(value); }
-Ref<Object> box(std::uint32_t value) { return number(value); }
-Ref<Object> box(std::uint64_t value) { return number(value); }
-Ref<Object> box(float value) { return number(value); }
-Ref<Object> box(double value) { return number(value); }
-Ref<Object> box(Point value) { return make<Value>(value); }
-Ref<Object> box(Size value) { return make<Value>(value); }
-Ref<Object> box(Rect value) { return make<Value>(value); }
-Ref<Object> box(Insets value) { return make<Value>(value); }
-Ref<Object> box(Selector value) { return value ? Ref<Object>(make<Value>(value)) : nullptr; }
-Ref<Object> box(const Class* value) { return Ref<Object>(const_cast<Class*>(value)); }
+Ref<Object> box(bool value) {
+  return number(value);
+}
+Ref<Object> box(std::int32_t value) {
+  return number(value);
+}
+Ref<Object> box(std::int64_t value) {
+  return number(value);
+}
+Ref<Object> box(std::uint32_t value) {
+  return number(value);
+}
+Ref<Object> box(std::uint64_t value) {
+  return number(value);
+}
+Ref<Object> box(float value) {
+  return number(value);
+}
+Ref<Object> box(double value) {
+  return number(value);
+}
+Ref<Object> box(Point value) {
+  return make<Value>(value);
+}
+Ref<Object> box(Size value) {
+  return make<Value>(value);
+}
+Ref<Object> box(Rect value) {
+  return make<Value>(value);
+}
+Ref<Object> box(Insets value) {
+  return make<Value>(value);
+}
+Ref<Object> box(Selector value) {
+  return value ? Ref<Object>(make<Value>(value)) : nullptr;
+}
+Ref<Object> box(const Class* value) {
+  return Ref<Object>(const_cast<Class*>(value));
+}
 
 namespace {
 
@@ -55,12 +81,24 @@ double unboxDouble(const Ref<Object>& object) {
   return number == nullptr ? 0 : number->doubleValue();
 }
 
-Point unboxPoint(const Ref<Object>& object) { return unboxValue<Point>(object); }
-Size unboxSize(const Ref<Object>& object) { return unboxValue<Size>(object); }
-Rect unboxRect(const Ref<Object>& object) { return unboxValue<Rect>(object); }
-Insets unboxInsets(const Ref<Object>& object) { return unboxValue<Insets>(object); }
-Selector unboxSelector(const Ref<Object>& object) { return unboxValue<Selector>(object); }
-const Class* unboxClass(const Ref<Object>& object) { return cast<Class>(object.get()); }
+Point unboxPoint(const Ref<Object>& object) {
+  return unboxValue<Point>(object);
+}
+Size unboxSize(const Ref<Object>& object) {
+  return unboxValue<Size>(object);
+}
+Rect unboxRect(const Ref<Object>& object) {
+  return unboxValue<Rect>(object);
+}
+Insets unboxInsets(const Ref<Object>& object) {
+  return unboxValue<Insets>(object);
+}
+Selector unboxSelector(const Ref<Object>& object) {
+  return unboxValue<Selector>(object);
+}
+const Class* unboxClass(const Ref<Object>& object) {
+  return cast<Class>(object.get());
+}
 
 static const RegisteredClass<Value> registered;
 

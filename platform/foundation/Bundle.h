@@ -25,7 +25,8 @@ class Bundle final : public Object {
 
   // The text of a key in the environment's language, the same object at every call; `fallback` for a key or
   // a table that is not there.
-  Ref<String> localizedStringForKey(std::string_view key, const Ref<String>& fallback, std::string_view table);
+  Ref<String> localizedStringForKey(std::string_view key, const Ref<String>& fallback,
+                                    std::string_view table);
 
  private:
   struct Table;

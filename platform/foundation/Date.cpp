@@ -21,14 +21,18 @@ Ref<Date> Date::now() {
   return date(std::chrono::duration<double>(sinceEpoch).count());
 }
 
-Ref<Date> Date::dateByAddingTimeInterval(TimeInterval seconds) const { return date(time_ + seconds); }
+Ref<Date> Date::dateByAddingTimeInterval(TimeInterval seconds) const {
+  return date(time_ + seconds);
+}
 
 bool Date::isEqual(const Object& other) const {
   const Date* date = cast<Date>(const_cast<Object*>(&other));
   return date != nullptr && date->time_ == time_;
 }
 
-std::string Date::description() const { return formatting::isoWithOffset(time_); }
+std::string Date::description() const {
+  return formatting::isoWithOffset(time_);
+}
 
 Class& DateInterval::staticClass() {
   static Class& result = ClassBuilder<DateInterval>("DateInterval", Object::staticClass())
@@ -49,7 +53,9 @@ bool DateInterval::isEqual(const Object& other) const {
   return interval != nullptr && interval->start_->isEqual(*start_) && interval->end_->isEqual(*end_);
 }
 
-std::string DateInterval::description() const { return start_->description() + "/" + end_->description(); }
+std::string DateInterval::description() const {
+  return start_->description() + "/" + end_->description();
+}
 
 static const RegisteredClass<Date> registered;
 static const RegisteredClass<DateInterval> registeredInterval;

@@ -26,7 +26,9 @@ class Date final : public Object {
   double time_;
 };
 
-inline Ref<Date> date(double secondsSince1970) { return make<Date>(secondsSince1970); }
+inline Ref<Date> date(double secondsSince1970) {
+  return make<Date>(secondsSince1970);
+}
 
 // A span of time between two dates, both included.
 class DateInterval final : public Object {

@@ -18,7 +18,9 @@ Environment& current() {
 
 }  // namespace
 
-const Environment& environment() { return current(); }
+const Environment& environment() {
+  return current();
+}
 
 void setEnvironment(Environment next) {
   const formatting::Region region{next.locale, next.timeZone};
@@ -28,9 +30,17 @@ void setEnvironment(Environment next) {
   current() = std::move(next);
 }
 
-bool isScreenReaderRunning() { return screenReader; }
-WheelchairUse storedWheelchairUse() { return wheelchair; }
-bool performValidationChecks() { return current().checks; }
-int firstDayOfWeekForWeeklyGoalCalculations() { return current().firstDayOfWeek; }
+bool isScreenReaderRunning() {
+  return screenReader;
+}
+WheelchairUse storedWheelchairUse() {
+  return wheelchair;
+}
+bool performValidationChecks() {
+  return current().checks;
+}
+int firstDayOfWeekForWeeklyGoalCalculations() {
+  return current().firstDayOfWeek;
+}
 
 }  // namespace ax

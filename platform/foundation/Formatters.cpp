@@ -42,10 +42,13 @@ Class& DateFormatter::staticClass() {
 Ref<String> DateFormatter::stringFromDate(const Ref<Date>& date) const {
   if (!date) return nullptr;
   if (style_ == DateFormatterStyle::none) return emptyString();
-  return string(formatting::dateStyleString(date->timeIntervalSince1970(), formatting::DateStyle(int(style_))));
+  return string(
+      formatting::dateStyleString(date->timeIntervalSince1970(), formatting::DateStyle(int(style_))));
 }
 
-Ref<Array> DateFormatter::weekdaySymbols() const { return strings(formatting::weekdaySymbols()); }
+Ref<Array> DateFormatter::weekdaySymbols() const {
+  return strings(formatting::weekdaySymbols());
+}
 Ref<Array> DateFormatter::standaloneWeekdaySymbols() const {
   return strings(formatting::standaloneWeekdaySymbols());
 }
@@ -57,8 +60,8 @@ Class& DateIntervalFormatter::staticClass() {
 }
 
 Ref<String> DateIntervalFormatter::stringFromDateToDate(const Date& start, const Date& end) const {
-  return string(formatting::dateIntervalString(start.timeIntervalSince1970(), end.timeIntervalSince1970(),
-                                               template_));
+  return string(
+      formatting::dateIntervalString(start.timeIntervalSince1970(), end.timeIntervalSince1970(), template_));
 }
 
 Ref<String> DateIntervalFormatter::stringFromDateInterval(const DateInterval& interval) const {
@@ -84,11 +87,17 @@ Ref<String> formatFloat(int option, float value) {
   return string(formatting::decimalString(value, option == 0 ? 0 : 2));
 }
 
-Ref<String> formatInteger(std::int64_t value) { return string(formatting::integerString(value)); }
+Ref<String> formatInteger(std::int64_t value) {
+  return string(formatting::integerString(value));
+}
 
-Ref<String> formatFloatWithPercentage(float fraction, int) { return string(formatting::percentString(fraction)); }
+Ref<String> formatFloatWithPercentage(float fraction, int) {
+  return string(formatting::percentString(fraction));
+}
 
-Ref<String> durationStringForDuration(TimeInterval seconds) { return string(formatting::spokenDuration(seconds)); }
+Ref<String> durationStringForDuration(TimeInterval seconds) {
+  return string(formatting::spokenDuration(seconds));
+}
 
 Ref<String> timeStringForType(int type, double value) {
   return string(type == 3 ? formatting::spokenHours(value) : formatting::spokenDuration(value));

@@ -43,10 +43,18 @@ Class& Number::staticClass() {
   return result;
 }
 
-bool Number::boolValue() const { return doubleValue() != 0; }
-std::int32_t Number::intValue() const { return as<std::int32_t>(content_); }
-std::int64_t Number::int64Value() const { return as<std::int64_t>(content_); }
-std::uint64_t Number::unsignedValue() const { return as<std::uint64_t>(content_); }
+bool Number::boolValue() const {
+  return doubleValue() != 0;
+}
+std::int32_t Number::intValue() const {
+  return as<std::int32_t>(content_);
+}
+std::int64_t Number::int64Value() const {
+  return as<std::int64_t>(content_);
+}
+std::uint64_t Number::unsignedValue() const {
+  return as<std::uint64_t>(content_);
+}
 
 double Number::doubleValue() const {
   return std::visit([](auto value) { return static_cast<double>(value); }, content_);

@@ -23,8 +23,8 @@ Ref<String> emptyString() {
 }
 
 std::vector<Ref<String>> componentsSeparatedByNewlines(const String& text) {
-  static constexpr std::array<std::string_view, 7> newlines = {"\n", "\r", "\v", "\f", "\xC2\x85", "\xE2\x80\xA8",
-                                                              "\xE2\x80\xA9"};
+  static constexpr std::array<std::string_view, 7> newlines = {
+      "\n", "\r", "\v", "\f", "\xC2\x85", "\xE2\x80\xA8", "\xE2\x80\xA9"};
   std::vector<Ref<String>> pieces;
   const std::string_view all = text.text();
   std::size_t start = 0;
@@ -53,7 +53,9 @@ Ref<String> stringByRemoving(const Ref<String>& text, std::string_view part) {
   return string(std::move(kept));
 }
 
-Ref<String> safeStringForKey(Receiver receiver, Key key) { return cast<String>(safeValueForKey(receiver, key)); }
+Ref<String> safeStringForKey(Receiver receiver, Key key) {
+  return cast<String>(safeValueForKey(receiver, key));
+}
 
 static const RegisteredClass<String> registered;
 

@@ -28,12 +28,16 @@ class String : public Object {
   std::string text_;
 };
 
-inline Ref<String> string(std::string text) { return make<String>(std::move(text)); }
+inline Ref<String> string(std::string text) {
+  return make<String>(std::move(text));
+}
 // The one empty String.
 Ref<String> emptyString();
 
 // Nil counts as empty.
-inline bool isEmpty(const Ref<String>& text) { return !text || text->isEmpty(); }
+inline bool isEmpty(const Ref<String>& text) {
+  return !text || text->isEmpty();
+}
 
 // The text's pieces between newline characters (line feed, carriage return, next line, line and paragraph
 // separators); a text without any is one piece.

@@ -30,6 +30,8 @@ class Value final : public Object {
   Content content_;
 };
 
-inline Ref<Value> point(double x, double y) { return make<Value>(Point{x, y}); }
+inline Ref<Value> point(double x, double y) {
+  return make<Value>(Point{x, y});
+}
 
 }  // namespace ax

@@ -26,7 +26,8 @@ void ActivitySummary::setFractions(double move, double exercise, double stand) {
   stand_ = stand;
 }
 
-Ref<DateComponents> activityCacheDateComponentsFromDate(const Ref<Date>& date, const Ref<Calendar>& calendar) {
+Ref<DateComponents> activityCacheDateComponentsFromDate(const Ref<Date>& date,
+                                                        const Ref<Calendar>& calendar) {
   return date && calendar ? calendar->componentsFromDate(*date) : nullptr;
 }
 

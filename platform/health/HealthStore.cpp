@@ -12,10 +12,9 @@ std::atomic<std::size_t> queries = 0;
 }
 
 Class& WheelchairUseObject::staticClass() {
-  static Class& result =
-      ClassBuilder<WheelchairUseObject>("WheelchairUseObject", Object::staticClass())
-          .method<&WheelchairUseObject::wheelchairUse>("wheelchairUse")
-          .build();
+  static Class& result = ClassBuilder<WheelchairUseObject>("WheelchairUseObject", Object::staticClass())
+                             .method<&WheelchairUseObject::wheelchairUse>("wheelchairUse")
+                             .build();
   return result;
 }
 
@@ -34,7 +33,9 @@ Ref<WheelchairUseObject> HealthStore::wheelchairUseWithError(Ref<Object>& error)
   return make<WheelchairUseObject>(static_cast<std::int64_t>(use));
 }
 
-std::size_t wheelchairQueries() { return queries; }
+std::size_t wheelchairQueries() {
+  return queries;
+}
 
 static const RegisteredClass<WheelchairUseObject> registeredUse;
 static const RegisteredClass<HealthStore> registered;

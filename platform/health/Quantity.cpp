@@ -26,7 +26,9 @@ bool Quantity::isEqual(const Object& other) const {
   return quantity != nullptr && quantity->value_ == value_ && quantity->unit_->isEqual(*unit_);
 }
 
-std::string Quantity::description() const { return std::to_string(value_) + " " + unit_->text(); }
+std::string Quantity::description() const {
+  return std::to_string(value_) + " " + unit_->text();
+}
 
 static const RegisteredClass<Quantity> registered;
 

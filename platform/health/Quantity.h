@@ -25,6 +25,8 @@ class Quantity final : public Object {
   Ref<Unit> unit_;
 };
 
-inline Ref<Quantity> quantity(double value, Ref<Unit> unit) { return make<Quantity>(value, std::move(unit)); }
+inline Ref<Quantity> quantity(double value, Ref<Unit> unit) {
+  return make<Quantity>(value, std::move(unit));
+}
 
 }  // namespace ax

@@ -16,12 +16,12 @@ struct SimpleUnit {
 };
 
 constexpr std::array simpleUnits = {
-    SimpleUnit{"kcal", 4184, 'E'},   SimpleUnit{"cal", 4.184, 'E'},     SimpleUnit{"kJ", 1000, 'E'},
-    SimpleUnit{"s", 1, 'T'},         SimpleUnit{"min", 60, 'T'},        SimpleUnit{"hr", 3600, 'T'},
-    SimpleUnit{"m", 1, 'L'},         SimpleUnit{"km", 1000, 'L'},       SimpleUnit{"mi", 1609.344, 'L'},
-    SimpleUnit{"ft", 0.3048, 'L'},   SimpleUnit{"yd", 0.9144, 'L'},     SimpleUnit{"g", 0.001, 'M'},
-    SimpleUnit{"kg", 1, 'M'},        SimpleUnit{"lb", 0.45359237, 'M'}, SimpleUnit{"ml", 0.001, 'V'},
-    SimpleUnit{"L", 1, 'V'},         SimpleUnit{"count", 1, ' '},       SimpleUnit{"%", 0.01, ' '},
+    SimpleUnit{"kcal", 4184, 'E'}, SimpleUnit{"cal", 4.184, 'E'},     SimpleUnit{"kJ", 1000, 'E'},
+    SimpleUnit{"s", 1, 'T'},       SimpleUnit{"min", 60, 'T'},        SimpleUnit{"hr", 3600, 'T'},
+    SimpleUnit{"m", 1, 'L'},       SimpleUnit{"km", 1000, 'L'},       SimpleUnit{"mi", 1609.344, 'L'},
+    SimpleUnit{"ft", 0.3048, 'L'}, SimpleUnit{"yd", 0.9144, 'L'},     SimpleUnit{"g", 0.001, 'M'},
+    SimpleUnit{"kg", 1, 'M'},      SimpleUnit{"lb", 0.45359237, 'M'}, SimpleUnit{"ml", 0.001, 'V'},
+    SimpleUnit{"L", 1, 'V'},       SimpleUnit{"count", 1, ' '},       SimpleUnit{"%", 0.01, ' '},
 };
 
 std::string_view prefixText(MetricPrefix prefix) {

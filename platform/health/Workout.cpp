@@ -5,9 +5,8 @@
 namespace ax {
 
 Class& Source::staticClass() {
-  static Class& result = ClassBuilder<Source>("Source", Object::staticClass())
-                             .instanceVariable<&Source::name_>("name")
-                             .build();
+  static Class& result =
+      ClassBuilder<Source>("Source", Object::staticClass()).instanceVariable<&Source::name_>("name").build();
   return result;
 }
 

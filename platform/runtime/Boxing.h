@@ -79,11 +79,15 @@ template <>
 struct Boxed<std::int64_t> : BoxedAs<unboxInt, 'q'> {};
 template <>
 struct Boxed<std::uint32_t> : BoxedAs<unboxInt, 'I'> {
-  static std::uint32_t open(const Ref<Object>& object) { return static_cast<std::uint32_t>(unboxInt(object)); }
+  static std::uint32_t open(const Ref<Object>& object) {
+    return static_cast<std::uint32_t>(unboxInt(object));
+  }
 };
 template <>
 struct Boxed<std::uint64_t> : BoxedAs<unboxInt, 'Q'> {
-  static std::uint64_t open(const Ref<Object>& object) { return static_cast<std::uint64_t>(unboxInt(object)); }
+  static std::uint64_t open(const Ref<Object>& object) {
+    return static_cast<std::uint64_t>(unboxInt(object));
+  }
 };
 template <>
 struct Boxed<float> : BoxedAs<unboxDouble, 'f'> {

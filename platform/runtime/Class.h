@@ -118,6 +118,8 @@ class Class final : public Object {
 };
 
 // The class registered under a name, or nil.
-inline Class* safeClassFromString(std::string_view name) { return Class::named(name); }
+inline Class* safeClassFromString(std::string_view name) {
+  return Class::named(name);
+}
 
 }  // namespace ax

@@ -55,7 +55,9 @@ struct FieldAccess<Weak<T>> {
 template <class Owner, auto Member>
 struct Variable {
   using Access = FieldAccess<typename MemberType<decltype(Member)>::type>;
-  static Ref<Object> read(const Object& self) { return Access::read(static_cast<const Owner&>(self).*Member); }
+  static Ref<Object> read(const Object& self) {
+    return Access::read(static_cast<const Owner&>(self).*Member);
+  }
   static bool write(Object& self, const Ref<Object>& value) {
     return Access::write(static_cast<Owner&>(self).*Member, value);
   }

@@ -33,16 +33,28 @@ Ref<Object> Object::safeValueForKeyPath(std::string_view dottedKeys) const {
   return value;
 }
 
-bool Object::safeBoolForKey(Key key) const { return unboxBool(safeValueForKey(key)); }
-std::int64_t Object::safeIntForKey(Key key) const { return unboxInt(safeValueForKey(key)); }
-double Object::safeDoubleForKey(Key key) const { return unboxDouble(safeValueForKey(key)); }
+bool Object::safeBoolForKey(Key key) const {
+  return unboxBool(safeValueForKey(key));
+}
+std::int64_t Object::safeIntForKey(Key key) const {
+  return unboxInt(safeValueForKey(key));
+}
+double Object::safeDoubleForKey(Key key) const {
+  return unboxDouble(safeValueForKey(key));
+}
 
 Ref<Object> safeValueForKey(Receiver receiver, Key key) {
   return receiver.get() == nullptr ? nullptr : receiver.get()->safeValueForKey(key);
 }
-bool safeBoolForKey(Receiver receiver, Key key) { return unboxBool(safeValueForKey(receiver, key)); }
-std::int64_t safeIntForKey(Receiver receiver, Key key) { return unboxInt(safeValueForKey(receiver, key)); }
-double safeDoubleForKey(Receiver receiver, Key key) { return unboxDouble(safeValueForKey(receiver, key)); }
+bool safeBoolForKey(Receiver receiver, Key key) {
+  return unboxBool(safeValueForKey(receiver, key));
+}
+std::int64_t safeIntForKey(Receiver receiver, Key key) {
+  return unboxInt(safeValueForKey(receiver, key));
+}
+double safeDoubleForKey(Receiver receiver, Key key) {
+  return unboxDouble(safeValueForKey(receiver, key));
+}
 
 namespace {
 std::atomic<std::size_t> mismatches = 0;
@@ -64,7 +76,9 @@ void reportCastMismatch(const Object& object, std::string_view expected, const s
 #endif
 }
 
-std::size_t castMismatches() { return mismatches; }
+std::size_t castMismatches() {
+  return mismatches;
+}
 
 Ref<Object> safeClass(std::string_view className, Ref<Object> object, bool* mismatch,
                       const std::source_location& place) {

@@ -16,11 +16,11 @@ using GenericFunction = void (*)();
 struct Method {
   Selector selector = {};
   const Signature* signature = nullptr;
-  GenericFunction function = nullptr;   // null: the class lacks the message
-  const Class* owner = nullptr;         // the class in whose table the entry stands
-  const Method* former = nullptr;       // what a grafted entry replaced in the same table, if anything
-  const CategoryGraft* graft = nullptr; // the graft that brought it, if one did
-  GenericFunction unscripted = nullptr; // what `function` was before a scripted answer stood in its place
+  GenericFunction function = nullptr;    // null: the class lacks the message
+  const Class* owner = nullptr;          // the class in whose table the entry stands
+  const Method* former = nullptr;        // what a grafted entry replaced in the same table, if anything
+  const CategoryGraft* graft = nullptr;  // the graft that brought it, if one did
+  GenericFunction unscripted = nullptr;  // what `function` was before a scripted answer stood in its place
 };
 
 }  // namespace ax

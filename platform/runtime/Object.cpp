@@ -25,9 +25,13 @@ Object::~Object() {
   }
 }
 
-bool Object::isKindOf(const Class& other) const { return isa_->isSubclassOf(other); }
+bool Object::isKindOf(const Class& other) const {
+  return isa_->isSubclassOf(other);
+}
 
-std::string Object::description() const { return "<" + isa_->name() + ">"; }
+std::string Object::description() const {
+  return "<" + isa_->name() + ">";
+}
 
 void Object::attach(const void* key, Ref<Object> value) {
   Attachment** place = &attachments_;

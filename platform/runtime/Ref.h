@@ -19,13 +19,10 @@ class Ref {
   Ref(const Ref& other) : object_(other.object_) { retain(); }
   Ref(Ref&& other) noexcept : object_(std::exchange(other.object_, nullptr)) {}
   template <class U>
-    requires std::is_convertible_v<U*, T*>
-  Ref(const Ref<U>& other) : object_(other.get()) {
-    retain();
-  }
+  requires std::is_convertible_v<U*, T*> Ref(const Ref<U>& other) : object_(other.get()) { retain(); }
   template <class U>
-    requires std::is_convertible_v<U*, T*>
-  Ref(Ref<U>&& other) noexcept : object_(other.leak()) {}
+  requires std::is_convertible_v<U*, T*> Ref(Ref<U>&& other)
+  noexcept : object_(other.leak()) {}
   ~Ref() {
     if (object_ != nullptr) object_->release();
   }

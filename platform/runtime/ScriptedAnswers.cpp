@@ -60,6 +60,8 @@ std::pair<bool, Ref<Object>> scriptedAnswer(Object& receiver, const Method& meth
   return {true, found->second(arguments)};
 }
 
-GenericFunction unscriptedFunction(const Method& method) { return method.unscripted; }
+GenericFunction unscriptedFunction(const Method& method) {
+  return method.unscripted;
+}
 
 }  // namespace ax

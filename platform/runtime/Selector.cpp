@@ -107,6 +107,8 @@ Selector Selector::intern(std::string_view name) {
   return Selector(record != nullptr ? record : names().intern(name, hash));
 }
 
-Selector Selector::find(std::string_view name) { return Selector(names().find(name, hashText(name))); }
+Selector Selector::find(std::string_view name) {
+  return Selector(names().find(name, hashText(name)));
+}
 
 }  // namespace ax

@@ -43,7 +43,9 @@ using Key = Selector;
 
 std::uint64_t hashText(std::string_view text);
 
-inline Selector selectorFromString(std::string_view name) { return Selector::intern(name); }
+inline Selector selectorFromString(std::string_view name) {
+  return Selector::intern(name);
+}
 
 template <std::size_t N>
 struct LiteralText {

@@ -77,9 +77,8 @@ struct SignatureMaker {
 
   static const Signature& signature() {
     static const Signature& result = internSignature(
-        typeid(R(A...)), {{encodingOf<R>(), encodingOf<A>()...},
-                          &invoke,
-                          reinterpret_cast<GenericFunction>(&scripted)});
+        typeid(R(A...)),
+        {{encodingOf<R>(), encodingOf<A>()...}, &invoke, reinterpret_cast<GenericFunction>(&scripted)});
     return result;
   }
 };

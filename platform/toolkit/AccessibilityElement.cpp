@@ -31,9 +31,10 @@ std::optional<Rect> AccessibilityElement::accessibilityFrameInContainerSpace() c
 }
 
 Class& AggregateElement::staticClass() {
-  static Class& result = ClassBuilder<AggregateElement>("AggregateElement", AccessibilityElement::staticClass())
-                             .method<&AggregateElement::representedElements>("representedElements")
-                             .build();
+  static Class& result =
+      ClassBuilder<AggregateElement>("AggregateElement", AccessibilityElement::staticClass())
+          .method<&AggregateElement::representedElements>("representedElements")
+          .build();
   return result;
 }
 
@@ -47,8 +48,12 @@ Ref<AggregateElement> AggregateElement::initWithAccessibilityContainerRepresente
   return make<AggregateElement>(container, std::move(representedElements));
 }
 
-Rect AggregateElement::defaultFrame() { return frameForElements(represented_); }
-Ref<String> AggregateElement::defaultLabel() { return labelForElements(represented_); }
+Rect AggregateElement::defaultFrame() {
+  return frameForElements(represented_);
+}
+Ref<String> AggregateElement::defaultLabel() {
+  return labelForElements(represented_);
+}
 
 static const RegisteredClass<AccessibilityElement> registered;
 static const RegisteredClass<AggregateElement> registeredAggregate;

@@ -28,7 +28,8 @@ inline const Message<void()> accessibilityDecrement{"accessibilityDecrement"};
 // 1 expanded, 2 collapsed, 0 neither.
 inline const Message<std::int64_t()> _accessibilityExpandedStatus{"_accessibilityExpandedStatus"};
 // The element under a point in the receiver's own space; the second argument is the event, which may be nil.
-inline const Message<Ref<Object>(Point, Ref<Object>)> _accessibilityHitTest{"_accessibilityHitTest:withEvent:"};
+inline const Message<Ref<Object>(Point, Ref<Object>)> _accessibilityHitTest{
+    "_accessibilityHitTest:withEvent:"};
 
 inline const Message<void(bool)> setIsAccessibilityElement{"setIsAccessibilityElement:"};
 inline const Message<void(Ref<String>)> setAccessibilityLabel{"setAccessibilityLabel:"};

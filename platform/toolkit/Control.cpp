@@ -11,8 +11,12 @@ namespace ax {
 
 namespace {
 
-void nextPage(PageControl& control) { control.setCurrentPage(control.currentPage() + 1); }
-void previousPage(PageControl& control) { control.setCurrentPage(control.currentPage() - 1); }
+void nextPage(PageControl& control) {
+  control.setCurrentPage(control.currentPage() + 1);
+}
+void previousPage(PageControl& control) {
+  control.setCurrentPage(control.currentPage() - 1);
+}
 
 }  // namespace
 
@@ -58,12 +62,13 @@ bool Button::activateByDefault() {
 }
 
 Class& PageControl::staticClass() {
-  static Class& result = ClassBuilder<PageControl>("PageControl", Control::staticClass())
-                             .property<&PageControl::numberOfPages, &PageControl::setNumberOfPages>("numberOfPages")
-                             .property<&PageControl::currentPage, &PageControl::setCurrentPage>("currentPage")
-                             .method<&nextPage>("accessibilityIncrement")
-                             .method<&previousPage>("accessibilityDecrement")
-                             .build();
+  static Class& result =
+      ClassBuilder<PageControl>("PageControl", Control::staticClass())
+          .property<&PageControl::numberOfPages, &PageControl::setNumberOfPages>("numberOfPages")
+          .property<&PageControl::currentPage, &PageControl::setCurrentPage>("currentPage")
+          .method<&nextPage>("accessibilityIncrement")
+          .method<&previousPage>("accessibilityDecrement")
+          .build();
   return result;
 }
 
@@ -77,7 +82,8 @@ void PageControl::setNumberOfPages(std::int64_t pages) {
 }
 
 Ref<String> PageControl::defaultValue() {
-  return stringWithFormat(platformString("page.control.value"), {number(currentPage_ + 1), number(numberOfPages_)});
+  return stringWithFormat(platformString("page.control.value"),
+                          {number(currentPage_ + 1), number(numberOfPages_)});
 }
 
 static const RegisteredClass<Control> registeredControl;

@@ -24,7 +24,9 @@ class Control : public View {
 
  protected:
   bool defaultIsElement() override { return true; }
-  Traits defaultTraits() override { return (isEnabled_ ? 0 : TraitNotEnabled) | (isSelected_ ? TraitSelected : 0); }
+  Traits defaultTraits() override {
+    return (isEnabled_ ? 0 : TraitNotEnabled) | (isSelected_ ? TraitSelected : 0);
+  }
 
  private:
   Weak<Object> target_;

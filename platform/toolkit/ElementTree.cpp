@@ -39,7 +39,9 @@ bool beginsBefore(const Rect& a, const Rect& b, bool rightToLeft) {
   return rightToLeft ? a.maxX() > b.maxX() : a.x < b.x;
 }
 
-bool standInOneRow(const Rect& upper, const Rect& lower) { return lower.y < upper.y + upper.height / 2 || lower.y == upper.y; }
+bool standInOneRow(const Rect& upper, const Rect& lower) {
+  return lower.y < upper.y + upper.height / 2 || lower.y == upper.y;
+}
 
 }  // namespace
 
@@ -71,7 +73,8 @@ bool _accessibilityViewIsVisible(Receiver receiver) {
   if (receiver.get() == nullptr) return false;
   const AccessibilityProperties* properties = AccessibilityProperties::find(*receiver.get());
   if (properties != nullptr && properties->isMarkedVisible && properties->overridesInvisibility) return true;
-  return !_accessibilityFindAncestor(receiver, [](Object& object) { return !isDrawn(object); }, true);
+  return !_accessibilityFindAncestor(
+      receiver, [](Object& object) { return !isDrawn(object); }, true);
 }
 
 std::vector<Ref<Object>> drawnChildren(Object& parent) {
@@ -115,13 +118,14 @@ int accessibilityCompareGeometry(Object& a, Object& b) {
 
 Ref<Array> sortedByGeometry(const Array& elements) {
   std::vector<Placed> placed;
-  for (const Ref<Object>& element : elements) placed.push_back({element, messages::accessibilityFrame(element)});
+  for (const Ref<Object>& element : elements)
+    placed.push_back({element, messages::accessibilityFrame(element)});
   std::stable_sort(placed.begin(), placed.end(),
                    [](const Placed& a, const Placed& b) { return a.frame.y < b.frame.y; });
   const bool rightToLeft = formatting::currentLanguageIsRightToLeft();
   for (auto row = placed.begin(); row != placed.end();) {
-    const auto rowEnd = std::find_if(row, placed.end(),
-                                     [&](const Placed& p) { return !standInOneRow(row->frame, p.frame); });
+    const auto rowEnd =
+        std::find_if(row, placed.end(), [&](const Placed& p) { return !standInOneRow(row->frame, p.frame); });
     std::stable_sort(row, rowEnd, [&](const Placed& a, const Placed& b) {
       return beginsBefore(a.frame, b.frame, rightToLeft);
     });

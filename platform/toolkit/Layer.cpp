@@ -20,7 +20,9 @@ Layer::~Layer() {
   for (const Ref<Layer>& layer : sublayers_) layer->superlayer_ = nullptr;
 }
 
-Ref<Array> Layer::sublayerArray() const { return array({sublayers_.begin(), sublayers_.end()}); }
+Ref<Array> Layer::sublayerArray() const {
+  return array({sublayers_.begin(), sublayers_.end()});
+}
 
 void Layer::addSublayer(const Ref<Layer>& layer) {
   if (!layer || layer->superlayer_ != nullptr) return;
@@ -34,7 +36,9 @@ Rect Layer::screenRect(Rect own) const {
   return superlayer_ == nullptr ? outer : superlayer_->screenRect(outer);
 }
 
-Rect Layer::defaultFrame() { return screenRect({0, 0, frame_.width, frame_.height}); }
+Rect Layer::defaultFrame() {
+  return screenRect({0, 0, frame_.width, frame_.height});
+}
 
 Ref<Object> Layer::defaultContainer() {
   if (owner_ != nullptr) return Ref<Object>(owner_);

@@ -13,26 +13,52 @@ const Properties::Blocks* blocksIn(const Properties* properties) {
   return properties == nullptr ? nullptr : properties->blocks.get();
 }
 
-void setIsElement(Object& self, bool isElement) { Properties::of(self).isElement = isElement; }
-void setLabel(Object& self, Ref<String> label) { Properties::of(self).label = std::move(label); }
-void setValue(Object& self, Ref<String> value) { Properties::of(self).value = std::move(value); }
-void setHint(Object& self, Ref<String> hint) { Properties::of(self).hint = std::move(hint); }
-void setTraits(Object& self, Traits traits) { Properties::of(self).traits = traits; }
-void setFrame(Object& self, Rect frame) { Properties::of(self).frame = frame; }
-void setElements(Object& self, Ref<Array> elements) { Properties::of(self).elements = std::move(elements); }
-void setContainer(Object& self, Ref<Object> container) { Properties::of(self).container = container; }
-void setActivationPoint(Object& self, Point point) { Properties::of(self).activationPoint = point; }
+void setIsElement(Object& self, bool isElement) {
+  Properties::of(self).isElement = isElement;
+}
+void setLabel(Object& self, Ref<String> label) {
+  Properties::of(self).label = std::move(label);
+}
+void setValue(Object& self, Ref<String> value) {
+  Properties::of(self).value = std::move(value);
+}
+void setHint(Object& self, Ref<String> hint) {
+  Properties::of(self).hint = std::move(hint);
+}
+void setTraits(Object& self, Traits traits) {
+  Properties::of(self).traits = traits;
+}
+void setFrame(Object& self, Rect frame) {
+  Properties::of(self).frame = frame;
+}
+void setElements(Object& self, Ref<Array> elements) {
+  Properties::of(self).elements = std::move(elements);
+}
+void setContainer(Object& self, Ref<Object> container) {
+  Properties::of(self).container = container;
+}
+void setActivationPoint(Object& self, Point point) {
+  Properties::of(self).activationPoint = point;
+}
 
 Ref<String> labelThatWasSet(Object& self) {
   const Properties* properties = Properties::find(self);
   return properties == nullptr ? nullptr : properties->label;
 }
 
-std::int64_t noContainerType(Object&) { return 0; }
-Ref<Object> noPath(Object&) { return nullptr; }
-bool isNotModal(Object&) { return false; }
+std::int64_t noContainerType(Object&) {
+  return 0;
+}
+Ref<Object> noPath(Object&) {
+  return nullptr;
+}
+bool isNotModal(Object&) {
+  return false;
+}
 void doNothing(Object&) {}
-std::int64_t noExpandedStatus(Object&) { return 0; }
+std::int64_t noExpandedStatus(Object&) {
+  return 0;
+}
 
 // Texts carry spoken forms, and nothing else of what responders do.
 template <class T>
@@ -53,35 +79,36 @@ struct TextLabels {
 }  // namespace
 
 Class& Responder::staticClass() {
-  static Class& result = ClassBuilder<Responder>("Responder", Object::staticClass())
-                             .method<&Responder::isAccessibilityElement>("isAccessibilityElement")
-                             .method<&Responder::accessibilityLabel>("accessibilityLabel")
-                             .method<&Responder::accessibilityValue>("accessibilityValue")
-                             .method<&Responder::accessibilityHint>("accessibilityHint")
-                             .method<&Responder::accessibilityTraits>("accessibilityTraits")
-                             .method<&Responder::accessibilityFrame>("accessibilityFrame")
-                             .method<&Responder::accessibilityElements>("accessibilityElements")
-                             .method<&Responder::accessibilityContainer>("accessibilityContainer")
-                             .method<&Responder::accessibilityActivationPoint>("accessibilityActivationPoint")
-                             .method<&Responder::accessibilityUserDefinedLabel>("accessibilityUserDefinedLabel")
-                             .method<&Responder::accessibilityActivate>("accessibilityActivate")
-                             .method<&noContainerType>("accessibilityContainerType")
-                             .method<&noPath>("accessibilityPath")
-                             .method<&isNotModal>("accessibilityViewIsModal")
-                             .method<&doNothing>("accessibilityIncrement")
-                             .method<&doNothing>("accessibilityDecrement")
-                             .method<&noExpandedStatus>("_accessibilityExpandedStatus")
-                             .method<&doNothing>("_accessibilityLoadAccessibilityInformation")
-                             .method<&setIsElement>("setIsAccessibilityElement:")
-                             .method<&setLabel>("setAccessibilityLabel:")
-                             .method<&setValue>("setAccessibilityValue:")
-                             .method<&setHint>("setAccessibilityHint:")
-                             .method<&setTraits>("setAccessibilityTraits:")
-                             .method<&setFrame>("setAccessibilityFrame:")
-                             .method<&setElements>("setAccessibilityElements:")
-                             .method<&setContainer>("setAccessibilityContainer:")
-                             .method<&setActivationPoint>("setAccessibilityActivationPoint:")
-                             .build();
+  static Class& result =
+      ClassBuilder<Responder>("Responder", Object::staticClass())
+          .method<&Responder::isAccessibilityElement>("isAccessibilityElement")
+          .method<&Responder::accessibilityLabel>("accessibilityLabel")
+          .method<&Responder::accessibilityValue>("accessibilityValue")
+          .method<&Responder::accessibilityHint>("accessibilityHint")
+          .method<&Responder::accessibilityTraits>("accessibilityTraits")
+          .method<&Responder::accessibilityFrame>("accessibilityFrame")
+          .method<&Responder::accessibilityElements>("accessibilityElements")
+          .method<&Responder::accessibilityContainer>("accessibilityContainer")
+          .method<&Responder::accessibilityActivationPoint>("accessibilityActivationPoint")
+          .method<&Responder::accessibilityUserDefinedLabel>("accessibilityUserDefinedLabel")
+          .method<&Responder::accessibilityActivate>("accessibilityActivate")
+          .method<&noContainerType>("accessibilityContainerType")
+          .method<&noPath>("accessibilityPath")
+          .method<&isNotModal>("accessibilityViewIsModal")
+          .method<&doNothing>("accessibilityIncrement")
+          .method<&doNothing>("accessibilityDecrement")
+          .method<&noExpandedStatus>("_accessibilityExpandedStatus")
+          .method<&doNothing>("_accessibilityLoadAccessibilityInformation")
+          .method<&setIsElement>("setIsAccessibilityElement:")
+          .method<&setLabel>("setAccessibilityLabel:")
+          .method<&setValue>("setAccessibilityValue:")
+          .method<&setHint>("setAccessibilityHint:")
+          .method<&setTraits>("setAccessibilityTraits:")
+          .method<&setFrame>("setAccessibilityFrame:")
+          .method<&setElements>("setAccessibilityElements:")
+          .method<&setContainer>("setAccessibilityContainer:")
+          .method<&setActivationPoint>("setAccessibilityActivationPoint:")
+          .build();
   return result;
 }
 
@@ -146,7 +173,9 @@ Point Responder::accessibilityActivationPoint() {
   return messages::accessibilityFrame(*this).center();
 }
 
-Ref<String> Responder::accessibilityUserDefinedLabel() { return labelThatWasSet(*this); }
+Ref<String> Responder::accessibilityUserDefinedLabel() {
+  return labelThatWasSet(*this);
+}
 
 bool Responder::accessibilityActivate() {
   const Properties::Blocks* blocks = blocksIn(Properties::find(*this));

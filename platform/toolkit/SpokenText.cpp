@@ -125,7 +125,8 @@ Ref<String> _accessibilityStringForLabelKeyValues(Receiver receiver, std::string
   Composition composition;
   while (!keyList.empty()) {
     const std::size_t end = std::min(keyList.find(between), keyList.size());
-    composition.add(messages::accessibilityLabel(safeValueForKey(receiver, Selector::find(keyList.substr(0, end)))));
+    composition.add(
+        messages::accessibilityLabel(safeValueForKey(receiver, Selector::find(keyList.substr(0, end)))));
     keyList.remove_prefix(std::min(end + between.size(), keyList.size()));
   }
   return composition.result();

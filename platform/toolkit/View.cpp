@@ -8,7 +8,9 @@ namespace ax {
 
 namespace {
 
-void layout(View& view) { view.layoutSubviews(); }
+void layout(View& view) {
+  view.layoutSubviews();
+}
 
 // The view itself when the point lies inside it; the point is in its own space.
 Ref<Object> hitTest(View& view, Point point, Ref<Object>) {
@@ -38,7 +40,9 @@ View::~View() {
   if (layer_) layer_->setOwner(nullptr);
 }
 
-Ref<Array> View::subviewArray() const { return array({subviews_.begin(), subviews_.end()}); }
+Ref<Array> View::subviewArray() const {
+  return array({subviews_.begin(), subviews_.end()});
+}
 
 void View::addSubview(const Ref<View>& view) {
   if (!view || isDescendantOf(*view)) return;
@@ -79,7 +83,9 @@ Rect View::screenRect(Rect own) const {
   return own;
 }
 
-Ref<View> safeUIViewForKey(Receiver receiver, Key key) { return cast<View>(safeValueForKey(receiver, key)); }
+Ref<View> safeUIViewForKey(Receiver receiver, Key key) {
+  return cast<View>(safeValueForKey(receiver, key));
+}
 
 static const RegisteredClass<View> registered;
 

@@ -8,8 +8,12 @@ namespace ax {
 
 namespace {
 
-void load(ViewController& controller) { controller.loadView(); }
-void didLoad(ViewController& controller) { controller.viewDidLoad(); }
+void load(ViewController& controller) {
+  controller.loadView();
+}
+void didLoad(ViewController& controller) {
+  controller.viewDidLoad();
+}
 
 }  // namespace
 
@@ -34,12 +38,13 @@ bool BarButtonItem::activateByDefault() {
 
 Class& NavigationItem::staticClass() {
   using T = NavigationItem;
-  static Class& result = ClassBuilder<T>("NavigationItem", Object::staticClass())
-                             .property<&T::title, &T::setTitle>("title")
-                             .property<&T::leftBarButtonItems, &T::setLeftBarButtonItems>("leftBarButtonItems")
-                             .property<&T::rightBarButtonItems, &T::setRightBarButtonItems>("rightBarButtonItems")
-                             .property<&T::rightBarButtonItem, &T::setRightBarButtonItem>("rightBarButtonItem")
-                             .build();
+  static Class& result =
+      ClassBuilder<T>("NavigationItem", Object::staticClass())
+          .property<&T::title, &T::setTitle>("title")
+          .property<&T::leftBarButtonItems, &T::setLeftBarButtonItems>("leftBarButtonItems")
+          .property<&T::rightBarButtonItems, &T::setRightBarButtonItems>("rightBarButtonItems")
+          .property<&T::rightBarButtonItem, &T::setRightBarButtonItem>("rightBarButtonItem")
+          .build();
   return result;
 }
 

@@ -1,0 +1,37 @@
+#include "platform/foundation/WeatherUtilities.h"
+
+#include "platform/foundation/Bundle.h"
+#include "platform/runtime/ClassBuilder.h"
+
+namespace ax {
+
+Class& WeatherUtilities::staticClass() {
+  using T = WeatherUtilities;
+  static Class& result =
+      ClassBuilder<T>("WeatherUtilities", Object::staticClass())
+          .classMethod<&T::sharedInstance>("sharedInstance")
+          .method<&T::descriptionForWeatherWXQConditionCode>("descriptionForWeatherWXQConditionCode:")
+          .build();
+  return result;
+}
+
+Ref<WeatherUtilities> WeatherUtilities::sharedInstance() {
+  static const Ref<WeatherUtilities>& shared = *new Ref<WeatherUtilities>(make<WeatherUtilities>());
+  return shared;
+}
+
+Ref<String> WeatherUtilities::descriptionForWeatherWXQConditionCode(std::int64_t code) const {
+  const Ref<String> known = platformString("weather." + std::to_string(code));
+  return known ? known : platformString("weather.unknown");
+}
+
+std::int64_t conditionCodeFromLegacyWeatherConditionCode(std::int64_t legacyCode) {
+  constexpr std::int64_t firstLegacyCode = 1;
+  constexpr std::int64_t conditions = 48;
+  const std::int64_t code = legacyCode - firstLegacyCode;
+  return code >= 0 && code < conditions ? code : -1;
+}
+
+static const RegisteredClass<WeatherUtilities> registered;
+
+}  // namespace ax
