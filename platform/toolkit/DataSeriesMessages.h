@@ -1,0 +1,48 @@
+#pragma once
+
+#include <cstdint>
+
+#include "platform/foundation/Array.h"
+#include "platform/foundation/Number.h"
+#include "platform/foundation/String.h"
+#include "platform/runtime/Message.h"
+
+// How a chart describes itself as a data series with two axes, and as a row of equal time slices. Axis 0 is
+// the horizontal one, axis 1 the vertical one. What a chart leaves out is nil, NO or 0.
+namespace ax::messages {
+
+// The accessibilityContainerType of a chart that is a data series.
+inline constexpr std::int64_t dataSeriesContainerType = 13;
+
+inline const Message<bool()> _accessibilityDataSeriesSupportsSummarization{
+    "_accessibilityDataSeriesSupportsSummarization"};
+inline const Message<bool()> _accessibilityDataSeriesSupportsSonification{
+    "_accessibilityDataSeriesSupportsSonification"};
+inline const Message<std::int64_t()> _accessibilityDataSeriesType{"_accessibilityDataSeriesType"};
+inline const Message<Ref<String>()> _accessibilityDataSeriesName{"_accessibilityDataSeriesName"};
+// Numbers, one per point, in the points' order.
+inline const Message<Ref<Array>(std::int64_t)> _accessibilityDataSeriesValuesForAxis{
+    "_accessibilityDataSeriesValuesForAxis:"};
+inline const Message<Ref<String>(std::int64_t)> _accessibilityDataSeriesTitleForAxis{
+    "_accessibilityDataSeriesTitleForAxis:"};
+inline const Message<Ref<String>(std::int64_t)> _accessibilityDataSeriesUnitLabelForAxis{
+    "_accessibilityDataSeriesUnitLabelForAxis:"};
+inline const Message<Ref<Number>(std::int64_t)> _accessibilityDataSeriesMinimumValueForAxis{
+    "_accessibilityDataSeriesMinimumValueForAxis:"};
+inline const Message<Ref<Number>(std::int64_t)> _accessibilityDataSeriesMaximumValueForAxis{
+    "_accessibilityDataSeriesMaximumValueForAxis:"};
+// The position runs from 0, the start of the axis, to 1, its end.
+inline const Message<Ref<String>(double, std::int64_t)>
+    _accessibilityDataSeriesValueDescriptionForPositionAxis{
+        "_accessibilityDataSeriesValueDescriptionForPosition:axis:"};
+
+inline const Message<bool()> _accessibilityShouldUseSlices{"_accessibilityShouldUseSlices"};
+inline const Message<std::uint64_t()> _accessibilityNumberOfSlices{"_accessibilityNumberOfSlices"};
+// In seconds.
+inline const Message<double()> _accessibilityTimeIntervalPerSlice{"_accessibilityTimeIntervalPerSlice"};
+inline const Message<std::uint64_t()> _accessibilityHoursPerSlice{"_accessibilityHoursPerSlice"};
+// The spoken quantity of the slice with that index, counted from 0.
+inline const Message<Ref<String>(std::uint64_t)> _accessibilityQuantityForSliceAtIndex{
+    "_accessibilityQuantityForSliceAtIndex:"};
+
+}  // namespace ax::messages
