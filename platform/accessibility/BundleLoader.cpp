@@ -12,6 +12,12 @@ namespace {
 const Message<Ref<Array>()> accessibilityBundles{"accessibilityBundles"};
 const Message<void()> accessibilityInitializeBundle{"accessibilityInitializeBundle"};
 
+// The modules that have been opened; they stay open.
+std::vector<void*>& openModules() {
+  static auto* const modules = new std::vector<void*>;
+  return *modules;
+}
+
 }  // namespace
 
 std::unique_ptr<LoadedBundle> LoadedBundle::open(const std::string& modulePath,
@@ -26,6 +32,7 @@ std::unique_ptr<LoadedBundle> LoadedBundle::open(const std::string& modulePath,
     error = modulePath + ": no class " + principalClass + " in this module";
     return nullptr;
   }
+  openModules().push_back(handle);
   return std::unique_ptr<LoadedBundle>(new LoadedBundle(handle, *principal));
 }
 

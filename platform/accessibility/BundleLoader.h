@@ -21,6 +21,8 @@ class LoadedBundle {
   Class& principalClass() const { return principal_; }
   // An exported function, or null.
   void* symbol(const std::string& name) const;
+  // The same in whichever open bundle exports it.
+  static void* exportedSymbol(const std::string& name);
 
  private:
   LoadedBundle(void* handle, Class& principal) : handle_(handle), principal_(principal) {}

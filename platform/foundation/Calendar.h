@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/foundation/Date.h"
+#include "platform/foundation/String.h"
 
 namespace ax {
 
@@ -24,7 +25,7 @@ class Calendar final : public Object {
   static Class& staticClass();
 
   static Ref<Calendar> currentCalendar();
-  static Ref<Calendar> calendarWithIdentifier(const Ref<class String>& identifier);
+  static Ref<Calendar> calendarWithIdentifier(const Ref<String>& identifier);
 
   Ref<DateComponents> componentsFromDate(const Date& date) const;
   Ref<Date> startOfDayForDate(const Date& date) const;

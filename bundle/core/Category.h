@@ -1,0 +1,21 @@
+#pragma once
+
+// What the source file of a category needs.
+#include "platform/accessibility/CategoryRegistration.h"
+#include "platform/foundation/Array.h"
+#include "platform/foundation/String.h"
+#include "platform/runtime/KeyReading.h"
+#include "platform/runtime/SafeCategory.h"
+#include "platform/toolkit/AccessibilityMessages.h"
+#include "platform/toolkit/AccessibilityProperties.h"
+#include "platform/toolkit/ElementTree.h"
+#include "platform/toolkit/SpokenText.h"
+
+namespace ax {
+
+using Manager = ValidationManager;
+
+// Under this name a view keeps the elements that a category built for it.
+inline const Key StorageKeyChildren = Selector::intern("StorageKeyChildren");
+
+}  // namespace ax

@@ -1,0 +1,59 @@
+#include "bundle/shared/DayRings.h"
+
+#include <mutex>
+
+#include "bundle/shared/RingsDescription.h"
+#include "platform/health/ActivitySummary.h"
+#include "platform/runtime/KeyReading.h"
+
+using namespace ax;
+
+namespace {
+
+const Message<Ref<Object>(std::int64_t)> activitySummaryForCacheIndex{"activitySummaryForCacheIndex:"};
+const Message<double()> activeEnergyCompletionPercentage{"_activeEnergyCompletionPercentage"};
+const Message<double()> standHoursCompletionPercentage{"_standHoursCompletionPercentage"};
+
+const Ref<Calendar>& gregorianCalendar() {
+  static std::once_flag made;
+  static auto* const calendar = new Ref<Calendar>;
+  std::call_once(made,
+                 [] { *calendar = Calendar::calendarWithIdentifier(string(CalendarIdentifierGregorian)); });
+  return *calendar;
+}
+
+double moveFraction(const Ref<ActivitySummary>& summary) {
+  return activeEnergyCompletionPercentage(summary);
+}
+double exerciseFraction(const Ref<ActivitySummary>& summary) {
+  return safeDoubleForKey(summary, "_exerciseTimeCompletionPercentage"_key);
+}
+double standFraction(const Ref<ActivitySummary>& summary) {
+  return standHoursCompletionPercentage(summary);
+}
+
+bool isProgress(double fraction) {
+  return fraction >= 0;
+}
+
+}  // namespace
+
+std::int64_t CHCacheIndexForDate(const Ref<Date>& date) {
+  return cacheIndexFromDateComponents(activityCacheDateComponentsFromDate(date, gregorianCalendar()));
+}
+
+Ref<String> accessibilityVeltoStringForDate(const Ref<Date>& date, bool arePercentagesCapped) {
+  Ref<Object> found;
+  performSafeBlock([&] {
+    const Ref<Object> cache =
+        safeValueForKey(safeClassFromString("ActivitySummaryCache"), "sharedInstance"_key);
+    found = activitySummaryForCacheIndex(cache, CHCacheIndexForDate(date));
+  });
+  const Ref<ActivitySummary> summary = castAsClass<ActivitySummary>(found);
+  if (!isProgress(moveFraction(summary))) return nullptr;
+  if (!isProgress(exerciseFraction(summary))) return nullptr;
+  if (!isProgress(standFraction(summary))) return nullptr;
+  return messages::_veltoUIAccessibilityDescriptionForPercentages(
+      summary, moveFraction(summary), exerciseFraction(summary), standFraction(summary),
+      arePercentagesCapped);
+}

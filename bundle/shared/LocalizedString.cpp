@@ -1,0 +1,51 @@
+#include "bundle/shared/LocalizedString.h"
+
+#include <mutex>
+
+#include "bundle/shared/WheelchairUse.h"
+#include "platform/foundation/AddressBook.h"
+#include "platform/foundation/Bundle.h"
+#include "platform/runtime/Message.h"
+
+namespace ax {
+
+namespace {
+
+const Message<void(Ref<String>)> setName{"setName:"};
+const Message<void(bool)> setWheelchairUser{"setWheelchairUser:"};
+const Message<Ref<String>(Ref<Object>)> titleForAchievement{"titleForAchievement:"};
+
+// The host library's provider, made once with the settings of that moment.
+const Ref<Object>& achievementLocalizationProvider() {
+  static std::once_flag made;
+  static auto* const provider = new Ref<Object>;
+  std::call_once(made, [] {
+    const Class* providerClass = safeClassFromString("ODUIAchievementLocalizationProvider");
+    if (providerClass == nullptr) return;
+    *provider = providerClass->instantiate();
+    setName(*provider, copyUserFirstNameFromAddressBook());
+    setWheelchairUser(*provider, _userIsWheelchairUserWithParloOn());
+  });
+  return *provider;
+}
+
+}  // namespace
+
+Ref<String> accessibilityLocalizedString(std::string_view key) {
+  const Ref<Bundle> bundle = Bundle::bundleForClass(safeClassFromString("AXVeltoGlue"));
+  return bundle ? bundle->localizedStringForKey(key, emptyString(), "Accessibility") : nullptr;
+}
+
+}  // namespace ax
+
+using namespace ax;
+
+Ref<String> accessibilityLocalizedString(const Ref<String>& key) {
+  return ax::accessibilityLocalizedString(key ? std::string_view(key->text()) : std::string_view());
+}
+
+Ref<String> accessibilityLocalizedStringForAchievement(const Ref<Object>& achievement) {
+  const Ref<Object>& provider = achievementLocalizationProvider();
+  if (!achievement || !achievement->isKindOf(safeClassFromString("ACHAchievement"))) return nullptr;
+  return titleForAchievement(provider, achievement);
+}

@@ -1,0 +1,67 @@
+#include "bundle/shared/Pace.h"
+
+#include <charconv>
+#include <limits>
+#include <mutex>
+#include <optional>
+#include <regex>
+
+#include "bundle/shared/LocalizedString.h"
+#include "platform/foundation/Formatters.h"
+
+using namespace ax;
+
+namespace {
+
+// Longer texts are no figures on a screen, and would cost the pattern too much stack.
+constexpr std::size_t longestFigure = 2000;
+
+const std::regex& pacePattern() {
+  static std::once_flag made;
+  static const std::regex* pattern;
+  std::call_once(made, [] { pattern = new std::regex(R"re((\d+)'\s?([0-5]?[0-9])(?:''|"))re"); });
+  return *pattern;
+}
+
+// As many seconds as fit.
+std::int64_t secondsOf(const std::string& minutes, const std::string& seconds) {
+  std::int64_t wholeMinutes = 0;
+  std::int64_t rest = 0;
+  std::from_chars(seconds.data(), seconds.data() + seconds.size(), rest);
+  const auto read = std::from_chars(minutes.data(), minutes.data() + minutes.size(), wholeMinutes);
+  std::int64_t total = 0;
+  const bool overflows = read.ec != std::errc() || __builtin_mul_overflow(wholeMinutes, 60, &total) ||
+                         __builtin_add_overflow(total, rest, &total);
+  return overflows ? std::numeric_limits<std::int64_t>::max() : total;
+}
+
+bool marksMissingData(const String& text) {
+  return text.contains("--") || text.contains("\u2013\u2013");
+}
+
+Ref<AccessibilityAttributedString> withSpokenPace(const std::smatch& pace, const NumberFormatter& formatter) {
+  const Ref<String> formatted = formatter.stringFromNumber(number(secondsOf(pace[1], pace[2])));
+  const std::string total = formatted ? formatted->text() : "";
+  const auto start = static_cast<std::size_t>(pace.position());
+  auto spoken = make<AccessibilityAttributedString>(pace.prefix().str() + total + pace.suffix().str());
+  if (spoken->text().compare(start, total.size(), total) == 0) {
+    spoken->setAttributeForKeyWithRange(number(true), DurationTimeMMSS, {start, total.size()});
+  }
+  return spoken;
+}
+
+}  // namespace
+
+Ref<AccessibilityAttributedString> accessibilityAttributedStringForPaceContainingString(
+    const Ref<String>& string) {
+  if (isEmpty(string)) return nullptr;
+  if (marksMissingData(*string)) {
+    return AccessibilityAttributedString::initWithString(ax::accessibilityLocalizedString("no.data"));
+  }
+  const Ref<NumberFormatter> formatter = make<NumberFormatter>();
+  std::smatch pace;
+  const bool found =
+      string->text().size() <= longestFigure && std::regex_search(string->text(), pace, pacePattern());
+  if (!found || pace.size() != 3) return AccessibilityAttributedString::initWithString(string);
+  return withSpokenPace(pace, *formatter);
+}

@@ -1,0 +1,10 @@
+#pragma once
+
+#include "bundle/core/Export.h"
+#include "platform/foundation/AttributedString.h"
+
+// A text with a pace such as 5'30" in it, its first pace written as a number of seconds that is marked to be
+// spoken as minutes and seconds. A text that marks missing data with dashes becomes the words for no data,
+// one without a pace stays as it is, and nil or an empty one gives nil.
+AX_EXPORT ax::Ref<ax::AccessibilityAttributedString> accessibilityAttributedStringForPaceContainingString(
+    const ax::Ref<ax::String>& string);

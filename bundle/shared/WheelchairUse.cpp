@@ -1,0 +1,38 @@
+#include "bundle/shared/WheelchairUse.h"
+
+#include <atomic>
+#include <mutex>
+
+#include "platform/foundation/BackgroundQueue.h"
+#include "platform/foundation/Environment.h"
+#include "platform/health/HealthStore.h"
+
+namespace ax {
+
+namespace {
+
+constexpr std::int64_t wheelchairUser = 2;  // the health store's value
+
+std::atomic<bool> isWheelchairUser = false;
+
+void askHealthStore() {
+  Ref<Object> error;
+  const Ref<WheelchairUseObject> answer = make<HealthStore>()->wheelchairUseWithError(error);
+  if (!error) isWheelchairUser = answer && answer->wheelchairUse() == wheelchairUser;
+}
+
+}  // namespace
+
+bool _userIsWheelchairUserWithParloOn() {
+  if (!isScreenReaderRunning()) return isWheelchairUser;
+  static std::once_flag firstQuery;
+  bool isFirst = false;
+  std::call_once(firstQuery, [&] {
+    isFirst = true;
+    askHealthStore();
+  });
+  if (!isFirst) dispatchInBackground(askHealthStore);
+  return isWheelchairUser;
+}
+
+}  // namespace ax

@@ -1,0 +1,77 @@
+#include "bundle/core/Category.h"
+#include "platform/foundation/WeatherUtilities.h"
+#include "platform/toolkit/AccessibilityElement.h"
+#include "platform/toolkit/ImageView.h"
+
+namespace ax {
+
+namespace {
+
+const Message<void(Ref<Object>, Ref<Object>, std::int64_t, Ref<Object>)> setWeather{
+    "setTemperature:humidity:weatherCondition:formattingManager:"};
+
+// The weather strip: one summary of all it shows, then the host's attribution button.
+class CHWorkoutDetailWeatherViewAccessibility : public SafeCategory<CHWorkoutDetailWeatherViewAccessibility> {
+ public:
+  using SafeCategory::SafeCategory;
+
+  static void _accessibilityPerformValidations(Manager& manager) {
+    constexpr auto target = "_CHWorkoutDetailWeatherView";
+    manager.validateClassIsKindOfClass(target, "View");
+    manager.validateClassHasInstanceVariableWithType(target, "_weatherConditionImageView", "ImageView");
+    manager.validateClassHasInstanceVariableWithType(target, "_twcButton", "Button");
+    manager.validateClassHasInstanceMethodWithFullSignature(
+        target, "setTemperature:humidity:weatherCondition:formattingManager:", {"v", "@", "@", "q", "@"});
+  }
+
+  Ref<Array> accessibilityElements() {
+    if (const Ref<Object> cached = self._accessibilityValueForKey(StorageKeyChildren))
+      return cast<Array>(cached);
+    const Ref<Object> button = self.safeValueForKey("_twcButton"_key);
+    const Ref<Array> elements = axArrayByIgnoringNilElementsWithCount(2, {summaryWithout(button), button});
+    self._accessibilitySetRetainedValueForKey(elements, StorageKeyChildren);
+    return elements;
+  }
+
+  void setTemperatureHumidityWeatherConditionFormattingManager(Ref<Object> temperature, Ref<Object> humidity,
+                                                               std::int64_t weatherCondition,
+                                                               Ref<Object> formattingManager) {
+    super(setWeather, temperature, humidity, weatherCondition, formattingManager);
+    const Ref<ImageView> imageView =
+        castAsClass<ImageView>(self.safeValueForKey("_weatherConditionImageView"_key));
+    if (!imageView || !imageView->image()) return;
+    const std::int64_t code = conditionCodeFromLegacyWeatherConditionCode(weatherCondition);
+    messages::setAccessibilityLabel(
+        imageView, WeatherUtilities::sharedInstance()->descriptionForWeatherWXQConditionCode(code));
+    messages::setIsAccessibilityElement(imageView, true);
+  }
+
+ private:
+  Ref<AccessibilityElement> summaryWithout(const Ref<Object>& button) {
+    Array::Items shown;
+    Rect frame;
+    if (const Ref<View> view = castAsClass<View>(self)) {
+      for (const Ref<View>& subview : view->subviews()) {
+        if (subview == button) continue;
+        shown.push_back(subview);
+        frame = frame.unionWith(subview->frame());
+      }
+    }
+    const Ref<AccessibilityElement> summary = AccessibilityElement::initWithAccessibilityContainer(self);
+    summary->setAccessibilityFrameInContainerSpace(frame);
+    messages::setAccessibilityLabel(summary, labelForElements(array(std::move(shown))));
+    return summary;
+  }
+};
+
+using C = CHWorkoutDetailWeatherViewAccessibility;
+
+const CategoryRegistration<C> registration{
+    "_CHWorkoutDetailWeatherViewAccessibility",
+    "_CHWorkoutDetailWeatherView",
+    {overrides<&C::accessibilityElements>(messages::accessibilityElements),
+     overrides<&C::setTemperatureHumidityWeatherConditionFormattingManager>(setWeather)}};
+
+}  // namespace
+
+}  // namespace ax
