@@ -113,7 +113,7 @@ Ref<Date> dateFromStringWithFormat(const Ref<String>& text, std::string_view pat
   return time ? date(*time) : nullptr;
 }
 
-Ref<String> stringWithFormat(const Ref<String>& pattern, std::initializer_list<Ref<Object>> arguments) {
+Ref<String> stringWithFormat(const Ref<String>& pattern, std::span<const Ref<Object>> arguments) {
   if (!pattern) return nullptr;
   std::vector<formatting::MessageArgument> filled;
   for (const Ref<Object>& argument : arguments) filled.push_back(messageArgument(argument));

@@ -1,5 +1,7 @@
 #pragma once
 
+#include <span>
+
 #include "platform/foundation/Array.h"
 #include "platform/foundation/Date.h"
 #include "platform/foundation/Number.h"
@@ -65,6 +67,10 @@ Ref<Date> dateFromStringWithFormat(const Ref<String>& text, std::string_view pat
 
 // A localized pattern filled with arguments: Strings go in as text, Numbers as numbers (so that they choose
 // plural forms), other objects by their text form, nil as nothing. Nil for no pattern.
-Ref<String> stringWithFormat(const Ref<String>& pattern, std::initializer_list<Ref<Object>> arguments);
+Ref<String> stringWithFormat(const Ref<String>& pattern, std::span<const Ref<Object>> arguments);
+inline Ref<String> stringWithFormat(const Ref<String>& pattern,
+                                    std::initializer_list<Ref<Object>> arguments) {
+  return stringWithFormat(pattern, std::span(arguments.begin(), arguments.size()));
+}
 
 }  // namespace ax

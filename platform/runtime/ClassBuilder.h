@@ -77,11 +77,28 @@ std::remove_cvref_t<T> specific(CanonicalType<T>& value) {
   }
 }
 
+// Whether a boxed argument is of the class that the C++ type names. Scalars are told apart by their codes.
+template <class T>
+bool isOfClass(const Ref<Object>& value, const Ref<T>*) {
+  return !value || cast<T>(value.get()) != nullptr;
+}
+inline bool isOfClass(const Ref<Object>&, const void*) {
+  return true;
+}
+
+template <class... A>
+bool takesArguments([[maybe_unused]] std::span<const Ref<Object>> values) {
+  [[maybe_unused]] std::size_t i = 0;
+  return (... && (i >= values.size() ||
+                  isOfClass(values[i++], static_cast<const std::remove_cvref_t<A>*>(nullptr))));
+}
+
 template <class R, class... A>
 Method record(Selector selector, CanonicalType<R> (*function)(Object&, const Method&, CanonicalType<A>...)) {
   return {.selector = selector,
           .signature = &signatureOf<R, A...>(),
-          .function = reinterpret_cast<GenericFunction>(function)};
+          .function = reinterpret_cast<GenericFunction>(function),
+          .takes = &takesArguments<A...>};
 }
 
 template <class Owner, auto Function, class Type = decltype(Function)>

@@ -1,10 +1,14 @@
 #pragma once
 
+#include <span>
+
+#include "platform/runtime/Ref.h"
 #include "platform/runtime/Selector.h"
 
 namespace ax {
 
 class Class;
+class Object;
 struct CategoryGraft;
 struct Signature;
 
@@ -21,6 +25,9 @@ struct Method {
   const Method* former = nullptr;        // what a grafted entry replaced in the same table, if anything
   const CategoryGraft* graft = nullptr;  // the graft that brought it, if one did
   GenericFunction unscripted = nullptr;  // what `function` was before a scripted answer stood in its place
+  // Whether boxed objects are of the classes that the C++ arguments name; null when that is not known. Others
+  // arrive as nil.
+  bool (*takes)(std::span<const Ref<Object>>) = nullptr;
 };
 
 }  // namespace ax
