@@ -18,7 +18,7 @@ class AX_VeltoNSStringAccessibility : public SafeCategory<AX_VeltoNSStringAccess
   }
 
   Ref<Object> attrStringWithValueUnit(Ref<Object> value, Ref<String> unit) {
-    const Ref<Object> result = super(ax::attrStringWithValueUnit, value, unit);
+    Ref<Object> result = super(ax::attrStringWithValueUnit, value, unit);
     if (const Ref<String> spokenUnit = messages::accessibilityLabel(unit)) {
       messages::setAccessibilityLabel(result, textOf(super(ax::attrStringWithValueUnit, value, spokenUnit)));
     }

@@ -4,7 +4,6 @@
 #include <cstdio>
 #include <mutex>
 #include <set>
-#include <tuple>
 
 #include "platform/runtime/Boxing.h"
 
@@ -60,17 +59,17 @@ namespace {
 std::atomic<std::size_t> mismatches = 0;
 }
 
-void reportCastMismatch(const Object& object, std::string_view expected, const std::source_location& place) {
+void reportCastMismatch(const Object& object, std::string_view expected, SourcePlace place) {
   ++mismatches;
 #ifndef NDEBUG
   static std::mutex mutex;
-  static std::set<std::tuple<std::string_view, unsigned, unsigned>> reported;
+  static std::set<std::pair<std::string_view, unsigned>> reported;
   const std::lock_guard lock(mutex);
-  if (!reported.emplace(place.file_name(), place.line(), place.column()).second) return;
-  std::string_view file = place.file_name();
+  if (!reported.emplace(place.file, place.line).second) return;
+  std::string_view file = place.file;
   file.remove_prefix(file.find_last_of('/') + 1);
   std::fprintf(stderr, "AX Velto: %.*s:%u: expected an object of class %.*s, found %s\n", int(file.size()),
-               file.data(), place.line(), int(expected.size()), expected.data(), object.isa().name().c_str());
+               file.data(), place.line, int(expected.size()), expected.data(), object.isa().name().c_str());
 #else
   (void)object, (void)expected, (void)place;
 #endif
@@ -80,8 +79,7 @@ std::size_t castMismatches() {
   return mismatches;
 }
 
-Ref<Object> safeClass(std::string_view className, Ref<Object> object, bool* mismatch,
-                      const std::source_location& place) {
+Ref<Object> safeClass(std::string_view className, Ref<Object> object, bool* mismatch, SourcePlace place) {
   const bool isMismatch = object && !object->isKindOf(Class::named(className));
   if (mismatch != nullptr) *mismatch = isMismatch;
   if (!isMismatch) return object;

@@ -1,7 +1,5 @@
 #pragma once
 
-#include <source_location>
-
 #include "platform/runtime/Class.h"
 #include "platform/runtime/Message.h"
 
@@ -24,17 +22,27 @@ Ref<Array> safeArrayForKey(Receiver receiver, Key key);
 Ref<String> safeStringForKey(Receiver receiver, Key key);
 Ref<View> safeUIViewForKey(Receiver receiver, Key key);
 
+// Where in the code something was asked.
+struct SourcePlace {
+  const char* file;
+  unsigned line;
+  static constexpr SourcePlace current(const char* file = __builtin_FILE(),
+                                       unsigned line = __builtin_LINE()) {
+    return {file, line};
+  }
+};
+
 // Casts whose mismatch means that the host broke its contract: nil, reported through the flag, and in debug
 // builds once per place to standard error.
-void reportCastMismatch(const Object& object, std::string_view expected, const std::source_location& place);
+void reportCastMismatch(const Object& object, std::string_view expected, SourcePlace place);
 std::size_t castMismatches();  // in this process so far
 
 Ref<Object> safeClass(std::string_view className, Ref<Object> object, bool* mismatch = nullptr,
-                      const std::source_location& place = std::source_location::current());
+                      SourcePlace place = SourcePlace::current());
 
 template <class T, class U>
 Ref<T> castAsClass(const Ref<U>& object, bool* mismatch = nullptr,
-                   const std::source_location& place = std::source_location::current()) {
+                   SourcePlace place = SourcePlace::current()) {
   Ref<T> result = cast<T>(Ref<Object>(object));
   const bool isMismatch = object && !result;
   if (isMismatch) reportCastMismatch(*object, T::staticClass().name(), place);
@@ -43,8 +51,7 @@ Ref<T> castAsClass(const Ref<U>& object, bool* mismatch = nullptr,
 }
 
 template <class T>
-Ref<T> castAsClass(Object& object, bool* mismatch = nullptr,
-                   const std::source_location& place = std::source_location::current()) {
+Ref<T> castAsClass(Object& object, bool* mismatch = nullptr, SourcePlace place = SourcePlace::current()) {
   return castAsClass<T>(Ref<Object>(&object), mismatch, place);
 }
 

@@ -19,7 +19,7 @@ Class& Object::staticClass() {
 Object::~Object() {
   for (Attachment* a = attachments_; a != nullptr;) {
     Attachment* next = a->next;
-    a->value->release();
+    const Ref<Object> released = Ref<Object>::adopt(a->value);
     delete a;
     a = next;
   }

@@ -46,9 +46,9 @@ Ref<Array> View::subviewArray() const {
 
 void View::addSubview(const Ref<View>& view) {
   if (!view || isDescendantOf(*view)) return;
-  const Ref<View> kept = view;
-  view->removeFromSuperview();
-  view->superview_ = this;
+  const Ref<View> kept(view.get());  // `view` may stand in the list that it is taken from
+  kept->removeFromSuperview();
+  kept->superview_ = this;
   subviews_.push_back(kept);
 }
 
