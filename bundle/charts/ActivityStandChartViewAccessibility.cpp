@@ -1,0 +1,86 @@
+#include <cmath>
+
+#include "bundle/charts/DataSeriesChart.h"
+#include "bundle/charts/DaySpans.h"
+#include "bundle/shared/LocalizedString.h"
+#include "platform/foundation/Value.h"
+#include "platform/toolkit/View.h"
+
+namespace ax {
+
+namespace {
+
+constexpr TimeInterval hour = 3600;
+
+// The day's stand hours: one element per hour that the host shows, active or idle.
+class ActivityStandChartViewAccessibility : public GraphDataChart<ActivityStandChartViewAccessibility> {
+ public:
+  using GraphDataChart::GraphDataChart;
+
+  static GraphSource graphSource() {
+    return {"standChartPoints"_key, "kAXDayViewCellGraphElements"_key, &Value::staticClass()};
+  }
+
+  static void _accessibilityPerformValidations(Manager& manager) {
+    manager.validateClassHasInstanceMethodWithFullSignature("Velto.ActivityStandChartView",
+                                                            "standChartPoints", {"@"});
+  }
+
+  bool _accessibilityDataSeriesSupportsSummarization() { return false; }
+  Ref<String> _accessibilityDataSeriesName() {
+    return accessibilityLocalizedString("stand.hours.data.series");
+  }
+  Ref<Array> _accessibilityDataSeriesValuesForAxis(std::int64_t axis) {
+    return pointValuesForAxis(messages::_accessibilityGraphData(self), axis);
+  }
+  Ref<String> _accessibilityDataSeriesTitleForAxis(std::int64_t axis) {
+    return localizedTextForAxis(axis, "activity.time.of.day.axis", "stand.goal.data.unit");
+  }
+  Ref<String> _accessibilityDataSeriesUnitLabelForAxis(std::int64_t axis) {
+    return axis == 1 ? emptyString() : localizedTextForAxis(axis, "activity.time.of.day.unit", {});
+  }
+  Ref<Number> _accessibilityDataSeriesMinimumValueForAxis(std::int64_t axis) {
+    return axis == 0 || axis == 1 ? number(0) : nullptr;
+  }
+  Ref<Number> _accessibilityDataSeriesMaximumValueForAxis(std::int64_t axis) {
+    if (axis == 0) return number(24);
+    return axis == 1 ? number(1) : nullptr;
+  }
+
+  Ref<Array> accessibilityElements() {
+    return chartElements(self, [this](MutableArray& elements) { addHours(elements); });
+  }
+
+ private:
+  static Ref<String> valueOf(const Ref<Object>& point) {
+    const bool isActive = static_cast<float>(unboxPoint(point).y) > 0;
+    return accessibilityLocalizedString(isActive ? "stand.goal.active" : "stand.goal.inactive");
+  }
+
+  void addHours(MutableArray& elements) {
+    const Ref<Array> points = messages::_accessibilityGraphData(self);
+    const std::size_t count = points ? points->count() : 0;
+    elements.reserve(count);
+    DaySpans hours(hour, "ha");
+    const Ref<View> view = castAsClass<View>(self);
+    if (!view || count == 0) return;
+    const double height = std::floor(view->frame().height);
+    const double width = std::ceil(view->frame().width / static_cast<double>(count));
+    for (std::size_t i = 0; i < count; ++i) {
+      const Ref<String> value = valueOf(points->at(i));
+      const Rect frame = {width * static_cast<double>(i), 0, width, height};
+      elements.axSafelyAddObject(chartElement(self, frame, hours.text(i, i == count - 1), value));
+    }
+  }
+};
+
+using C = ActivityStandChartViewAccessibility;
+
+const DataSeriesRegistration<C> registration{
+    "ActivityStandChartViewAccessibility",
+    "Velto.ActivityStandChartView",
+    {overrides<&C::_accessibilityDataSeriesName>(messages::_accessibilityDataSeriesName)}};
+
+}  // namespace
+
+}  // namespace ax

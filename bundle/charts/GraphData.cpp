@@ -1,0 +1,41 @@
+#include "bundle/charts/GraphData.h"
+
+#include "bundle/shared/LocalizedString.h"
+#include "platform/foundation/Number.h"
+#include "platform/runtime/Boxing.h"
+
+namespace ax {
+
+void refreshGraphData(Object& chart, const GraphSource& source) {
+  Ref<Array> points = safeArrayForKey(chart, source.member);
+  const bool isUsable = points && !points->isEmpty() && points->firstObject()->isKindOf(source.expected);
+  chart._accessibilitySetRetainedValueForKey(isUsable ? points : nullptr, source.graphKey);
+  chart._accessibilitySetRetainedValueForKey(nullptr, StorageKeyChildren);
+}
+
+Ref<AccessibilityElement> chartElement(Object& chart, Rect frame, Ref<String> label, Ref<String> value) {
+  Ref<AccessibilityElement> element = AccessibilityElement::initWithAccessibilityContainer(chart);
+  element->setAccessibilityFrameInContainerSpace(frame);
+  messages::setAccessibilityLabel(element, std::move(label));
+  messages::setAccessibilityValue(element, std::move(value));
+  return element;
+}
+
+Ref<String> localizedTextForAxis(std::int64_t axis, std::string_view horizontal, std::string_view vertical) {
+  const std::string_view key = axis == 0 ? horizontal : axis == 1 ? vertical : std::string_view();
+  return key.empty() ? nullptr : accessibilityLocalizedString(key);
+}
+
+Ref<Array> pointValuesForAxis(const Ref<Array>& graphData, std::int64_t axis) {
+  Array::Items values;
+  if (graphData && (axis == 0 || axis == 1)) {
+    values.reserve(graphData->count());
+    for (const Ref<Object>& item : *graphData) {
+      const Point point = unboxPoint(item);
+      values.push_back(number(axis == 0 ? point.x : point.y));
+    }
+  }
+  return array(std::move(values));
+}
+
+}  // namespace ax
