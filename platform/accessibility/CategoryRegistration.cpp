@@ -2,6 +2,7 @@
 
 #include "platform/foundation/String.h"
 #include "platform/runtime/ClassBuilder.h"
+#include "platform/runtime/KeyReading.h"
 
 namespace ax {
 
@@ -44,8 +45,8 @@ void validate(Object& category, const Method&, Ref<Object> manager) {
 
 }  // namespace
 
-void registerCategory(std::string_view name, std::string_view targetClassName,
-                      void (*validations)(ValidationManager&), std::span<const Override> overrides) {
+Class& registerCategory(std::string_view name, std::string_view targetClassName,
+                        void (*validations)(ValidationManager&), std::span<const Override> overrides) {
   const std::string categoryName(name);
   Class& hinge = Class::add("__" + categoryName + "_super", &safeCategoryClass(), nullptr);
   Class& category = Class::add(categoryName, &hinge, nullptr);
@@ -59,6 +60,21 @@ void registerCategory(std::string_view name, std::string_view targetClassName,
   for (const Override& override : overrides) {
     (override.isClassMethod ? meta : category).addMethod(override.method);
   }
+  return category;
+}
+
+const Method* safeCategoryEntry(const Class* category, Receiver object, bool* mismatch,
+                                const std::source_location& place) {
+  const CategoryGraft* graft = category == nullptr ? nullptr : graftOf(*category);
+  const bool isOfTarget =
+      graft != nullptr && object.get() != nullptr && object.get()->isKindOf(*graft->target);
+  const bool isMismatch = object.get() != nullptr && !isOfTarget;
+  if (mismatch != nullptr) *mismatch = isMismatch;
+  if (isMismatch) {
+    reportCastMismatch(*object.get(), category == nullptr ? "unregistered category" : category->name(),
+                       place);
+  }
+  return isOfTarget ? &graft->entry : nullptr;
 }
 
 std::string categoryTargetClassName(Class& category) {

@@ -121,7 +121,7 @@ bool ValidationManager::validateClassHasInstanceVariableWithType(std::string_vie
   const Class* checked = Class::named(className);
   const InstanceVariable* found =
       checked == nullptr ? nullptr : checked->instanceVariable(Selector::find(variable));
-  const std::string is = found != nullptr ? found->type : std::string(checked ? noSuchMember : noSuchClass);
+  const std::string is = found != nullptr ? found->type() : std::string(checked ? noSuchMember : noSuchClass);
   return record({CheckKind::instanceVariable, "", std::string(className), std::string(variable),
                  std::string(type), is, found != nullptr && is == type});
 }
@@ -172,14 +172,13 @@ bool ValidationManager::installCategory(std::string_view name) {
   Class* category = Class::named(name);
   if (category == nullptr) return false;
   Class* target = Class::named(categoryTargetClassName(*category));
-  if (target == nullptr) return false;
+  if (target == nullptr || graftOf(*category) != nullptr) return false;
   if (runsChecks_) {
     currentCategory_ = name;
     performCategoryValidations(*category, Ref<ValidationManager>(this));
     currentCategory_.clear();
   }
-  graftCategory(*category, *target);
-  return true;
+  return graftCategory(*category, *target);
 }
 
 std::vector<ContractCheck> ValidationManager::failedChecks() const {

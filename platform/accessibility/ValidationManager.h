@@ -30,7 +30,7 @@ struct ContractCheck {
 struct InstallationRequest {
   std::string category;
   bool canInteractWithTargetClass;
-  bool installed;  // false when the category or its target is missing
+  bool installed;  // false when the category or its target is missing, or it was before
 };
 
 // Checks host contracts and installs safe categories. There is one for the process; it is used on the thread

@@ -76,6 +76,11 @@ std::int64_t unboxInt(const Ref<Object>& object) {
   return number == nullptr ? 0 : number->int64Value();
 }
 
+std::uint64_t unboxUnsigned(const Ref<Object>& object) {
+  const Number* number = cast<Number>(object.get());
+  return number == nullptr ? 0 : number->unsignedValue();
+}
+
 double unboxDouble(const Ref<Object>& object) {
   const Number* number = cast<Number>(object.get());
   return number == nullptr ? 0 : number->doubleValue();
@@ -99,6 +104,21 @@ Selector unboxSelector(const Ref<Object>& object) {
 const Class* unboxClass(const Ref<Object>& object) {
   return cast<Class>(object.get());
 }
+
+bool isNumber(const Object& object) {
+  return object.isKindOf(Number::staticClass());
+}
+
+template <class T>
+bool isValueOf(const Object& object) {
+  const Value* value = cast<Value>(const_cast<Object*>(&object));
+  return value != nullptr && std::holds_alternative<T>(value->content());
+}
+template bool isValueOf<Point>(const Object&);
+template bool isValueOf<Size>(const Object&);
+template bool isValueOf<Rect>(const Object&);
+template bool isValueOf<Insets>(const Object&);
+template bool isValueOf<Selector>(const Object&);
 
 static const RegisteredClass<Value> registered;
 

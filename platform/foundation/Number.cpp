@@ -3,6 +3,7 @@
 #include <charconv>
 #include <cmath>
 #include <limits>
+#include <utility>
 
 #include "platform/runtime/ClassBuilder.h"
 
@@ -19,6 +20,14 @@ Integer clamped(double value) {
   return static_cast<Integer>(value);
 }
 
+template <class Integer, class Other>
+Integer clampedInteger(Other value) {
+  using Limits = std::numeric_limits<Integer>;
+  if (std::cmp_less(value, Limits::min())) return Limits::min();
+  if (std::cmp_greater(value, Limits::max())) return Limits::max();
+  return static_cast<Integer>(value);
+}
+
 template <class Integer>
 Integer as(const Number::Content& content) {
   return std::visit(
@@ -26,10 +35,14 @@ Integer as(const Number::Content& content) {
         if constexpr (std::is_floating_point_v<decltype(value)>) {
           return clamped<Integer>(value);
         } else {
-          return static_cast<Integer>(value);
+          return clampedInteger<Integer>(std::common_type_t<decltype(value), int>(value));
         }
       },
       content);
+}
+
+bool isWhole(const Number::Content& content) {
+  return std::visit([](auto value) { return !std::is_floating_point_v<decltype(value)>; }, content);
 }
 
 }  // namespace
@@ -62,7 +75,9 @@ double Number::doubleValue() const {
 
 bool Number::isEqual(const Object& other) const {
   const Number* number = cast<Number>(const_cast<Object*>(&other));
-  return number != nullptr && number->doubleValue() == doubleValue();
+  if (number == nullptr || number->doubleValue() != doubleValue()) return false;
+  if (!isWhole(content_) || !isWhole(number->content_)) return true;
+  return number->int64Value() == int64Value() && number->unsignedValue() == unsignedValue();
 }
 
 std::string Number::description() const {

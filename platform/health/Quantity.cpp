@@ -23,11 +23,12 @@ double Quantity::doubleValueForUnit(const Ref<Unit>& unit) const {
 
 bool Quantity::isEqual(const Object& other) const {
   const Quantity* quantity = cast<Quantity>(const_cast<Object*>(&other));
-  return quantity != nullptr && quantity->value_ == value_ && quantity->unit_->isEqual(*unit_);
+  if (quantity == nullptr || quantity->value_ != value_) return false;
+  return unit_ && quantity->unit_ ? unit_->isEqual(*quantity->unit_) : unit_ == quantity->unit_;
 }
 
 std::string Quantity::description() const {
-  return std::to_string(value_) + " " + unit_->text();
+  return std::to_string(value_) + (unit_ ? " " + unit_->text() : "");
 }
 
 static const RegisteredClass<Quantity> registered;

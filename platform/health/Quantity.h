@@ -4,7 +4,7 @@
 
 namespace ax {
 
-// An amount in a unit.
+// An amount in a unit. Without a unit it is an amount of nothing: 0 in every unit.
 class Quantity final : public Object {
  public:
   static Class& staticClass();

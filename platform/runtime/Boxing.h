@@ -55,6 +55,7 @@ constexpr std::string_view encodingOf<void>() {
 
 bool unboxBool(const Ref<Object>& object);
 std::int64_t unboxInt(const Ref<Object>& object);
+std::uint64_t unboxUnsigned(const Ref<Object>& object);
 double unboxDouble(const Ref<Object>& object);
 Point unboxPoint(const Ref<Object>& object);
 Size unboxSize(const Ref<Object>& object);
@@ -63,66 +64,71 @@ Insets unboxInsets(const Ref<Object>& object);
 Selector unboxSelector(const Ref<Object>& object);
 const Class* unboxClass(const Ref<Object>& object);
 
-template <auto Open, char... Code>
-struct BoxedAs {
-  static constexpr char code[] = {Code..., '\0'};
-  static constexpr std::string_view encoding = {code, sizeof...(Code)};
-  static auto open(const Ref<Object>& object) { return Open(object); }
+bool isNumber(const Object& object);
+// Whether the object is the box of such a piece of geometry, or of a selector.
+template <class T>
+bool isValueOf(const Object& object);
+
+template <class T, auto Open, char Code>
+struct BoxedNumber {
+  static constexpr char code[] = {Code, '\0'};
+  static constexpr std::string_view encoding = {code, 1};
+  static T open(const Ref<Object>& object) { return static_cast<T>(Open(object)); }
+  static bool holds(const Object& object) { return isNumber(object); }
 };
 template <>
-struct Boxed<bool> : BoxedAs<unboxBool, 'B'> {};
+struct Boxed<bool> : BoxedNumber<bool, unboxBool, 'B'> {};
 template <>
-struct Boxed<std::int32_t> : BoxedAs<unboxInt, 'i'> {
-  static std::int32_t open(const Ref<Object>& object) { return static_cast<std::int32_t>(unboxInt(object)); }
+struct Boxed<std::int32_t> : BoxedNumber<std::int32_t, unboxInt, 'i'> {};
+template <>
+struct Boxed<std::int64_t> : BoxedNumber<std::int64_t, unboxInt, 'q'> {};
+template <>
+struct Boxed<std::uint32_t> : BoxedNumber<std::uint32_t, unboxUnsigned, 'I'> {};
+template <>
+struct Boxed<std::uint64_t> : BoxedNumber<std::uint64_t, unboxUnsigned, 'Q'> {};
+template <>
+struct Boxed<float> : BoxedNumber<float, unboxDouble, 'f'> {};
+template <>
+struct Boxed<double> : BoxedNumber<double, unboxDouble, 'd'> {};
+
+template <class T, auto Open>
+struct BoxedValue {
+  static T open(const Ref<Object>& object) { return Open(object); }
+  static bool holds(const Object& object) { return isValueOf<T>(object); }
 };
 template <>
-struct Boxed<std::int64_t> : BoxedAs<unboxInt, 'q'> {};
-template <>
-struct Boxed<std::uint32_t> : BoxedAs<unboxInt, 'I'> {
-  static std::uint32_t open(const Ref<Object>& object) {
-    return static_cast<std::uint32_t>(unboxInt(object));
-  }
+struct Boxed<Selector> : BoxedValue<Selector, unboxSelector> {
+  static constexpr std::string_view encoding = ":";
 };
 template <>
-struct Boxed<std::uint64_t> : BoxedAs<unboxInt, 'Q'> {
-  static std::uint64_t open(const Ref<Object>& object) {
-    return static_cast<std::uint64_t>(unboxInt(object));
-  }
-};
-template <>
-struct Boxed<float> : BoxedAs<unboxDouble, 'f'> {
-  static float open(const Ref<Object>& object) { return static_cast<float>(unboxDouble(object)); }
-};
-template <>
-struct Boxed<double> : BoxedAs<unboxDouble, 'd'> {};
-template <>
-struct Boxed<Selector> : BoxedAs<unboxSelector, ':'> {};
-template <>
-struct Boxed<const Class*> : BoxedAs<unboxClass, '#'> {};
-template <>
-struct Boxed<Point> {
+struct Boxed<Point> : BoxedValue<Point, unboxPoint> {
   static constexpr std::string_view encoding = "{Point=dd}";
-  static Point open(const Ref<Object>& object) { return unboxPoint(object); }
 };
 template <>
-struct Boxed<Size> {
+struct Boxed<Size> : BoxedValue<Size, unboxSize> {
   static constexpr std::string_view encoding = "{Size=dd}";
-  static Size open(const Ref<Object>& object) { return unboxSize(object); }
 };
 template <>
-struct Boxed<Rect> {
+struct Boxed<Rect> : BoxedValue<Rect, unboxRect> {
   static constexpr std::string_view encoding = "{Rect={Point=dd}{Size=dd}}";
-  static Rect open(const Ref<Object>& object) { return unboxRect(object); }
 };
 template <>
-struct Boxed<Insets> {
+struct Boxed<Insets> : BoxedValue<Insets, unboxInsets> {
   static constexpr std::string_view encoding = "{Insets=dddd}";
-  static Insets open(const Ref<Object>& object) { return unboxInsets(object); }
+};
+template <>
+struct Boxed<const Class*> {
+  static constexpr std::string_view encoding = "#";
+  static const Class* open(const Ref<Object>& object) { return unboxClass(object); }
+  static bool holds(const Object& object) {
+    return unboxClass(Ref<Object>(const_cast<Object*>(&object))) != nullptr;
+  }
 };
 template <class F>
 struct Boxed<std::function<F>> {
   static constexpr std::string_view encoding = "@?";
   static std::function<F> open(const Ref<Object>&) { return {}; }
+  static bool holds(const Object&) { return false; }
 };
 template <class T>
 struct Boxed<Ref<T>> {

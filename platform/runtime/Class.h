@@ -11,11 +11,12 @@
 
 namespace ax {
 
-// A member that is reached by name: plain functions that read and write it, and its declared type (a class
-// name, or the type code of a scalar).
+// A member that is reached by name: plain functions that read and write it, and name its declared type (a
+// class name, or the type code of a scalar). The type is asked for late, so that classes may hold one
+// another.
 struct InstanceVariable {
   Selector selector = {};
-  std::string type = {};
+  std::string (*type)() = nullptr;
   Ref<Object> (*read)(const Object&) = nullptr;
   bool (*write)(Object&, const Ref<Object>&) = nullptr;  // false: the value is of another kind
 };
@@ -116,6 +117,12 @@ class Class final : public Object {
   std::deque<InstanceVariable> ownedVariables_;
   mutable std::deque<KeyReader> ownedReaders_;
 };
+
+// A class as an object is known by its metaclass, which derives from no class of this name.
+template <>
+inline Class* cast<Class>(Object* object) {
+  return object != nullptr && object->isa().isMetaclass() ? static_cast<Class*>(object) : nullptr;
+}
 
 // The class registered under a name, or nil.
 inline Class* safeClassFromString(std::string_view name) {

@@ -31,6 +31,7 @@ template <class T>
 struct FieldAccess {
   static Ref<Object> read(const T& field) { return box(field); }
   static bool write(T& field, const Ref<Object>& value) {
+    if (value && !Boxed<T>::holds(*value)) return false;
     field = unbox<T>(value);
     return true;
   }
@@ -39,16 +40,18 @@ template <class T>
 struct FieldAccess<Ref<T>> {
   static Ref<Object> read(const Ref<T>& field) { return field; }
   static bool write(Ref<T>& field, const Ref<Object>& value) {
-    field = cast<T>(value);
-    return field || !value;
+    const bool isOfKind = !value || cast<T>(value);
+    if (isOfKind) field = cast<T>(value);
+    return isOfKind;
   }
 };
 template <class T>
 struct FieldAccess<Weak<T>> {
   static Ref<Object> read(const Weak<T>& field) { return field.lock(); }
   static bool write(Weak<T>& field, const Ref<Object>& value) {
-    field = cast<T>(value);
-    return field || !value;
+    const bool isOfKind = !value || cast<T>(value);
+    if (isOfKind) field = cast<T>(value);
+    return isOfKind;
   }
 };
 
@@ -168,7 +171,7 @@ class ClassBuilder {
   ClassBuilder& instanceVariable(std::string_view name) {
     using Type = typename registration::MemberType<decltype(Member)>::type;
     class_.addInstanceVariable({.selector = Selector::intern(name),
-                                .type = registration::Declared<Type>::type(),
+                                .type = &registration::Declared<Type>::type,
                                 .read = &registration::Variable<T, Member>::read,
                                 .write = &registration::Variable<T, Member>::write});
     return *this;

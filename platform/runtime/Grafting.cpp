@@ -2,7 +2,7 @@
 
 #include <algorithm>
 #include <array>
-#include <deque>
+#include <map>
 
 namespace ax {
 
@@ -25,18 +25,33 @@ void graftTable(const Class& from, Class& onto, CategoryGraft& graft) {
   });
 }
 
+std::map<const Class*, CategoryGraft>& grafts() {
+  static auto* const all = new std::map<const Class*, CategoryGraft>;
+  return *all;
+}
+
 const Method& replacedBy(const Method& grafted) {
   return grafted.former != nullptr ? *grafted.former : grafted.owner->lookUpInSuperclass(grafted.selector);
 }
 
 }  // namespace
 
-void graftCategory(Class& category, Class& target) {
-  static auto* const grafts = new std::deque<CategoryGraft>;
-  CategoryGraft& graft = grafts->emplace_back();
+bool graftCategory(Class& category, Class& target) {
+  const auto [place, isNew] = grafts().try_emplace(&category);
+  if (!isNew) return false;
+  CategoryGraft& graft = place->second;
   graft.category = &category;
+  graft.target = &target;
+  graft.entry.owner = &target;
+  graft.entry.graft = &graft;
   graftTable(category, target, graft);
   graftTable(category.metaclass(), target.metaclass(), graft);
+  return true;
+}
+
+const CategoryGraft* graftOf(const Class& category) {
+  const auto found = grafts().find(&category);
+  return found == grafts().end() ? nullptr : &found->second;
 }
 
 const Method& superMethod(const Method& current, Selector selector) {

@@ -8,6 +8,8 @@ namespace ax {
 namespace {
 
 const char weakLinkKey = 0;
+// Handles that a destructor makes of its own object come and go without ending it once more.
+constexpr std::uint32_t ending = 1u << 31;
 
 }  // namespace
 
@@ -54,6 +56,7 @@ void Object::end() const {
   if (const Object* link = attached(&weakLinkKey)) {
     const_cast<WeakLink*>(static_cast<const WeakLink*>(link))->target = nullptr;
   }
+  count_ = ending;
   delete this;
 }
 

@@ -22,7 +22,9 @@ Ref<AccessibilityElement> AccessibilityElement::initWithAccessibilityContainer(R
 }
 
 void AccessibilityElement::setAccessibilityFrameInContainerSpace(Rect frame) {
-  AccessibilityProperties::of(*this).frameInContainerSpace = frame;
+  AccessibilityProperties& properties = AccessibilityProperties::of(*this);
+  properties.frameInContainerSpace = frame;
+  properties.frame.reset();
 }
 
 std::optional<Rect> AccessibilityElement::accessibilityFrameInContainerSpace() const {

@@ -38,7 +38,7 @@ class AccessibilityProperties final : public Object {
   Weak<Object> container;
   std::optional<Traits> traits;
   std::optional<bool> isElement;
-  std::optional<Rect> frame;  // in screen space
+  std::optional<Rect> frame;  // in screen space; setting one of the two takes the other away
   std::optional<Rect> frameInContainerSpace;
   std::optional<Point> activationPoint;  // in screen space
   std::optional<Insets> visibleContentInset;

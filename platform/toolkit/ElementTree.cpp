@@ -24,6 +24,11 @@ void collectDescendants(Object& parent, const ElementTest& test, Array::Items& f
   }
 }
 
+bool isMarkedVisible(const Object& object) {
+  const AccessibilityProperties* properties = AccessibilityProperties::find(object);
+  return properties != nullptr && properties->isMarkedVisible && properties->overridesInvisibility;
+}
+
 bool isDrawn(Object& object) {
   if (const View* view = cast<View>(&object)) return !view->isHidden() && view->alpha() > 0;
   if (const Layer* layer = cast<Layer>(&object)) return !layer->isHidden() && layer->opacity() > 0;
@@ -71,10 +76,9 @@ Ref<Array> _accessibilityFindUnsortedDescendantsPassingTest(Receiver receiver, c
 
 bool _accessibilityViewIsVisible(Receiver receiver) {
   if (receiver.get() == nullptr) return false;
-  const AccessibilityProperties* properties = AccessibilityProperties::find(*receiver.get());
-  if (properties != nullptr && properties->isMarkedVisible && properties->overridesInvisibility) return true;
-  return !_accessibilityFindAncestor(
-      receiver, [](Object& object) { return !isDrawn(object); }, true);
+  const Ref<Object> deciding = _accessibilityFindAncestor(
+      receiver, [](Object& object) { return isMarkedVisible(object) || !isDrawn(object); }, true);
+  return !deciding || isMarkedVisible(*deciding);
 }
 
 std::vector<Ref<Object>> drawnChildren(Object& parent) {
@@ -124,8 +128,8 @@ Ref<Array> sortedByGeometry(const Array& elements) {
                    [](const Placed& a, const Placed& b) { return a.frame.y < b.frame.y; });
   const bool rightToLeft = formatting::currentLanguageIsRightToLeft();
   for (auto row = placed.begin(); row != placed.end();) {
-    const auto rowEnd =
-        std::find_if(row, placed.end(), [&](const Placed& p) { return !standInOneRow(row->frame, p.frame); });
+    const auto rowEnd = std::find_if(row + 1, placed.end(),
+                                     [&](const Placed& p) { return !standInOneRow(row->frame, p.frame); });
     std::stable_sort(row, rowEnd, [&](const Placed& a, const Placed& b) {
       return beginsBefore(a.frame, b.frame, rightToLeft);
     });

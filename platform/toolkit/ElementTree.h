@@ -23,8 +23,8 @@ Ref<Array> _accessibilityFindSubviewDescendantsPassingTest(Receiver receiver, co
 // sublayers.
 Ref<Array> _accessibilityFindUnsortedDescendantsPassingTest(Receiver receiver, const ElementTest& test);
 
-// Not hidden and not transparent, up to the root, unless it was marked as visible and as overriding
-// invisibility.
+// Not hidden and not transparent, up to the root or to the first that was marked as visible and as
+// overriding invisibility.
 bool _accessibilityViewIsVisible(Receiver receiver);
 
 // The subviews and the layers drawn in a view, in the order in which the host added them, subviews first.

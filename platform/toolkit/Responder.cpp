@@ -9,8 +9,10 @@ namespace {
 
 using Properties = AccessibilityProperties;
 
-const Properties::Blocks* blocksIn(const Properties* properties) {
-  return properties == nullptr ? nullptr : properties->blocks.get();
+// A copy of the block, which may put another in its own place while it runs.
+template <class Block>
+Block blockIn(const Properties* properties, Block Properties::Blocks::*block) {
+  return properties == nullptr || !properties->blocks ? Block() : (*properties->blocks).*block;
 }
 
 void setIsElement(Object& self, bool isElement) {
@@ -29,7 +31,9 @@ void setTraits(Object& self, Traits traits) {
   Properties::of(self).traits = traits;
 }
 void setFrame(Object& self, Rect frame) {
-  Properties::of(self).frame = frame;
+  Properties& properties = Properties::of(self);
+  properties.frame = frame;
+  properties.frameInContainerSpace.reset();
 }
 void setElements(Object& self, Ref<Array> elements) {
   Properties::of(self).elements = std::move(elements);
@@ -115,21 +119,21 @@ Class& Responder::staticClass() {
 bool Responder::isAccessibilityElement() {
   const Properties* properties = Properties::find(*this);
   if (properties == nullptr) return defaultIsElement();
-  if (properties->blocks && properties->blocks->isElement) return properties->blocks->isElement();
+  if (const auto block = blockIn(properties, &Properties::Blocks::isElement)) return block();
   return properties->isElement ? *properties->isElement : defaultIsElement();
 }
 
 Ref<String> Responder::accessibilityLabel() {
   const Properties* properties = Properties::find(*this);
   if (properties == nullptr) return defaultLabel();
-  if (properties->blocks && properties->blocks->label) return properties->blocks->label();
+  if (const auto block = blockIn(properties, &Properties::Blocks::label)) return block();
   return properties->label ? properties->label : defaultLabel();
 }
 
 Ref<String> Responder::accessibilityValue() {
   const Properties* properties = Properties::find(*this);
   if (properties == nullptr) return defaultValue();
-  if (properties->blocks && properties->blocks->value) return properties->blocks->value();
+  if (const auto block = blockIn(properties, &Properties::Blocks::value)) return block();
   return properties->value ? properties->value : defaultValue();
 }
 
@@ -178,8 +182,8 @@ Ref<String> Responder::accessibilityUserDefinedLabel() {
 }
 
 bool Responder::accessibilityActivate() {
-  const Properties::Blocks* blocks = blocksIn(Properties::find(*this));
-  return blocks != nullptr && blocks->activate ? blocks->activate() : activateByDefault();
+  const auto block = blockIn(Properties::find(*this), &Properties::Blocks::activate);
+  return block ? block() : activateByDefault();
 }
 
 static const RegisteredClass<Responder> registered;
