@@ -1,0 +1,181 @@
+#include "platform/runtime/Grafting.h"
+
+#include <gtest/gtest.h>
+
+#include "platform/accessibility/CategoryRegistration.h"
+#include "platform/foundation/String.h"
+#include "platform/runtime/ClassBuilder.h"
+#include "platform/runtime/KeyReading.h"
+
+namespace ax {
+
+namespace {
+
+using Text = Ref<String>;
+
+const Message<Text()> word{"graftingTestWord"};
+const Message<Text()> inherited{"graftingTestInherited"};
+const Message<Text()> classWord{"graftingTestClassWord"};
+const Message<Text()> added{"_axGraftingTestAdded"};
+const Message<Text()> both{"graftingTestBoth"};
+const Message<std::int64_t(std::int64_t)> countDown{"graftingTestCountDown:"};
+
+Text operator+(const Text& left, const char* right) {
+  return string((left ? left->text() : "nil") + right);
+}
+
+// One pair of classes per test, told apart by a number, since a graft is for good.
+template <int N>
+class Base : public Object {
+ public:
+  static Class& staticClass() {
+    static Class& result = ClassBuilder<Base>("GraftingTest.Base" + std::to_string(N), Object::staticClass())
+                               .template method<&Base::word>("graftingTestWord")
+                               .template method<&Base::inherited>("graftingTestInherited")
+                               .template method<&Base::countDown>("graftingTestCountDown:")
+                               .template classMethod<&Base::classWord>("graftingTestClassWord")
+                               .build();
+    return result;
+  }
+  Text word() { return string("base"); }
+  Text inherited() { return string("base"); }
+  static Text classWord() { return string("Base"); }
+  std::int64_t countDown(std::int64_t from) { return from <= 0 ? 0 : ax::countDown(*this, from - 1) + 1; }
+};
+
+template <int N>
+class Derived : public Base<N> {
+ public:
+  static Class& staticClass() {
+    static Class& result =
+        ClassBuilder<Derived>("GraftingTest.Derived" + std::to_string(N), Base<N>::staticClass())
+            .template method<&Derived::word>("graftingTestWord")
+            .build();
+    return result;
+  }
+  // What host code does: it calls its own superclass's method through the runtime.
+  Text word() {
+    return ax::word.call(*this, Base<N>::staticClass().lookUp(ax::word.selector())) + ">derived";
+  }
+};
+
+template <const char* Mark>
+class Marking : public SafeCategory<Marking<Mark>> {
+ public:
+  using SafeCategory<Marking>::SafeCategory;
+  static void _accessibilityPerformValidations(ValidationManager&) {}
+  Text word() { return this->super(ax::word) + Mark; }
+  Text inherited() { return this->super(ax::inherited) + Mark; }
+  Text classWord() { return this->super(ax::classWord) + Mark; }
+  Text added() { return this->super(ax::added) + Mark; }
+  // Asks super for another message than the one it answers.
+  Text both() { return this->super(ax::word) + "&" + this->super(ax::inherited)->text().c_str(); }
+  std::int64_t countDown(std::int64_t from) { return this->super(ax::countDown, from) + 100; }
+};
+
+constexpr char onBase[] = "+B";
+constexpr char onDerived[] = "+D";
+constexpr char second[] = "+2";
+
+template <const char* Mark>
+Class& category(int number, const std::string& target) {
+  using C = Marking<Mark>;
+  const std::array all = {
+      overrides<&C::word>(word),           overrides<&C::inherited>(inherited),
+      overrides<&C::added>(added),         overrides<&C::both>(both),
+      overrides<&C::countDown>(countDown), overridesClassMethod<&C::classWord>(classWord)};
+  return registerCategory("GraftingTest" + std::string(Mark) + std::to_string(number), target,
+                          &C::_accessibilityPerformValidations, all);
+}
+
+template <int N>
+void expectBothCategoriesTakePart() {
+  const Ref<Base<N>> base = make<Base<N>>();
+  const Ref<Base<N>> derived = make<Derived<N>>();
+  EXPECT_EQ(word(base)->text(), "base+B");
+  EXPECT_EQ(word(derived)->text(), "base+B>derived+D");
+  EXPECT_EQ(inherited(base)->text(), "base+B");
+  EXPECT_EQ(inherited(derived)->text(), "base+B+D") << "a method that the target only inherits";
+  EXPECT_EQ(added(derived)->text(), "nil+B+D") << "a method of the categories alone";
+  EXPECT_EQ(both(derived)->text(), "base+B>derived&base+B");
+  EXPECT_EQ(classWord(Base<N>::staticClass())->text(), "Base+B");
+  EXPECT_EQ(classWord(Derived<N>::staticClass())->text(), "Base+B+D");
+  EXPECT_EQ(derived->safeValueForKey("graftingTestWord"_key)->description(), "base+B>derived+D");
+  EXPECT_EQ(countDown(base, 3), 403) << "the host's own recursion passes the override each time, no more";
+}
+
+TEST(Grafting, resolvesSuperWhenTheSuperclassComesFirst) {
+  Class& base = Base<1>::staticClass();
+  Class& derived = Derived<1>::staticClass();
+  graftCategory(category<onBase>(1, base.name()), base);
+  graftCategory(category<onDerived>(1, derived.name()), derived);
+  expectBothCategoriesTakePart<1>();
+}
+
+TEST(Grafting, resolvesSuperWhenTheSubclassComesFirst) {
+  Class& base = Base<2>::staticClass();
+  Class& derived = Derived<2>::staticClass();
+  const Ref<Derived<2>> asked = make<Derived<2>>();
+  EXPECT_EQ(word(asked)->text(), "base>derived");
+  graftCategory(category<onDerived>(2, derived.name()), derived);
+  EXPECT_EQ(inherited(asked)->text(), "base+D");
+  EXPECT_EQ(classWord(derived)->text(), "Base+D");
+  EXPECT_EQ(classWord(base)->text(), "Base");
+  graftCategory(category<onBase>(2, base.name()), base);
+  expectBothCategoriesTakePart<2>();
+}
+
+TEST(Grafting, stacksTwoCategoriesOnOneClass) {
+  Class& base = Base<3>::staticClass();
+  EXPECT_TRUE(graftCategory(category<onBase>(3, base.name()), base));
+  Class& upper = category<second>(3, base.name());
+  EXPECT_TRUE(graftCategory(upper, base));
+  EXPECT_FALSE(graftCategory(upper, base)) << "a category is grafted once";
+  EXPECT_EQ(word(make<Derived<3>>())->text(), "base+B+2>derived");
+  EXPECT_EQ(inherited(make<Derived<3>>())->text(), "base+B+2");
+  EXPECT_EQ(added(make<Base<3>>())->text(), "nil+B+2");
+  EXPECT_EQ(both(make<Base<3>>())->text(), "base+B&base+B");
+  EXPECT_EQ(classWord(Derived<3>::staticClass())->text(), "Base+B+2");
+}
+
+TEST(Grafting, leavesTheCategorysOwnMethodsBehind) {
+  Class& base = Base<4>::staticClass();
+  graftCategory(category<onBase>(4, base.name()), base);
+  EXPECT_EQ(base.safeValueForKey("safeCategoryTargetClassName"), nullptr);
+  EXPECT_EQ(base.safeValueForKey("safeCategoryBaseClass"), nullptr);
+  Class& category = *Class::named("GraftingTest+B4");
+  EXPECT_EQ(category.safeValueForKey("safeCategoryTargetClassName")->description(), base.name());
+  EXPECT_EQ(cast<Class>(category.safeValueForKey("safeCategoryBaseClass")).get(),
+            Class::named("SafeCategory"));
+  EXPECT_EQ(category.superclass()->name(), "__GraftingTest+B4_super");
+}
+
+class Viewed : public SafeCategory<Viewed> {
+ public:
+  using SafeCategory::SafeCategory;
+  static void _accessibilityPerformValidations(ValidationManager&) {}
+  Text word() { return super(ax::word) + "+V"; }
+};
+const CategoryRegistration<Viewed> viewed{
+    "GraftingTestViewed", "GraftingTest.Derived5", {overrides<&Viewed::word>(word)}};
+
+TEST(Grafting, showsAnObjectAsACategory) {
+  const Ref<Object> derived = make<Derived<5>>();
+  const std::size_t before = castMismatches();
+  testing::internal::CaptureStderr();
+  EXPECT_FALSE(castAsSafeCategory<Viewed>(derived)) << "not grafted yet";
+  graftCategory(*viewed.category, Derived<5>::staticClass());
+  bool mismatch = true;
+  EXPECT_EQ(castAsSafeCategory<Viewed>(derived, &mismatch)->word()->text(), "base>derived+V");
+  EXPECT_FALSE(mismatch);
+  EXPECT_FALSE(castAsSafeCategory<Viewed>(make<Base<5>>(), &mismatch));
+  EXPECT_TRUE(mismatch);
+  EXPECT_FALSE(castAsSafeCategory<Viewed>(nullptr, &mismatch));
+  EXPECT_FALSE(mismatch);
+  testing::internal::GetCapturedStderr();
+  EXPECT_EQ(castMismatches(), before + 2);
+}
+
+}  // namespace
+
+}  // namespace ax
