@@ -1,0 +1,84 @@
+#include "reader/transcript/SpokenTime.h"
+
+#include <cmath>
+
+#include "platform/formatting/Durations.h"
+#include "platform/formatting/Numbers.h"
+#include "reader/ReaderStrings.h"
+
+namespace ax::reader {
+
+namespace {
+
+constexpr double secondsPerHour = 3600;
+constexpr std::string_view directionMarks[] = {"\u200e", "\u200f", "\u061c"};
+
+std::string withoutDirectionMarks(std::string text) {
+  for (const std::string_view mark : directionMarks) {
+    for (std::size_t at; (at = text.find(mark)) != std::string::npos;) text.erase(at, mark.size());
+  }
+  return text;
+}
+
+std::string_view trimmed(std::string_view text) {
+  const std::size_t first = text.find_first_not_of(" \t\n");
+  if (first == std::string_view::npos) return {};
+  return text.substr(first, text.find_last_not_of(" \t\n") - first + 1);
+}
+
+// Fields after the first are minutes or seconds, and so below 60; only the last may have a fraction.
+bool isField(double value, bool isFirst, bool isLast) {
+  return std::isfinite(value) && value >= 0 && (isFirst || value < 60) &&
+         (isLast || value == std::floor(value));
+}
+
+// Minutes are not gathered into hours: that is how a pace is told.
+std::string minutesAndSeconds(double seconds) {
+  if (seconds < secondsPerHour) return formatting::spokenDuration(seconds);
+  const auto whole = std::llround(std::min(seconds, 9e15));
+  std::vector<std::string> parts = {readerText("duration.minutes", {std::int64_t(whole / 60)})};
+  if (whole % 60 != 0) parts.push_back(readerText("duration.seconds", {std::int64_t(whole % 60)}));
+  return joined(parts);
+}
+
+std::optional<std::string> spokenTime(std::string_view key, std::string_view text) {
+  const bool isMinutesAndSeconds = key == DurationTimeMMSS.name();
+  if (!isMinutesAndSeconds && key != DurationTimeHHMMSS.name()) return std::nullopt;
+  const std::optional<double> seconds = secondsFromText(text);
+  if (!seconds) return std::nullopt;
+  return isMinutesAndSeconds ? minutesAndSeconds(*seconds) : formatting::spokenDuration(*seconds);
+}
+
+}  // namespace
+
+std::optional<double> secondsFromText(std::string_view text) {
+  const std::string cleaned = withoutDirectionMarks(std::string(text));
+  std::string_view rest = cleaned;
+  double total = 0;
+  for (int fields = 1; fields <= 3; ++fields) {
+    const std::size_t end = rest.find(':');
+    const bool isLast = end == std::string_view::npos;
+    const std::optional<double> field = formatting::parseNumber(trimmed(rest.substr(0, end)));
+    if (!field || !isField(*field, fields == 1, isLast)) return std::nullopt;
+    total = total * 60 + *field;
+    if (isLast) return total;
+    rest.remove_prefix(end + 1);
+  }
+  return std::nullopt;
+}
+
+std::string withSpokenTimes(const AttributedText& text) {
+  std::string spoken;
+  std::size_t done = 0;
+  for (const AttributeRange& attribute : text.attributes) {
+    const auto [start, length] = attribute.range;
+    if (start < done || start + length > text.text.size()) continue;
+    const auto words = spokenTime(attribute.key, std::string_view(text.text).substr(start, length));
+    if (!words) continue;
+    spoken += text.text.substr(done, start - done) + *words;
+    done = start + length;
+  }
+  return spoken + text.text.substr(done);
+}
+
+}  // namespace ax::reader

@@ -1,0 +1,18 @@
+#pragma once
+
+#include <nlohmann/json.hpp>
+
+#include "reader/snapshot/Snapshot.h"
+
+namespace ax::reader {
+
+// The top nodes with their children inside them, in reading order. What a node does not have is null; empty
+// lists and what has no meaning for the node are left out.
+nlohmann::ordered_json treeAsJson(const Snapshot& snapshot);
+
+// A text, or null; one with attributes as {"string", "attributes": [{"key", "range"}]}.
+nlohmann::ordered_json textAsJson(const std::optional<AttributedText>& text);
+// [x, y, width, height]
+nlohmann::ordered_json rectAsJson(const Rect& rect);
+
+}  // namespace ax::reader
