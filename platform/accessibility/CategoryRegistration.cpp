@@ -2,7 +2,6 @@
 
 #include "platform/foundation/String.h"
 #include "platform/runtime/ClassBuilder.h"
-#include "platform/runtime/KeyReading.h"
 
 namespace ax {
 
@@ -63,8 +62,7 @@ Class& registerCategory(std::string_view name, std::string_view targetClassName,
   return category;
 }
 
-const Method* safeCategoryEntry(const Class* category, Receiver object, bool* mismatch,
-                                const std::source_location& place) {
+const Method* safeCategoryEntry(const Class* category, Receiver object, bool* mismatch, SourcePlace place) {
   const CategoryGraft* graft = category == nullptr ? nullptr : graftOf(*category);
   const bool isOfTarget =
       graft != nullptr && object.get() != nullptr && object.get()->isKindOf(*graft->target);

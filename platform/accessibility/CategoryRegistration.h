@@ -2,10 +2,10 @@
 
 #include <initializer_list>
 #include <optional>
-#include <source_location>
 #include <span>
 
 #include "platform/accessibility/ValidationManager.h"
+#include "platform/runtime/KeyReading.h"
 #include "platform/runtime/SafeCategory.h"
 
 namespace ax {
@@ -33,13 +33,12 @@ struct CategoryRegistration {
 
 // The entry through which an object is seen as a category, or null, reported as a cast mismatch, when it is
 // no instance of the class onto which that category was grafted.
-const Method* safeCategoryEntry(const Class* category, Receiver object, bool* mismatch,
-                                const std::source_location& place);
+const Method* safeCategoryEntry(const Class* category, Receiver object, bool* mismatch, SourcePlace place);
 
 // The object seen through a category's own methods; the view must not outlive it.
 template <class C>
 std::optional<C> castAsSafeCategory(Receiver object, bool* mismatch = nullptr,
-                                    const std::source_location& place = std::source_location::current()) {
+                                    SourcePlace place = SourcePlace::current()) {
   const Method* entry = safeCategoryEntry(CategoryRegistration<C>::category, object, mismatch, place);
   return entry == nullptr ? std::nullopt : std::optional<C>(std::in_place, *object.get(), *entry);
 }
