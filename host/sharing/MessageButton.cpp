@@ -1,0 +1,16 @@
+#include "host/sharing/MessageButton.h"
+
+#include "host/core/HostStrings.h"
+
+namespace ax::host {
+
+void addMessageButton(ViewController& controller) {
+  if (controller.navigationItem()->rightBarButtonItems()) return;
+  const Ref<BarButtonItem> button = make<BarButtonItem>();
+  button->setTitle(HostStrings::textForKey(string("friends.messages.short")));
+  button->setTarget(Ref<Object>(&controller));
+  button->setAction(selectorFromString("_sendMessageButtonTapped:"));
+  controller.navigationItem()->setRightBarButtonItem(button);
+}
+
+}  // namespace ax::host
