@@ -7,6 +7,9 @@ namespace ax::host {
 
 namespace {
 
+const Message<void(Ref<Object>, Ref<Object>, Ref<Object>, bool)> setFriend{
+    "setFriend:snapshot:formattingManager:animated:"};
+
 Ref<String> nameLine(const Friend& shown) {
   return shown.hasNews() && shown.name() ? string("\u2022 " + shown.name()->text()) : shown.name();
 }
@@ -22,6 +25,8 @@ Class& CHFriendListTableViewCell::staticClass() {
   using T = CHFriendListTableViewCell;
   static Class& result =
       ClassBuilder<T>("CHFriendListTableViewCell", TableViewCell::staticClass())
+          .instanceVariable<&T::friend_>("_friend")
+          .instanceVariable<&T::snapshot_>("_snapshot")
           .property<&T::detailLineOneLabel, &T::setDetailLineOneLabel>("detailLineOneLabel")
           .property<&T::detailLineTwoLabel, &T::setDetailLineTwoLabel>("detailLineTwoLabel")
           .property<&T::competitionBadgeView, &T::setCompetitionBadgeView>("competitionBadgeView")
@@ -39,6 +44,9 @@ void CHFriendListTableViewCell::setCompetitionBadgeView(Ref<View> view) {
 void CHFriendListTableViewCell::setFriendSnapshotFormattingManagerAnimated(Ref<Friend> shown,
                                                                            Ref<FriendSnapshot> snapshot,
                                                                            Ref<Object>, bool) {
+  friend_ = shown;
+  snapshot_ = snapshot;
+  isShown_ = true;
   if (!textLabel()) setTextLabel(make<Label>());
   textLabel()->setText(shown ? nameLine(*shown) : nullptr);
   showLine(detailLineOneLabel_, snapshot ? snapshot->lineOne() : nullptr);
@@ -50,6 +58,7 @@ void CHFriendListTableViewCell::setFriendSnapshotFormattingManagerAnimated(Ref<F
 }
 
 void CHFriendListTableViewCell::layoutSubviews() {
+  if (friend_ && !isShown_) setFriend(*this, friend_, snapshot_, nullptr, false);
   addUnplaced(*contentView(), {detailLineOneLabel_, detailLineTwoLabel_, competitionBadgeView_});
 }
 

@@ -23,9 +23,13 @@ class CHFriendListTableViewCell : public TableViewCell {
   // Shows a friend. A bullet before the name says that there is news.
   void setFriendSnapshotFormattingManagerAnimated(Ref<Friend> shown, Ref<FriendSnapshot> snapshot,
                                                   Ref<Object> formattingManager, bool animated);
+  // Shows the friend that the row was given as a member, if it has not yet.
   void layoutSubviews() override;
 
  private:
+  Ref<Friend> friend_;
+  Ref<FriendSnapshot> snapshot_;
+  bool isShown_ = false;
   Ref<Label> detailLineOneLabel_;
   Ref<Label> detailLineTwoLabel_;
   Ref<View> competitionBadgeView_;
