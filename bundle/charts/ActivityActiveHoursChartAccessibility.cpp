@@ -1,0 +1,82 @@
+#include "bundle/core/Category.h"
+#include "platform/foundation/Calendar.h"
+#include "platform/foundation/Formatters.h"
+#include "platform/toolkit/DataSeriesMessages.h"
+
+namespace ax {
+
+namespace {
+
+// The hour that a clock on the wall shows at a moment, counted from the start of the day that holds `day`.
+double wallClockHours(const Date& day, const Date& moment) {
+  const Ref<Calendar> calendar = Calendar::currentCalendar();
+  const Ref<Date> dayStart = calendar->startOfDayForDate(day);
+  const TimeInterval clocksMoved = calendar->daylightSavingTimeOffsetForDate(moment) -
+                                   calendar->daylightSavingTimeOffsetForDate(*dayStart);
+  return (clocksMoved + moment.timeIntervalSinceDate(*dayStart)) / 3600;
+}
+
+// The active hours of a day, told in eight slices.
+class ActivityActiveHoursChartAccessibility : public SafeCategory<ActivityActiveHoursChartAccessibility> {
+ public:
+  using SafeCategory::SafeCategory;
+
+  static void _accessibilityPerformValidations(Manager& manager) {
+    constexpr auto target = "ActivityActiveHoursChart";
+    manager.validateClassHasInstanceVariableWithType(target, "_dataPoints", "Array");
+    manager.validateClassHasInstanceVariableWithType(target, "_barSeries", "VLUIChartUniformBarSeries");
+    manager.validateClassHasInstanceVariableWithType("VLUIChartUniformBarSeries", "_minDate", "Date");
+    manager.validateClassHasInstanceMethodWithFullSignature("VLUIChartPointNumeric", "xValue", {"@"});
+    manager.validateClassHasInstanceMethodWithFullSignature("VLUIChartPointNumeric", "yValue", {"@"});
+  }
+
+  bool _accessibilityShouldUseSlices() { return true; }
+  std::uint64_t _accessibilityNumberOfSlices() { return 8; }
+  std::uint64_t _accessibilityHoursPerSlice() {
+    const std::uint64_t slices = messages::_accessibilityNumberOfSlices(self);
+    return slices == 0 ? 0 : 24 / slices;
+  }
+  double _accessibilityTimeIntervalPerSlice() {
+    return static_cast<double>(messages::_accessibilityHoursPerSlice(self)) * 3600;
+  }
+
+  Ref<String> _accessibilityQuantityForSliceAtIndex(std::uint64_t index) {
+    const Ref<Array> points = safeArrayForKey(self, "_dataPoints"_key);
+    const auto slice = static_cast<double>(index);
+    const double start = static_cast<double>(messages::_accessibilityHoursPerSlice(self)) * slice;
+    const double end = static_cast<double>(messages::_accessibilityHoursPerSlice(self)) * (slice + 1);
+    const Ref<Date> day =
+        castAsClass<Date>(safeValueForKey(self.safeValueForKey("_barSeries"_key), "_minDate"_key));
+    const double sum = day && points ? sumOfHours(*points, *day, start, end) : 0;
+    return timeStringForType(3, static_cast<float>(sum));
+  }
+
+ private:
+  // The end is excluded.
+  static double sumOfHours(const Array& points, const Date& day, double start, double end) {
+    double sum = 0;
+    for (const Ref<Object>& point : points) {
+      const Ref<Date> moment = castAsClass<Date>(safeValueForKey(point, "xValue"_key));
+      const Ref<Number> amount = castAsClass<Number>(safeValueForKey(point, "yValue"_key));
+      if (!moment || !amount) continue;
+      const double hours = wallClockHours(day, *moment);
+      if (hours >= start && hours < end) sum += amount->doubleValue();
+    }
+    return sum;
+  }
+};
+
+using C = ActivityActiveHoursChartAccessibility;
+
+const CategoryRegistration<C> registration{
+    "ActivityActiveHoursChartAccessibility",
+    "ActivityActiveHoursChart",
+    {overrides<&C::_accessibilityShouldUseSlices>(messages::_accessibilityShouldUseSlices),
+     overrides<&C::_accessibilityNumberOfSlices>(messages::_accessibilityNumberOfSlices),
+     overrides<&C::_accessibilityHoursPerSlice>(messages::_accessibilityHoursPerSlice),
+     overrides<&C::_accessibilityTimeIntervalPerSlice>(messages::_accessibilityTimeIntervalPerSlice),
+     overrides<&C::_accessibilityQuantityForSliceAtIndex>(messages::_accessibilityQuantityForSliceAtIndex)}};
+
+}  // namespace
+
+}  // namespace ax

@@ -1,0 +1,76 @@
+#include <cmath>
+
+#include "bundle/core/Category.h"
+#include "bundle/shared/LocalizedString.h"
+#include "platform/foundation/Formatters.h"
+#include "platform/health/Unit.h"
+#include "platform/runtime/Boxing.h"
+#include "platform/toolkit/DataSeriesMessages.h"
+
+namespace ax {
+
+namespace {
+
+constexpr std::uint64_t sliceCount = 8;
+constexpr TimeInterval pointLength = 900;
+
+// The day's energy or minutes, a quarter of an hour per point, told in eight slices.
+class ActivityQuantityChartAccessibility : public SafeCategory<ActivityQuantityChartAccessibility> {
+ public:
+  using SafeCategory::SafeCategory;
+
+  static void _accessibilityPerformValidations(Manager& manager) {
+    constexpr auto target = "ActivityQuantityChart";
+    manager.validateClassHasInstanceVariableWithType(target, "_dataPoints", "Array");
+    manager.validateClassHasInstanceVariableWithType(target, "_preferredUnit", "Unit");
+  }
+
+  bool _accessibilityShouldUseSlices() { return true; }
+  std::uint64_t _accessibilityNumberOfSlices() { return sliceCount; }
+  double _accessibilityTimeIntervalPerSlice() {
+    return static_cast<double>(pointsPerSlice(dataPoints())) * pointLength;
+  }
+
+  Ref<String> _accessibilityQuantityForSliceAtIndex(std::uint64_t index) {
+    const std::int64_t quantity = number(std::round(sumOfSlice(index)))->int64Value();
+    const Ref<Object> unit = self.safeValueForKey("_preferredUnit"_key);
+    if (unit && unit->isEqual(*Unit::minuteUnit())) {
+      return durationStringForDuration(static_cast<double>(quantity) * 60);
+    }
+    const std::string_view format = quantity == 0 ? "calories.format.zero" : "calories.format";
+    return stringWithFormat(accessibilityLocalizedString(format), {formatInteger(quantity)});
+  }
+
+ private:
+  Ref<Array> dataPoints() { return castAsClass<Array>(self.safeValueForKey("_dataPoints"_key)); }
+
+  static std::uint64_t pointsPerSlice(const Ref<Array>& points) {
+    return points ? points->count() / sliceCount : 0;
+  }
+
+  // Beyond the last slice there is nothing.
+  double sumOfSlice(std::uint64_t index) {
+    const Ref<Array> points = dataPoints();
+    const std::uint64_t perSlice = pointsPerSlice(points);
+    double sum = 0;
+    if (index >= sliceCount) return sum;
+    for (std::uint64_t i = perSlice * index; i < perSlice * (index + 1); ++i) {
+      sum += unboxDouble(safeValueForKey(points->at(i), "yValue"_key));
+    }
+    return sum;
+  }
+};
+
+using C = ActivityQuantityChartAccessibility;
+
+const CategoryRegistration<C> registration{
+    "ActivityQuantityChartAccessibility",
+    "ActivityQuantityChart",
+    {overrides<&C::_accessibilityShouldUseSlices>(messages::_accessibilityShouldUseSlices),
+     overrides<&C::_accessibilityNumberOfSlices>(messages::_accessibilityNumberOfSlices),
+     overrides<&C::_accessibilityTimeIntervalPerSlice>(messages::_accessibilityTimeIntervalPerSlice),
+     overrides<&C::_accessibilityQuantityForSliceAtIndex>(messages::_accessibilityQuantityForSliceAtIndex)}};
+
+}  // namespace
+
+}  // namespace ax
