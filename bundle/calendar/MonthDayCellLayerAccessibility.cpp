@@ -1,0 +1,78 @@
+#include "bundle/core/Category.h"
+#include "bundle/shared/DayRings.h"
+#include "bundle/shared/LocalizedString.h"
+#include "platform/foundation/Formatters.h"
+#include "platform/toolkit/View.h"
+
+namespace ax {
+
+namespace {
+
+// A day is drawn smaller than the area that stands for it.
+constexpr double besideDay = 10;
+constexpr double belowDay = 70;
+
+// A day of the month: its date, and what was done on it.
+class MonthDayCellLayerAccessibility : public SafeCategory<MonthDayCellLayerAccessibility> {
+ public:
+  using SafeCategory::SafeCategory;
+
+  static void _accessibilityPerformValidations(Manager& manager) {
+    constexpr auto target = "MonthDayCellLayer";
+    manager.validateClassHasClassMethodWithFullSignature("ActivitySummaryCache", "sharedInstance", {"@"});
+    manager.validateClassHasInstanceVariableWithType(target, "_hasWorkout", "B");
+    manager.validateClassHasInstanceMethodWithFullSignature(target, "isFutureDay", {"B"});
+    manager.validateClassHasInstanceMethodWithFullSignature("QSCalendarDayCell", "representsToday", {"B"});
+    manager.validateClassHasInstanceMethodWithFullSignature("QSCalendarDayCell", "date", {"@"});
+    manager.validateClassIsKindOfClass(target, "QSCalendarDayCell");
+    manager.validateClass("MonthWeekView");
+    manager.validateClass("MonthScrollViewController");
+    manager.validateClass("MonthViewController");
+  }
+
+  bool isAccessibilityElement() { return true; }
+
+  Ref<String> accessibilityLabel() {
+    const Ref<Object> container = messages::accessibilityContainer(self);
+    const bool isInWeekRow = container && container->isKindOf(safeClassFromString("MonthWeekView"));
+    const bool isToday = self.safeBoolForKey("representsToday"_key);
+    return stringForVariables({isToday ? accessibilityLocalizedString("today") : nullptr,
+                               dateStringForFormat(date(), isInWeekRow ? "dMMMM" : "EEEE"),
+                               stringForVariablesSentinel});
+  }
+
+  Ref<String> accessibilityValue() {
+    if (self.safeBoolForKey("isFutureDay"_key)) return accessibilityLocalizedString("no.data");
+    const Ref<String> rings = accessibilityVeltoStringForDate(date(), true);
+    const bool hasWorkout = self.safeBoolForKey("_hasWorkout"_key);
+    const Ref<String> value =
+        stringForVariables({hasWorkout ? accessibilityLocalizedString("worked.out") : nullptr, rings,
+                            stringForVariablesSentinel});
+    return isEmpty(value) ? accessibilityLocalizedString("no.data") : value;
+  }
+
+  Rect accessibilityFrame() {
+    const Ref<Layer> layer = castAsClass<Layer>(self);
+    if (!layer) return super(messages::accessibilityFrame);
+    const Rect drawn = layer->frame();
+    const Rect area{drawn.x - besideDay, drawn.y, drawn.width + 2 * besideDay, drawn.height + belowDay};
+    return convertFrameToScreenCoordinates(area, _accessibilityAncestorIsKindOf(self, &View::staticClass()));
+  }
+
+ private:
+  Ref<Date> date() { return castAsClass<Date>(self.safeValueForKey("date"_key)); }
+};
+
+using C = MonthDayCellLayerAccessibility;
+
+const CategoryRegistration<C> registration{
+    "MonthDayCellLayerAccessibility",
+    "MonthDayCellLayer",
+    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
+     overrides<&C::accessibilityLabel>(messages::accessibilityLabel),
+     overrides<&C::accessibilityValue>(messages::accessibilityValue),
+     overrides<&C::accessibilityFrame>(messages::accessibilityFrame)}};
+
+}  // namespace
+
+}  // namespace ax

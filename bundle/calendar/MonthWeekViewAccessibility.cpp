@@ -1,0 +1,73 @@
+#include "bundle/core/Category.h"
+#include "platform/toolkit/View.h"
+
+namespace ax {
+
+namespace {
+
+// A week of the month: its title, its goal texts while they show, and its days.
+class MonthWeekViewAccessibility : public SafeCategory<MonthWeekViewAccessibility> {
+ public:
+  using SafeCategory::SafeCategory;
+
+  static void _accessibilityPerformValidations(Manager& manager) {
+    constexpr auto target = "MonthWeekView";
+    manager.validateClassHasInstanceMethodWithFullSignature("QSCalendarWeekView", "monthTitleView", {"@"});
+    manager.validateClassIsKindOfClass(target, "QSCalendarWeekView");
+    manager.validateClassHasInstanceVariableWithType(target, "_goalPercentChangeTextLabel", "Label");
+    manager.validateClassHasInstanceVariableWithType(target, "_goalTextLabel", "Label");
+    manager.validateClassHasInstanceVariableWithType(target, "_topBorderLineOnDrag", "Layer");
+  }
+
+  Ref<Array> accessibilityElements() {
+    const Array::Items days = takeDays();
+    Array::Items elements;
+    if (Ref<Object> title = self.safeValueForKey("monthTitleView"_key)) elements.push_back(std::move(title));
+    const bool showsGoals = isTopBorderVisible();
+    for (const Key key : {"_goalTextLabel"_key, "_goalPercentChangeTextLabel"_key}) {
+      if (Ref<Object> goal = goalText(key, showsGoals)) elements.push_back(std::move(goal));
+    }
+    elements.insert(elements.end(), days.begin(), days.end());
+    return sortedByGeometry(*array(std::move(elements)));
+  }
+
+ private:
+  Array::Items takeDays() {
+    Array::Items days;
+    const Ref<View> row = castAsClass<View>(self);
+    if (!row || row->layerIfAny() == nullptr) return days;
+    const Class* dayClass = safeClassFromString("MonthDayCellLayer");
+    for (const Ref<Layer>& layer : row->layerIfAny()->sublayers()) {
+      if (!layer->isKindOf(dayClass)) continue;
+      messages::setAccessibilityContainer(layer, row);
+      days.push_back(layer);
+    }
+    return days;
+  }
+
+  bool isTopBorderVisible() {
+    const Ref<Layer> border = castAsClass<Layer>(self.safeValueForKey("_topBorderLineOnDrag"_key));
+    return border && border->opacity() > 0;
+  }
+
+  // The label under a key when there is something to say; nil, and no stop, when there is not.
+  Ref<Object> goalText(Key key, bool shows) {
+    Ref<Object> label = self.safeValueForKey(key);
+    const bool speaks = shows && !isEmpty(messages::accessibilityLabel(label));
+    messages::setIsAccessibilityElement(label, speaks);
+    if (!speaks) return nullptr;
+    messages::setAccessibilityContainer(label, Ref<Object>(&self));
+    return label;
+  }
+};
+
+using C = MonthWeekViewAccessibility;
+
+const CategoryRegistration<C> registration{
+    "MonthWeekViewAccessibility",
+    "MonthWeekView",
+    {overrides<&C::accessibilityElements>(messages::accessibilityElements)}};
+
+}  // namespace
+
+}  // namespace ax

@@ -1,0 +1,36 @@
+#include "bundle/core/Category.h"
+#include "platform/foundation/Formatters.h"
+#include "platform/toolkit/Label.h"
+
+namespace ax {
+
+namespace {
+
+// The title over a month, shown as a number and spoken by name.
+class VeltoMonthTitleLabelAccessibility : public SafeCategory<VeltoMonthTitleLabelAccessibility> {
+ public:
+  using SafeCategory::SafeCategory;
+
+  static void _accessibilityPerformValidations(Manager& manager) {
+    manager.validateClassIsKindOfClass("_VeltoMonthTitleLabel", "Label");
+  }
+
+  Traits accessibilityTraits() { return super(messages::accessibilityTraits) | TraitHeader; }
+
+  Ref<String> accessibilityLabel() {
+    const Ref<Label> title = castAsClass<Label>(self);
+    if (!title || isEmpty(title->text())) return super(messages::accessibilityLabel);
+    return dateStringForFormat(dateFromStringWithFormat(title->text(), "MM"), "MMMM");
+  }
+};
+
+using C = VeltoMonthTitleLabelAccessibility;
+
+const CategoryRegistration<C> registration{"_VeltoMonthTitleLabelAccessibility",
+                                           "_VeltoMonthTitleLabel",
+                                           {overrides<&C::accessibilityTraits>(messages::accessibilityTraits),
+                                            overrides<&C::accessibilityLabel>(messages::accessibilityLabel)}};
+
+}  // namespace
+
+}  // namespace ax
