@@ -1,7 +1,5 @@
 #include "bundle/shared/DayRings.h"
 
-#include <mutex>
-
 #include "bundle/shared/RingsDescription.h"
 #include "platform/health/ActivitySummary.h"
 #include "platform/runtime/KeyReading.h"
@@ -15,11 +13,9 @@ const Message<double()> activeEnergyCompletionPercentage{"_activeEnergyCompletio
 const Message<double()> standHoursCompletionPercentage{"_standHoursCompletionPercentage"};
 
 const Ref<Calendar>& gregorianCalendar() {
-  static std::once_flag made;
-  static auto* const calendar = new Ref<Calendar>;
-  std::call_once(made,
-                 [] { *calendar = Calendar::calendarWithIdentifier(string(CalendarIdentifierGregorian)); });
-  return *calendar;
+  static const auto& calendar =
+      *new Ref<Calendar>(Calendar::calendarWithIdentifier(string(CalendarIdentifierGregorian)));
+  return calendar;
 }
 
 double moveFraction(const Ref<ActivitySummary>& summary) {
@@ -43,6 +39,7 @@ std::int64_t CHCacheIndexForDate(const Ref<Date>& date) {
 }
 
 Ref<String> accessibilityVeltoStringForDate(const Ref<Date>& date, bool arePercentagesCapped) {
+  if (!date) return nullptr;
   Ref<Object> found;
   performSafeBlock([&] {
     const Ref<Object> cache =

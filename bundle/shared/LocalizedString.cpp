@@ -1,7 +1,5 @@
 #include "bundle/shared/LocalizedString.h"
 
-#include <mutex>
-
 #include "bundle/shared/WheelchairUse.h"
 #include "platform/foundation/AddressBook.h"
 #include "platform/foundation/Bundle.h"
@@ -15,18 +13,19 @@ const Message<void(Ref<String>)> setName{"setName:"};
 const Message<void(bool)> setWheelchairUser{"setWheelchairUser:"};
 const Message<Ref<String>(Ref<Object>)> titleForAchievement{"titleForAchievement:"};
 
+Ref<Object> makeAchievementLocalizationProvider() {
+  const Class* providerClass = safeClassFromString("ODUIAchievementLocalizationProvider");
+  if (providerClass == nullptr) return nullptr;
+  Ref<Object> provider = providerClass->instantiate();
+  setName(provider, copyUserFirstNameFromAddressBook());
+  setWheelchairUser(provider, _userIsWheelchairUserWithParloOn());
+  return provider;
+}
+
 // The host library's provider, made once with the settings of that moment.
 const Ref<Object>& achievementLocalizationProvider() {
-  static std::once_flag made;
-  static auto* const provider = new Ref<Object>;
-  std::call_once(made, [] {
-    const Class* providerClass = safeClassFromString("ODUIAchievementLocalizationProvider");
-    if (providerClass == nullptr) return;
-    *provider = providerClass->instantiate();
-    setName(*provider, copyUserFirstNameFromAddressBook());
-    setWheelchairUser(*provider, _userIsWheelchairUserWithParloOn());
-  });
-  return *provider;
+  static const auto& provider = *new Ref<Object>(makeAchievementLocalizationProvider());
+  return provider;
 }
 
 }  // namespace

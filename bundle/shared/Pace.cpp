@@ -1,9 +1,8 @@
 #include "bundle/shared/Pace.h"
 
+#include <algorithm>
 #include <charconv>
 #include <limits>
-#include <mutex>
-#include <optional>
 #include <regex>
 
 #include "bundle/shared/LocalizedString.h"
@@ -13,14 +12,16 @@ using namespace ax;
 
 namespace {
 
-// Longer texts are no figures on a screen, and would cost the pattern too much stack.
-constexpr std::size_t longestFigure = 2000;
-
 const std::regex& pacePattern() {
-  static std::once_flag made;
-  static const std::regex* pattern;
-  std::call_once(made, [] { pattern = new std::regex(R"re((\d+)'\s?([0-5]?[0-9])(?:''|"))re"); });
-  return *pattern;
+  static const auto& pattern = *new std::regex(R"re((\d+)'\s?([0-5]?[0-9])(?:''|"))re");
+  return pattern;
+}
+
+// Every further digit costs the pattern stack, and no pace has so many.
+bool hasEndlessNumber(const std::string& text) {
+  constexpr int tooManyDigits = 1000;
+  const auto isDigit = [](char c, int) { return c >= '0' && c <= '9'; };
+  return std::search_n(text.begin(), text.end(), tooManyDigits, 0, isDigit) != text.end();
 }
 
 // As many seconds as fit.
@@ -61,7 +62,7 @@ Ref<AccessibilityAttributedString> accessibilityAttributedStringForPaceContainin
   const Ref<NumberFormatter> formatter = make<NumberFormatter>();
   std::smatch pace;
   const bool found =
-      string->text().size() <= longestFigure && std::regex_search(string->text(), pace, pacePattern());
+      !hasEndlessNumber(string->text()) && std::regex_search(string->text(), pace, pacePattern());
   if (!found || pace.size() != 3) return AccessibilityAttributedString::initWithString(string);
   return withSpokenPace(pace, *formatter);
 }
