@@ -1,0 +1,158 @@
+#include <gtest/gtest.h>
+
+#include <cmath>
+#include <limits>
+#include <stdexcept>
+
+#include "platform/runtime/ClassBuilder.h"
+#include "platform/toolkit/DataSeriesMessages.h"
+#include "reader/graph/ChartDescription.h"
+#include "tests/reader/ScreenPieces.h"
+
+namespace ax::reader::testing {
+
+namespace {
+
+using Lines = std::vector<std::string>;
+
+// A chart of two points that describes places on its first axis only; its second axis has no upper end.
+class Series : public View {
+ public:
+  using T = Series;
+  static Class& staticClass() {
+    static Class& result =
+        ClassBuilder<T>("GraphTestSeries", View::staticClass())
+            .method<&T::containerType>("accessibilityContainerType")
+            .method<&T::sonification>("_accessibilityDataSeriesSupportsSonification")
+            .method<&T::type>("_accessibilityDataSeriesType")
+            .method<&T::name>("_accessibilityDataSeriesName")
+            .method<&T::values>("_accessibilityDataSeriesValuesForAxis:")
+            .method<&T::title>("_accessibilityDataSeriesTitleForAxis:")
+            .method<&T::minimum>("_accessibilityDataSeriesMinimumValueForAxis:")
+            .method<&T::maximum>("_accessibilityDataSeriesMaximumValueForAxis:")
+            .method<&T::position>("_accessibilityDataSeriesValueDescriptionForPosition:axis:")
+            .build();
+    return result;
+  }
+  std::int64_t containerType() { return messages::dataSeriesContainerType; }
+  bool sonification() { return true; }
+  std::int64_t type() { return 2; }
+  Ref<String> name() { return string("Moves"); }
+  Ref<Array> values(std::int64_t axis) {
+    if (axis == 0) return array({number(0.5), number(12)});
+    return array({number(3), string("not a number"), number(4.25)});
+  }
+  Ref<String> title(std::int64_t axis) { return axis == 0 ? string("Time") : nullptr; }
+  Ref<Number> minimum(std::int64_t) { return number(0); }
+  Ref<Number> maximum(std::int64_t axis) { return axis == 0 ? number(24) : nullptr; }
+  Ref<String> position(double position, std::int64_t axis) {
+    if (position > 0.9) throw std::runtime_error("outside");
+    return axis == 0 ? string(std::to_string(int(position * 24)) + " o'clock") : nullptr;
+  }
+};
+
+// A row of slices; the counts are set by the tests.
+class Slices : public View {
+ public:
+  using T = Slices;
+  static Class& staticClass() {
+    static Class& result = ClassBuilder<T>("GraphTestSlices", View::staticClass())
+                               .method<&T::usesSlices>("_accessibilityShouldUseSlices")
+                               .method<&T::numberOfSlices>("_accessibilityNumberOfSlices")
+                               .method<&T::seconds>("_accessibilityTimeIntervalPerSlice")
+                               .method<&T::hours>("_accessibilityHoursPerSlice")
+                               .method<&T::quantity>("_accessibilityQuantityForSliceAtIndex:")
+                               .build();
+    return result;
+  }
+  bool usesSlices() { return answers; }
+  std::uint64_t numberOfSlices() { return count; }
+  double seconds() { return secondsPerSlice; }
+  std::uint64_t hours() { return hoursPerSlice; }
+  Ref<String> quantity(std::uint64_t index) {
+    return index == 1 ? nullptr : string(std::to_string(index * 10) + " calories");
+  }
+
+  bool answers = true;
+  std::uint64_t count = 2;
+  double secondsPerSlice = 450;
+  std::uint64_t hoursPerSlice = 0;
+};
+
+TEST(Graph, ReadsASeriesWithBothAxes) {
+  const Snapshot snapshot = takeSnapshot(view({view<Series>({})}));
+  ASSERT_EQ(charts(snapshot).size(), 1u);
+  const Node& chart = *charts(snapshot)[0];
+  EXPECT_EQ(chart.role, Role::chart);
+  EXPECT_FALSE(chart.isElement);
+  EXPECT_EQ(chart.series->axes[0].values, (std::vector<double>{0.5, 12}));
+  EXPECT_EQ(chart.series->axes[1].values, (std::vector<double>{3, 4.25}));  // numbers alone
+  EXPECT_EQ(chart.series->axes[1].maximum, std::nullopt);
+  EXPECT_EQ(chart.series->axes[0].positions.size(), 4u);  // the fifth one raises
+  EXPECT_TRUE(chart.series->axes[1].positions.empty());
+  EXPECT_EQ(snapshot.timesRaised(), 2u);
+}
+
+TEST(Graph, DescribesASeriesWithItsElements) {
+  const Ref<View> chart = view<Series>({}, {10, 20, 200, 100});
+  const Ref<AccessibilityElement> bar = element("Noon", chart);
+  messages::setAccessibilityValue(bar, string("3 calories"));
+  bar->setAccessibilityFrameInContainerSpace({5, 6, 7, 8});
+  messages::setAccessibilityElements(chart, array({bar}));
+  const Snapshot snapshot = takeSnapshot(chart);
+  EXPECT_EQ(describeChart(snapshot, *charts(snapshot).at(0)),
+            (Lines{"Chart: Moves", "  Kind of series: 2, Can be played as sound",
+                   "  Horizontal axis: Time, from 0 to 24, 2 values", "    0.5, 12", "    At 0%: 0 o'clock",
+                   "    At 25%: 6 o'clock", "    At 50%: 12 o'clock", "    At 75%: 18 o'clock",
+                   "  Vertical axis: Lowest: 0, 2 values", "    3, 4.25", "  1 element",
+                   "    Noon, 3 calories, at 15 by 26, 7 wide, 8 high"}));
+}
+
+TEST(Graph, AsksConsecutiveSlices) {
+  const Ref<Slices> chart = view<Slices>({});
+  Snapshot snapshot = takeSnapshot(chart);
+  const DataSeries& series = *charts(snapshot).at(0)->series;
+  EXPECT_FALSE(series.hasAxes);
+  ASSERT_EQ(series.slices.size(), 2u);
+  EXPECT_EQ(series.slices[1].start, series.slices[0].end);
+  EXPECT_EQ(series.slices[1].end, 900);
+  EXPECT_EQ(describeChart(snapshot, *charts(snapshot).at(0)),
+            (Lines{"Chart without a title", "  2 slices, 7 minutes, 30 seconds",
+                   "    Slice 1, from 0 minutes to 7 minutes, 30 seconds, 0 calories",
+                   "    Slice 2, from 7 minutes, 30 seconds to 15 minutes, No data in the chart"}));
+
+  chart->answers = false;
+  EXPECT_TRUE(charts(takeSnapshot(chart)).empty());
+}
+
+TEST(Graph, BoundsWhatABrokenHostCounts) {
+  const Ref<Slices> chart = view<Slices>({});
+  chart->count = std::numeric_limits<std::uint64_t>::max();
+  chart->hoursPerSlice = std::numeric_limits<std::uint64_t>::max();
+  chart->secondsPerSlice = std::numeric_limits<double>::quiet_NaN();
+  const Snapshot many = takeSnapshot(chart);
+  EXPECT_LT(charts(many).at(0)->series->slices.size(), 100000u);
+  EXPECT_FALSE(describeChart(many, *charts(many)[0]).empty());
+
+  chart->count = 0;
+  const Snapshot none = takeSnapshot(chart);
+  EXPECT_EQ(describeChart(none, *charts(none).at(0)).back(), "  No data in the chart");
+}
+
+TEST(Graph, PrintsJson) {
+  const Snapshot snapshot = takeSnapshot(view({view<Series>({}), view<Slices>({}, {0, 900, 10, 10})}));
+  const auto found = charts(snapshot);
+  ASSERT_EQ(found.size(), 2u);
+  const auto series = chartAsJson(snapshot, *found[0]), slices = chartAsJson(snapshot, *found[1]);
+  EXPECT_EQ(series["axes"][0]["maximum"], 24);
+  EXPECT_TRUE(series["axes"][1]["title"].is_null());
+  EXPECT_EQ(series["axes"][0]["positions"][1]["description"], "6 o'clock");
+  EXPECT_FALSE(series.contains("slices"));
+  EXPECT_EQ(slices["slices"][0]["quantity"], "0 calories");
+  EXPECT_TRUE(slices["slices"][1]["quantity"].is_null());
+  EXPECT_FALSE(slices.contains("axes"));
+}
+
+}  // namespace
+
+}  // namespace ax::reader::testing
