@@ -1,5 +1,5 @@
 #include "reader/graph/ChartDescription.h"
-#include "reader/transcript/TreeJson.h"
+#include "reader/transcript/TextJson.h"
 
 namespace ax::reader {
 

@@ -1,6 +1,7 @@
 #include "reader/transcript/TreeJson.h"
 
 #include "reader/scene/Reply.h"
+#include "reader/transcript/TextJson.h"
 
 namespace ax::reader {
 
@@ -57,20 +58,6 @@ Json nodesAsJson(const Snapshot& snapshot, const std::vector<NodeId>& ids) {
 
 Json treeAsJson(const Snapshot& snapshot) {
   return nodesAsJson(snapshot, snapshot.topNodes());
-}
-
-Json textAsJson(const std::optional<AttributedText>& text) {
-  if (!text) return nullptr;
-  if (text->attributes.empty()) return text->text;
-  Json attributes = Json::array();
-  for (const auto& [key, range] : text->attributes) {
-    attributes.push_back({{"key", key}, {"range", {range.location, range.length}}});
-  }
-  return {{"string", text->text}, {"attributes", attributes}};
-}
-
-Json rectAsJson(const Rect& rect) {
-  return {rect.x, rect.y, rect.width, rect.height};
 }
 
 }  // namespace ax::reader

@@ -10,9 +10,4 @@ namespace ax::reader {
 // lists and what has no meaning for the node are left out.
 nlohmann::ordered_json treeAsJson(const Snapshot& snapshot);
 
-// A text, or null; one with attributes as {"string", "attributes": [{"key", "range"}]}.
-nlohmann::ordered_json textAsJson(const std::optional<AttributedText>& text);
-// [x, y, width, height]
-nlohmann::ordered_json rectAsJson(const Rect& rect);
-
 }  // namespace ax::reader

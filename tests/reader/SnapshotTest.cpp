@@ -4,6 +4,7 @@
 #include <stdexcept>
 
 #include "platform/foundation/Environment.h"
+#include "platform/foundation/Number.h"
 #include "platform/runtime/ClassBuilder.h"
 #include "tests/reader/ScreenPieces.h"
 
@@ -195,7 +196,9 @@ TEST(Snapshot, NeverUsesAnIdTwice) {
   std::set<NodeId> ids;
   std::size_t nodes = 0;
   for (int i = 0; i < 3; ++i) {
-    for (const Node& node : takeSnapshot(screen).nodes()) ids.insert(node.id), ++nodes;
+    const Snapshot snapshot = takeSnapshot(screen);
+    for (const Node& node : snapshot.nodes()) ids.insert(node.id);
+    nodes += snapshot.nodes().size();
   }
   EXPECT_EQ(ids.size(), nodes);
   EXPECT_FALSE(ids.contains(0));

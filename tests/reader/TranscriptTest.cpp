@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include "platform/foundation/Environment.h"
+#include "platform/foundation/Number.h"
 #include "platform/runtime/ClassBuilder.h"
 #include "reader/transcript/SpokenTime.h"
 #include "tests/formatting/RegionScope.h"
