@@ -1,0 +1,72 @@
+#include "host/charts/CHWorkoutDetailHeartRateChartTableViewCell.h"
+
+#include "host/core/HostStrings.h"
+#include "platform/runtime/ClassBuilder.h"
+#include "platform/toolkit/Label.h"
+
+namespace ax::host {
+
+namespace {
+
+const Message<void()> createAndConstraintNoDataOverlay{"_createAndConstraintNoDataOverlay"};
+
+void putInto(View& parent, const Ref<View>& part, Rect frame) {
+  if (!part) return;
+  if (part->superview() == nullptr) parent.addSubview(part);
+  if (part->frame() == Rect()) part->setFrame(frame);
+}
+
+}  // namespace
+
+Class& CHWorkoutDetailHeartRateChartTableViewCell::staticClass() {
+  using T = CHWorkoutDetailHeartRateChartTableViewCell;
+  static Class& result =
+      ClassBuilder<T>("CHWorkoutDetailHeartRateChartTableViewCell", TableViewCell::staticClass())
+          .instanceVariable<&T::noDataOverlayView_>("_noDataOverlayView")
+          .instanceVariable<&T::scrollView_>("_scrollView")
+          .instanceVariable<&T::pageControl_>("_pageControl")
+          .instanceVariable<&T::chartView_>("_chartView")
+          .instanceVariable<&T::showsExplanation_>("_showsExplanation")
+          .method<&T::_createAndConstraintNoDataOverlay>("_createAndConstraintNoDataOverlay")
+          .method<&T::overlayButtonTapped>("overlayButtonTapped:")
+          .build();
+  return result;
+}
+
+void CHWorkoutDetailHeartRateChartTableViewCell::layoutSubviews() {
+  View& content = *contentView();
+  if (content.frame() == Rect()) content.setFrame(bounds());
+  putInto(content, scrollView_, content.bounds());
+  putInto(scrollView_ ? *scrollView_ : content, chartView_, content.bounds());
+  const double height = content.frame().height;
+  putInto(content, pageControl_, {0, height - 20, content.frame().width, 20});
+  if (!chartView_) return;
+  chartView_->showReadings();
+  const bool isShown = chartView_->hasAdequateDataForDisplay();
+  if (!isShown) createAndConstraintNoDataOverlay(*this);
+  if (noDataOverlayView_) noDataOverlayView_->setHidden(isShown);
+}
+
+void CHWorkoutDetailHeartRateChartTableViewCell::_createAndConstraintNoDataOverlay() {
+  if (!noDataOverlayView_) {
+    const Ref<Label> title = make<Label>();
+    title->setText(HostStrings::textForKey(string("no.heart.rate.title")));
+    title->setFrame({0, 0, frame().width, 40});
+    const Ref<Button> button = make<Button>();
+    button->setTitle(HostStrings::textForKey(string("no.heart.rate.link")));
+    button->setFrame({0, 40, frame().width, 40});
+    button->setTargetAction(*this, Selector::intern("overlayButtonTapped:"));
+    noDataOverlayView_ = make<View>();
+    noDataOverlayView_->addSubview(title);
+    noDataOverlayView_->addSubview(button);
+  }
+  putInto(*contentView(), noDataOverlayView_, bounds());
+}
+
+void CHWorkoutDetailHeartRateChartTableViewCell::overlayButtonTapped(Ref<Object>) {
+  showsExplanation_ = true;
+}
+
+static const RegisteredClass<CHWorkoutDetailHeartRateChartTableViewCell> registered;
+
+}  // namespace ax::host
