@@ -1,0 +1,68 @@
+#include "bundle/core/Category.h"
+#include "platform/toolkit/Control.h"
+#include "platform/toolkit/Label.h"
+
+namespace ax {
+
+namespace {
+
+const Message<void()> createAndConstraintNoDataOverlay{"_createAndConstraintNoDataOverlay"};
+
+// Nil when none of the view's direct subviews is one, or there is no view.
+template <class T>
+Ref<T> firstSubview(const Ref<View>& view) {
+  if (!view) return nullptr;
+  for (const Ref<View>& subview : view->subviews()) {
+    if (T* found = cast<T>(subview.get())) return Ref<T>(found);
+  }
+  return nullptr;
+}
+
+Ref<String> labelOfOverlay(const Ref<View>& overlay) {
+  const Ref<Label> label = firstSubview<Label>(overlay);
+  return label ? messages::accessibilityLabel(label) : stringForAllChildren(overlay);
+}
+
+// The row of a workout's heart rate: what covers it when there is no data is one button.
+class CHWorkoutDetailHeartRateChartTableViewCellAccessibility
+    : public SafeCategory<CHWorkoutDetailHeartRateChartTableViewCellAccessibility> {
+ public:
+  using SafeCategory::SafeCategory;
+
+  static void _accessibilityPerformValidations(Manager& manager) {
+    constexpr auto target = "CHWorkoutDetailHeartRateChartTableViewCell";
+    manager.validateClassHasInstanceVariableWithType(target, "_noDataOverlayView", "View");
+    manager.validateClassHasInstanceMethodWithFullSignature(target, "_createAndConstraintNoDataOverlay",
+                                                            {"v"});
+  }
+
+  void _createAndConstraintNoDataOverlay() {
+    super(createAndConstraintNoDataOverlay);
+    messages::_accessibilityLoadAccessibilityInformation(self);
+  }
+
+  void _accessibilityLoadAccessibilityInformation() {
+    super(messages::_accessibilityLoadAccessibilityInformation);
+    const Ref<View> overlay = safeUIViewForKey(self, "_noDataOverlayView"_key);
+    if (!overlay) return;
+    const Weak<View> weak = overlay;
+    _setIsAccessibilityElementBlock(overlay, [weak] { return weak && !weak.get()->isHidden(); });
+    _setAccessibilityLabelBlock(overlay, [weak] { return labelOfOverlay(weak.lock()); });
+    _setAccessibilityActivateBlock(
+        overlay, [weak] { return messages::accessibilityActivate(firstSubview<Button>(weak.lock())); });
+    messages::setAccessibilityTraits(overlay, TraitButton);
+  }
+};
+
+using C = CHWorkoutDetailHeartRateChartTableViewCellAccessibility;
+
+const CategoryRegistration<C> registration{
+    "CHWorkoutDetailHeartRateChartTableViewCellAccessibility",
+    "CHWorkoutDetailHeartRateChartTableViewCell",
+    {overrides<&C::_createAndConstraintNoDataOverlay>(createAndConstraintNoDataOverlay),
+     overrides<&C::_accessibilityLoadAccessibilityInformation>(
+         messages::_accessibilityLoadAccessibilityInformation)}};
+
+}  // namespace
+
+}  // namespace ax

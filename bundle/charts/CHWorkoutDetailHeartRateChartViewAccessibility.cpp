@@ -1,0 +1,196 @@
+#include <cmath>
+#include <limits>
+
+#include "bundle/charts/DataSeriesChart.h"
+#include "bundle/shared/LocalizedString.h"
+#include "platform/foundation/Calendar.h"
+#include "platform/foundation/Formatters.h"
+#include "platform/health/Workout.h"
+#include "platform/runtime/Boxing.h"
+#include "platform/toolkit/View.h"
+
+namespace ax {
+
+namespace {
+
+constexpr std::uint64_t sliceCount = 8;
+
+const Message<Ref<DateInterval>()> axDateInterval{"_axDateInterval"};
+const Message<float(Ref<Date>)> decimalForDate{"_decimalForDate:"};
+
+// The lowest and the highest of the whole heart rates in a stretch of time.
+struct RateRange {
+  double minimum = std::numeric_limits<double>::max();
+  double maximum = std::numeric_limits<double>::min();
+
+  void include(double rate) {
+    if (rate > maximum) maximum = rate;
+    if (rate < minimum) minimum = rate;
+  }
+  bool isEmpty() const {
+    return minimum == std::numeric_limits<double>::max() || maximum == std::numeric_limits<double>::min();
+  }
+};
+
+Ref<String> spokenRate(double rate) {
+  return formatFloat(0, static_cast<float>(rate));
+}
+
+Ref<String> spokenRange(const RateRange& range) {
+  if (range.isEmpty()) return nullptr;
+  if (std::abs(range.maximum - range.minimum) < std::numeric_limits<double>::epsilon()) {
+    return stringWithFormat(accessibilityLocalizedString("heart.rate.graph.single"),
+                            {spokenRate(range.maximum)});
+  }
+  return stringWithFormat(accessibilityLocalizedString("heart.rate.graph.range"),
+                          {spokenRate(range.minimum), spokenRate(range.maximum)});
+}
+
+float unsignedAsFloat(const Ref<Object>& object, Key key) {
+  const Ref<Number> value = cast<Number>(safeValueForKey(object, key));
+  return value ? static_cast<float>(value->unsignedValue()) : 0;
+}
+
+// The middle of what a point of the chart spans.
+float middleOf(const Ref<Object>& point) {
+  const Ref<Object> span = safeValueForKey(point, "yValue"_key);
+  return (unsignedAsFloat(span, "firstIndex"_key) + unsignedAsFloat(span, "lastIndex"_key)) * 0.5f;
+}
+
+// A workout's heart rate over the time of day, summed up in equal slices of the workout.
+class CHWorkoutDetailHeartRateChartViewAccessibility
+    : public SafeCategory<CHWorkoutDetailHeartRateChartViewAccessibility> {
+ public:
+  using SafeCategory::SafeCategory;
+
+  static void _accessibilityPerformValidations(Manager& manager) {
+    constexpr auto target = "CHWorkoutDetailHeartRateChartView";
+    manager.validateClassConformsToProtocol(target, "VLUIChartDataSource");
+    manager.validateClassHasInstanceVariableWithType(target, "_heartRateReadings", "Array");
+    manager.validateClassHasInstanceVariableWithType(target, "_heartRateChartPoints", "Array");
+    manager.validateClassHasInstanceVariableWithType(target, "_chartView", "VLUIChartView");
+    manager.validateClassHasInstanceVariableWithType(target, "_hasAdequateDataForDisplay", "B");
+    manager.validateClassHasInstanceMethodWithFullSignature(target, "_dateInterval", {"@"});
+    manager.validateClassHasInstanceMethodWithFullSignature("Quantity", "ch_beatsPerMinute", {"d"});
+  }
+
+  Ref<Array> accessibilityElements() {
+    const Ref<Object> chart = self.safeValueForKey("_chartView"_key);
+    return axArrayByIgnoringNilElementsWithCount(1, {safeUIViewForKey(chart, "_containerView"_key)});
+  }
+
+  std::int64_t accessibilityContainerType() { return messages::dataSeriesContainerType; }
+  bool _accessibilityDataSeriesSupportsSummarization() { return true; }
+  bool _accessibilityDataSeriesSupportsSonification() { return true; }
+  std::int64_t _accessibilityDataSeriesType() { return 0; }
+  Ref<String> _accessibilityDataSeriesName() {
+    return accessibilityLocalizedString("heart.rate.data.series");
+  }
+  Ref<String> _accessibilityDataSeriesTitleForAxis(std::int64_t axis) {
+    return localizedTextForAxis(axis, "activity.time.of.day.axis", "heart.rate.data.series");
+  }
+  Ref<String> _accessibilityDataSeriesUnitLabelForAxis(std::int64_t axis) {
+    return localizedTextForAxis(axis, "activity.time.of.day.unit", "heart.rate.data.unit");
+  }
+
+  // A point of a wrong kind counts as one at nothing, so that both axes keep one value per point.
+  Ref<Array> _accessibilityDataSeriesValuesForAxis(std::int64_t axis) {
+    Array::Items values;
+    const Ref<Array> points = safeArrayForKey(self, "_heartRateChartPoints"_key);
+    if (!points || (axis != 0 && axis != 1)) return array({});
+    values.reserve(points->count());
+    for (const Ref<Object>& item : *points) {
+      const Ref<Object> point = safeClass("VLUIChartPointMultiple", item);
+      const auto hour = [&] {
+        return decimalForDate(self, cast<Date>(safeValueForKey(point, "xValue"_key)));
+      };
+      values.push_back(number(axis == 0 ? hour() : middleOf(point)));
+    }
+    return array(std::move(values));
+  }
+
+  Ref<Number> _accessibilityDataSeriesMinimumValueForAxis(std::int64_t axis) {
+    const Ref<DateInterval> workout = axis == 0 ? axDateInterval(self) : nullptr;
+    if (axis == 0) return number(decimalForDate(self, workout ? workout->startDate() : nullptr));
+    return axis == 1 ? endOfRange("minYValue"_key) : nullptr;
+  }
+
+  Ref<Number> _accessibilityDataSeriesMaximumValueForAxis(std::int64_t axis) {
+    const Ref<DateInterval> workout = axis == 0 ? axDateInterval(self) : nullptr;
+    if (axis == 0) return number(decimalForDate(self, workout ? workout->endDate() : nullptr));
+    return axis == 1 ? endOfRange("maxYValue"_key) : nullptr;
+  }
+
+  bool _accessibilityShouldUseSlices() { return self.safeBoolForKey("_hasAdequateDataForDisplay"_key); }
+  std::uint64_t _accessibilityNumberOfSlices() { return sliceCount; }
+
+  double _accessibilityTimeIntervalPerSlice() {
+    const Ref<DateInterval> workout = axDateInterval(self);
+    const std::uint64_t slices = messages::_accessibilityNumberOfSlices(self);
+    return workout && slices > 0 ? workout->duration() / static_cast<double>(slices) : 0;
+  }
+
+  std::uint64_t _accessibilityHoursPerSlice() {
+    const Ref<DateInterval> workout = axDateInterval(self);
+    const std::uint64_t slices = messages::_accessibilityNumberOfSlices(self);
+    if (!workout || slices == 0) return 0;
+    return number(workout->duration() / 3600 / static_cast<double>(slices))->unsignedValue();
+  }
+
+  // Both ends of the slice are counted from the workout's start, so that neighbours share theirs exactly.
+  Ref<String> _accessibilityQuantityForSliceAtIndex(std::uint64_t index) {
+    const Ref<DateInterval> workout = axDateInterval(self);
+    if (!workout || index >= messages::_accessibilityNumberOfSlices(self)) return nullptr;
+    const TimeInterval length = messages::_accessibilityTimeIntervalPerSlice(self);
+    const auto slice = static_cast<double>(index);
+    const Date& start = *workout->startDate();
+    return spokenRange(ratesIn(*make<DateInterval>(start.dateByAddingTimeInterval(length * slice),
+                                                   start.dateByAddingTimeInterval(length * (slice + 1)))));
+  }
+
+  Ref<DateInterval> _axDateInterval() {
+    return castAsClass<DateInterval>(self.safeValueForKeyPath("dateInterval"));
+  }
+
+  // 0 for no date.
+  float _decimalForDate(Ref<Date> date) {
+    if (!date) return 0;
+    const Ref<DateComponents> time = Calendar::currentCalendar()->componentsFromDate(*date);
+    return static_cast<float>(time->hour + time->minute / 60.0 + time->second / 3600.0);
+  }
+
+ private:
+  Ref<Number> endOfRange(Key key) {
+    const Ref<Object> chart = safeClass("VLUIChartView", self.safeValueForKey("_chartView"_key));
+    return cast<Number>(safeValueForKey(chart, key));
+  }
+
+  RateRange ratesIn(const DateInterval& interval) {
+    RateRange range;
+    const Ref<Array> readings = safeArrayForKey(self, "_heartRateReadings"_key);
+    if (!readings) return range;
+    for (const Ref<Object>& item : *readings) {
+      const Ref<HeartRateSummaryReading> reading = castAsClass<HeartRateSummaryReading>(item);
+      if (!reading || !reading->date() || !interval.containsDate(*reading->date())) continue;
+      range.include(std::round(safeDoubleForKey(reading->quantity(), "ch_beatsPerMinute"_key)));
+    }
+    return range;
+  }
+};
+
+using C = CHWorkoutDetailHeartRateChartViewAccessibility;
+
+const DataSeriesRegistration<C> registration{
+    "CHWorkoutDetailHeartRateChartViewAccessibility",
+    "CHWorkoutDetailHeartRateChartView",
+    {overrides<&C::_accessibilityDataSeriesName>(messages::_accessibilityDataSeriesName),
+     overrides<&C::_accessibilityShouldUseSlices>(messages::_accessibilityShouldUseSlices),
+     overrides<&C::_accessibilityNumberOfSlices>(messages::_accessibilityNumberOfSlices),
+     overrides<&C::_accessibilityTimeIntervalPerSlice>(messages::_accessibilityTimeIntervalPerSlice),
+     overrides<&C::_accessibilityHoursPerSlice>(messages::_accessibilityHoursPerSlice),
+     overrides<&C::_accessibilityQuantityForSliceAtIndex>(messages::_accessibilityQuantityForSliceAtIndex),
+     overrides<&C::_axDateInterval>(axDateInterval), overrides<&C::_decimalForDate>(decimalForDate)}};
+
+}  // namespace
+
+}  // namespace ax

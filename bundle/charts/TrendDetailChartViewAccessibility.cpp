@@ -1,0 +1,168 @@
+#include <cmath>
+#include <limits>
+
+#include "bundle/charts/TrendChart.h"
+#include "bundle/shared/LocalizedString.h"
+#include "platform/foundation/Formatters.h"
+#include "platform/toolkit/Label.h"
+
+namespace ax {
+
+namespace {
+
+const Message<Ref<Quantity>(std::int32_t)> accessibilityQuantityForIndex{"accessibilityQuantityForIndex:"};
+const Message<Ref<DateInterval>(std::int32_t)> accessibilityDateIntervalForIndex{
+    "accessibilityDateIntervalForIndex:"};
+
+// The smallest and the largest figure of one build. Over no figure at all they stay where they start.
+struct Extremes {
+  double minimum = std::numeric_limits<double>::max();
+  double maximum = std::numeric_limits<double>::min();
+
+  void include(double figure) {
+    if (figure > maximum) maximum = figure;
+    if (figure < minimum) minimum = figure;
+  }
+};
+
+// A trend over time: the title as a header, then one element per bar that has a figure.
+class TrendDetailChartViewAccessibility : public TrendChart<TrendDetailChartViewAccessibility> {
+ public:
+  using TrendChart::TrendChart;
+
+  static GraphSource graphSource() {
+    return {"barStops"_key, "kAXTrendDetailGraphElements"_key, &Number::staticClass()};
+  }
+  static RangeKeys rangeKeys() {
+    return {"kAXTrendDetailGraphCachedMin"_key, "kAXTrendDetailGraphCachedMax"_key};
+  }
+
+  static void _accessibilityPerformValidations(Manager& manager) {
+    constexpr auto target = "Velto.TrendDetailChartView";
+    constexpr auto method = &Manager::validateClassHasInstanceMethodWithFullSignature;
+    (manager.*method)(target, "accessibilityDateIntervalForIndex:", {"@", "i"});
+    (manager.*method)(target, "accessibilityQuantityForIndex:", {"@", "i"});
+    (manager.*method)(target, "layoutSubviews", {"v"});
+    (manager.*method)(target, "titleLabel", {"@"});
+    (manager.*method)(target, "chartMaxLabel", {"@"});
+    (manager.*method)(target, "accessibilityUnit", {"@"});
+    (manager.*method)(target, "barStops", {"@"});
+  }
+
+  Ref<String> _accessibilityDataSeriesName() { return nullptr; }
+
+  Ref<String> _accessibilityDataSeriesTitleForAxis(std::int64_t axis) {
+    if (axis == 0) return accessibilityLocalizedString("trend.time.axis");
+    if (axis != 1) return nullptr;
+    const Ref<Label> top = castAsClass<Label>(safeUIViewForKey(self, "chartMaxLabel"_key));
+    return top ? top->text() : trendUnitString(self);
+  }
+
+  Ref<String> _accessibilityDataSeriesUnitLabelForAxis(std::int64_t axis) {
+    if (axis == 0) return accessibilityLocalizedString("trend.time.unit");
+    return axis == 1 ? trendUnitString(self) : nullptr;
+  }
+
+  // Of the first axis as many as there are elements, the title among them.
+  Ref<Number> _accessibilityDataSeriesMaximumValueForAxis(std::int64_t axis) {
+    if (axis == 0) {
+      const Ref<Array> elements = messages::accessibilityElements(self);
+      return number(std::uint64_t(elements ? elements->count() : 0));
+    }
+    return axis == 1 ? cast<Number>(self._accessibilityValueForKey(rangeKeys().maximum)) : nullptr;
+  }
+
+  Ref<Array> _accessibilityDataSeriesValuesForAxis(std::int64_t axis) {
+    Array::Items values;
+    const std::size_t bars = axis == 0 || axis == 1 ? barCount() : 0;
+    values.reserve(bars);
+    const Ref<Unit> unit = axis == 1 ? trendUnit(self) : nullptr;
+    for (std::size_t i = 0; i < bars; ++i) {
+      values.push_back(axis == 0 ? number(static_cast<std::int32_t>(i)) : roundedFigure(i, unit));
+    }
+    return array(std::move(values));
+  }
+
+  Ref<String> _accessibilityDataSeriesValueDescriptionForPositionAxis(double position, std::int64_t axis) {
+    if (axis == 1) return spokenFigureInRange(self, rangeKeys(), position);
+    return axis == 0 ? spokenDay(position) : nullptr;
+  }
+
+  Ref<Array> accessibilityElements() {
+    return chartElements(self, [this](MutableArray& elements) {
+      elements.reserve(barCount() + 1);
+      const Ref<View> title = safeUIViewForKey(self, "titleLabel"_key);
+      _accessibilityAddTrait(title, TraitHeader);
+      elements.axSafelyAddObject(title);
+      addBars(elements, title ? title->frame().height : 0);
+    });
+  }
+
+ private:
+  std::size_t barCount() {
+    const Ref<Array> stops = messages::_accessibilityGraphData(self);
+    return stops ? stops->count() : 0;
+  }
+
+  Ref<Number> roundedFigure(std::size_t bar, const Ref<Unit>& unit) {
+    const Ref<Quantity> quantity = answerForColumn(accessibilityQuantityForIndex, self, bar);
+    return number(roundedToHundredths(figureInUnit(quantity, unit)));
+  }
+
+  // The first day for the very start of the axis, else the last day of the nearest bar.
+  Ref<String> spokenDay(double position) {
+    const std::int32_t bar = nearestColumn((static_cast<double>(barCount()) - 1) * position);
+    const Ref<DateInterval> days = answerForColumn(accessibilityDateIntervalForIndex, self, bar);
+    const Ref<DateFormatter> formatter = make<DateFormatter>();
+    formatter->setDateStyle(DateFormatterStyle::medium);
+    if (!days) return nullptr;
+    return formatter->stringFromDate(position == 0 ? days->startDate() : days->endDate());
+  }
+
+  void addBars(MutableArray& elements, double titleHeight) {
+    const Ref<DateIntervalFormatter> formatter = make<DateIntervalFormatter>();
+    formatter->setDateTemplate("MMMMdyyyy");
+    const Ref<View> view = castAsClass<View>(self);
+    const Ref<Array> stops = messages::_accessibilityGraphData(self);
+    if (!view || barCount() == 0) return;
+    const double top = 2 * titleHeight;
+    const double width = view->frame().width / static_cast<double>(stops->count());
+    const double height = std::floor(view->frame().height) - top;
+    Extremes extremes;
+    for (std::size_t i = 0; i < stops->count(); ++i) {
+      const Rect frame = {width + static_cast<float>(unboxDouble(stops->at(i))), top, width, height};
+      elements.axSafelyAddObject(barElement(i, frame, *formatter, extremes));
+    }
+    keep(rangeKeys().minimum, extremes.minimum);
+    keep(rangeKeys().maximum, extremes.maximum);
+  }
+
+  Ref<AccessibilityElement> barElement(std::size_t bar, Rect frame, const DateIntervalFormatter& formatter,
+                                       Extremes& extremes) {
+    const Ref<Quantity> quantity = answerForColumn(accessibilityQuantityForIndex, self, bar);
+    const Ref<DateInterval> days = answerForColumn(accessibilityDateIntervalForIndex, self, bar);
+    const Ref<Unit> unit = trendUnit(self);
+    if (!quantity || !days || !unit || !quantity->isCompatibleWithUnit(unit)) return nullptr;
+    const double figure = quantity->doubleValueForUnit(unit);
+    extremes.include(figure);
+    return chartElement(self, frame, formatter.stringFromDateInterval(*days), spokenFigure(figure, unit));
+  }
+
+  void keep(Key key, double figure) {
+    self._accessibilitySetRetainedValueForKey(number(roundedToHundredths(figure)), key);
+  }
+};
+
+using C = TrendDetailChartViewAccessibility;
+
+const DataSeriesRegistration<C> registration{
+    "TrendDetailChartViewAccessibility",
+    "Velto.TrendDetailChartView",
+    {overrides<&C::_accessibilityDataSeriesName>(messages::_accessibilityDataSeriesName),
+     overrides<&C::_accessibilityDataSeriesValueDescriptionForPositionAxis>(
+         messages::_accessibilityDataSeriesValueDescriptionForPositionAxis),
+     overrides<&C::layoutSubviews>(messages::layoutSubviews)}};
+
+}  // namespace
+
+}  // namespace ax

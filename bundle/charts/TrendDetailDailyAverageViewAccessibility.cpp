@@ -1,0 +1,156 @@
+#include <cmath>
+
+#include "bundle/charts/TrendChart.h"
+#include "bundle/shared/LocalizedString.h"
+#include "platform/foundation/Formatters.h"
+#include "platform/runtime/Boxing.h"
+
+namespace ax {
+
+namespace {
+
+constexpr std::size_t daysOfWeek = 7;
+
+const Message<Ref<Quantity>(std::int32_t)> quantity365ForIndex{"accessibiliytQuantity365ForIndex:"};
+const Message<Ref<Quantity>(std::int32_t)> quantity90ForIndex{"accessibiliytQuantity90ForIndex:"};
+const Message<Ref<Object>(std::int32_t)> accessibilityDayForStopIndex{"accessibilityDayForStopIndex:"};
+const Message<std::int32_t()> intValue{"intValue"};
+const Message<Ref<String>(std::int64_t, Ref<DateFormatter>)> axLabelForIndex{
+    "_axLabelForIndex:withFormatter:"};
+const Message<Ref<String>(std::int64_t, Ref<DateFormatter>)> axDayStringForIndex{
+    "_axDayStringForIndex:withFormatter:"};
+
+// A trend by day of the week: the title as a header, then one element per day with both averages. As a
+// series it has two bars a day, the longer average before the shorter.
+class TrendDetailDailyAverageViewAccessibility : public TrendChart<TrendDetailDailyAverageViewAccessibility> {
+ public:
+  using TrendChart::TrendChart;
+
+  static GraphSource graphSource() {
+    return {"dayStops"_key, "kAXTrendDetailDailyAveragesGraphElements"_key, &Number::staticClass()};
+  }
+  static RangeKeys rangeKeys() {
+    return {"kAXTrendDailyDetailGraphCachedMin"_key, "kAXTrendDailyDetailGraphCachedMax"_key};
+  }
+
+  static void _accessibilityPerformValidations(Manager& manager) {
+    constexpr auto target = "Velto.TrendDetailDailyAverageView";
+    constexpr auto method = &Manager::validateClassHasInstanceMethodWithFullSignature;
+    (manager.*method)(target, "accessibiliytQuantity365ForIndex:", {"@", "i"});
+    (manager.*method)(target, "accessibiliytQuantity90ForIndex:", {"@", "i"});
+    (manager.*method)(target, "accessibilityDayForStopIndex:", {"@", "i"});
+    (manager.*method)(target, "layoutSubviews", {"v"});
+    (manager.*method)(target, "titleLabel", {"@"});
+    (manager.*method)(target, "dayStops", {"@"});
+    (manager.*method)(target, "accessibilityUnit", {"@"});
+  }
+
+  Ref<String> _accessibilityDataSeriesTitleForAxis(std::int64_t axis) {
+    if (axis == 0) return accessibilityLocalizedString("trend.daily.axis");
+    return axis == 1 ? trendUnitString(self) : nullptr;
+  }
+
+  Ref<String> _accessibilityDataSeriesUnitLabelForAxis(std::int64_t axis) {
+    return axis == 1 ? trendUnitString(self) : nullptr;
+  }
+
+  Ref<Number> _accessibilityDataSeriesMaximumValueForAxis(std::int64_t axis) {
+    if (axis == 0) return number(6);
+    return axis == 1 ? cast<Number>(self._accessibilityValueForKey(rangeKeys().maximum)) : nullptr;
+  }
+
+  Ref<Array> _accessibilityDataSeriesValuesForAxis(std::int64_t axis) {
+    const Ref<Unit> unit = trendUnit(self);
+    Array::Items values;
+    for (std::size_t day = 0; day < daysOfWeek && (axis == 0 || axis == 1); ++day) {
+      const auto place = static_cast<double>(day);
+      values.push_back(number(axis == 0 ? place : average(quantity365ForIndex, day, unit)));
+      values.push_back(number(axis == 0 ? place + 0.1 : average(quantity90ForIndex, day, unit)));
+    }
+    return array(std::move(values));
+  }
+
+  Ref<String> _accessibilityDataSeriesValueDescriptionForPositionAxis(double position, std::int64_t axis) {
+    if (axis == 0) return axDayStringForIndex(self, nearestColumn(position * 6), make<DateFormatter>());
+    return axis == 1 && trendUnit(self) ? spokenFigureInRange(self, rangeKeys(), position) : nullptr;
+  }
+
+  Ref<Array> accessibilityElements() {
+    return chartElements(self, [this](MutableArray& elements) {
+      const Ref<View> title = safeUIViewForKey(self, "titleLabel"_key);
+      _accessibilityAddTrait(title, TraitHeader);
+      elements.axSafelyAddObject(title);
+      addDays(elements, title ? title->frame().height : 0);
+    });
+  }
+
+  Ref<String> _axDayStringForIndexWithFormatter(std::int64_t index, Ref<DateFormatter> formatter) {
+    std::int32_t weekday = 0;
+    performSafeBlock(
+        [&] { weekday = intValue(accessibilityDayForStopIndex(self, static_cast<std::int32_t>(index))); });
+    if (weekday < 1 || !formatter) return nullptr;
+    return cast<String>(formatter->weekdaySymbols()->at(static_cast<std::size_t>(weekday) - 1));
+  }
+
+  Ref<String> _axLabelForIndexWithFormatter(std::int64_t index, Ref<DateFormatter> formatter) {
+    const Ref<Unit> unit = trendUnit(self);
+    if (!unit) return nullptr;
+    const Ref<String> day = axDayStringForIndex(self, index, formatter);
+    const double average90 = average(quantity90ForIndex, static_cast<std::size_t>(index), unit);
+    const double average365 = average(quantity365ForIndex, static_cast<std::size_t>(index), unit);
+    widenRange(average90, average365);
+    return stringForVariables({day, accessibilityLocalizedString("trends.365.day.average"),
+                               spokenFigure(average365, unit),
+                               accessibilityLocalizedString("trends.90.day.average"),
+                               spokenFigure(average90, unit), stringForVariablesSentinel});
+  }
+
+ private:
+  double average(const Message<Ref<Quantity>(std::int32_t)>& which, std::size_t day, const Ref<Unit>& unit) {
+    return roundedToHundredths(figureInUnit(answerForColumn(which, self, day), unit));
+  }
+
+  // Beside a figure that is no number the other one counts alone.
+  void widenRange(double a, double b) {
+    if (std::isnan(a) && std::isnan(b)) return;
+    keepIf<std::greater<>>(rangeKeys().minimum, std::fmin(a, b));
+    keepIf<std::less<>>(rangeKeys().maximum, std::fmax(a, b));
+  }
+
+  template <class Outdone>
+  void keepIf(Key key, double figure) {
+    const Ref<Object> kept = self._accessibilityValueForKey(key);
+    if (kept && !Outdone()(unboxDouble(kept), figure)) return;
+    self._accessibilitySetRetainedValueForKey(number(figure), key);
+  }
+
+  void addDays(MutableArray& elements, double titleHeight) {
+    const Ref<DateFormatter> formatter = make<DateFormatter>();
+    const Ref<View> view = castAsClass<View>(self);
+    const Ref<Array> stops = messages::_accessibilityGraphData(self);
+    if (!view || !stops || stops->count() != daysOfWeek) return;
+    const double top = 2 * titleHeight;
+    const double height = std::floor(static_cast<float>(view->frame().height)) - top;
+    const float width = unbox<float>(stops->at(1)) - unbox<float>(stops->at(0));
+    for (std::size_t i = 0; i < daysOfWeek; ++i) {
+      const Ref<String> label = axLabelForIndex(self, static_cast<std::int64_t>(i), formatter);
+      const Rect frame = {unbox<float>(stops->at(i)), top, width, height};
+      if (label) elements.axSafelyAddObject(chartElement(self, frame, label, nullptr));
+    }
+  }
+};
+
+using C = TrendDetailDailyAverageViewAccessibility;
+
+const DataSeriesRegistration<C> registration{
+    "TrendDetailDailyAverageViewAccessibility",
+    "Velto.TrendDetailDailyAverageView",
+    {overrides<&C::_accessibilityDataSeriesValueDescriptionForPositionAxis>(
+         messages::_accessibilityDataSeriesValueDescriptionForPositionAxis),
+     overrides<&C::layoutSubviews>(messages::layoutSubviews),
+     overrides<&C::_axLabelForIndexWithFormatter>(axLabelForIndex),
+     overrides<&C::_axDayStringForIndexWithFormatter>(axDayStringForIndex)}};
+
+}  // namespace
+
+}  // namespace ax
