@@ -45,4 +45,11 @@ void* LoadedBundle::symbol(const std::string& name) const {
   return dlsym(handle_, name.c_str());
 }
 
+void* LoadedBundle::exportedSymbol(const std::string& name) {
+  for (void* module : openModules()) {
+    if (void* found = dlsym(module, name.c_str())) return found;
+  }
+  return nullptr;
+}
+
 }  // namespace ax
