@@ -1,0 +1,81 @@
+#include "bundle/achievements/TextLines.h"
+#include "bundle/core/Category.h"
+#include "bundle/shared/LocalizedString.h"
+#include "platform/foundation/Formatters.h"
+
+namespace ax {
+
+namespace {
+
+const Message<void()> axAnnotateAchievementView{"_axAnnotateAchievementView"};
+const Message<Ref<Object>(Ref<Object>)> titleForAchievement{"titleForAchievement:"};
+
+// The screen of one achievement: the container of the badge speaks for it, and the text speaks all its lines.
+class CHAchievementDetailViewControllerAccessibility
+    : public SafeCategory<CHAchievementDetailViewControllerAccessibility> {
+ public:
+  using SafeCategory::SafeCategory;
+
+  static void _accessibilityPerformValidations(Manager& manager) {
+    constexpr auto target = "CHAchievementDetailViewController";
+    manager.validateClassHasInstanceVariableWithType(target, "_achievement", "ACHAchievement");
+    manager.validateClassHasInstanceMethodWithFullSignature(target, "label", {"@"});
+    manager.validateClassHasInstanceMethodWithFullSignature(target, "badgeContainer", {"@"});
+    manager.validateClassHasInstanceMethodWithFullSignature(target, "viewDidLoad", {"v"});
+    manager.validateClassHasInstanceVariableWithType(target, "_locProvider",
+                                                     "ODUIAchievementLocalizationProvider");
+    manager.validateClassHasInstanceMethodWithFullSignature("ODUIAchievementLocalizationProvider",
+                                                            "titleForAchievement:", {"@", "@"});
+  }
+
+  void viewDidLoad() {
+    super(messages::viewDidLoad);
+    axAnnotateAchievementView(self);
+  }
+
+  void _accessibilityLoadAccessibilityInformation() {
+    super(messages::_accessibilityLoadAccessibilityInformation);
+    axAnnotateAchievementView(self);
+  }
+
+  void _axAnnotateAchievementView() {
+    const Ref<String> title = achievementTitle();
+    if (!isEmpty(title)) annotateBadgeContainer(title);
+    const Ref<Label> label = castAsClass<Label>(self.safeValueForKey("label"_key));
+    const Ref<String> text = label ? label->text() : nullptr;
+    if (!isEmpty(text)) messages::setAccessibilityLabel(label, labelForLines(*text));
+  }
+
+ private:
+  Ref<String> achievementTitle() {
+    const Ref<Object> achievement = self.safeValueForKey("_achievement"_key);
+    Ref<Object> title;
+    performSafeBlock(
+        [&] { title = titleForAchievement(self.safeValueForKey("_locProvider"_key), achievement); });
+    return castAsClass<String>(title);
+  }
+
+  // The container may be transparent while the badge flips in.
+  void annotateBadgeContainer(const Ref<String>& title) {
+    const Ref<View> container = safeUIViewForKey(self, "badgeContainer"_key);
+    messages::setIsAccessibilityElement(container, true);
+    messages::setAccessibilityLabel(
+        container, stringWithFormat(accessibilityLocalizedString("achievement.badge.format"), {title}));
+    _accessibilitySetViewIsVisible(container, true);
+    _accessibilitySetOverridesInvisibility(container, true);
+  }
+};
+
+using C = CHAchievementDetailViewControllerAccessibility;
+
+const CategoryRegistration<C> registration{
+    "CHAchievementDetailViewControllerAccessibility",
+    "CHAchievementDetailViewController",
+    {overrides<&C::viewDidLoad>(messages::viewDidLoad),
+     overrides<&C::_accessibilityLoadAccessibilityInformation>(
+         messages::_accessibilityLoadAccessibilityInformation),
+     overrides<&C::_axAnnotateAchievementView>(axAnnotateAchievementView)}};
+
+}  // namespace
+
+}  // namespace ax

@@ -1,0 +1,50 @@
+#include <cmath>
+
+#include "bundle/core/Category.h"
+#include "bundle/shared/LocalizedString.h"
+#include "platform/foundation/Formatters.h"
+#include "platform/health/Quantity.h"
+
+namespace ax {
+
+namespace {
+
+const Message<void(Ref<Object>, Ref<Object>, double)> setBriskMinutes{"setBriskMinutes:goal:percent:"};
+
+// The exercise ring's chart: the figure is spoken as minutes out of the goal.
+class ExerciseChartDetailCellAccessibility : public SafeCategory<ExerciseChartDetailCellAccessibility> {
+ public:
+  using SafeCategory::SafeCategory;
+
+  static void _accessibilityPerformValidations(Manager& manager) {
+    constexpr auto target = "ExerciseChartDetailCell";
+    manager.validateClassIsKindOfClass(target, "ChartDetailCell");
+    manager.validateClassHasInstanceMethodWithFullSignature(
+        target, "setBriskMinutes: goal: percent:", {"v", "@", "@", "d"});
+    manager.validateClassHasInstanceVariableWithType("ChartDetailCell", "_value", "Label");
+  }
+
+  void setBriskMinutesGoalPercent(Ref<Object> briskMinutes, Ref<Object> goal, double percent) {
+    super(setBriskMinutes, briskMinutes, goal, percent);
+    messages::setAccessibilityLabel(self.safeValueForKey("_value"_key),
+                                    stringWithFormat(accessibilityLocalizedString("minutes.format.out.of"),
+                                                     {wholeMinutes(briskMinutes), wholeMinutes(goal)}));
+  }
+
+ private:
+  static Ref<String> wholeMinutes(const Ref<Object>& time) {
+    const Ref<Quantity> quantity = castAsClass<Quantity>(time);
+    const double minutes = quantity ? quantity->doubleValueForUnit(Unit::minuteUnit()) : 0;
+    return formatInteger(number(std::round(minutes))->int64Value());
+  }
+};
+
+using C = ExerciseChartDetailCellAccessibility;
+
+const CategoryRegistration<C> registration{"ExerciseChartDetailCellAccessibility",
+                                           "ExerciseChartDetailCell",
+                                           {overrides<&C::setBriskMinutesGoalPercent>(setBriskMinutes)}};
+
+}  // namespace
+
+}  // namespace ax

@@ -1,0 +1,77 @@
+#include "bundle/core/Category.h"
+#include "platform/accessibility/Notifications.h"
+#include "platform/toolkit/Control.h"
+#include "platform/toolkit/ScrollView.h"
+
+namespace ax {
+
+namespace {
+
+const Message<Ref<Object>()> axScrollView{"_axScrollView"};
+const Message<void()> axUpdateStateForDetailView{"_axUpdateStateForDetailView"};
+
+// A page control in a cell with a chart: when it is adjusted, the chart turns to the page.
+class VeltoUIPageControlAccessibility : public SafeCategory<VeltoUIPageControlAccessibility> {
+ public:
+  using SafeCategory::SafeCategory;
+
+  static void _accessibilityPerformValidations(Manager& manager) {
+    manager.validateClass("ChartDetailCell");
+    manager.validateClassHasInstanceVariableWithType("ChartDetailCell", "_scrollview", "ScrollView");
+    manager.validateClass("CHWorkoutDetailHeartRateChartTableViewCell");
+    manager.validateClassHasInstanceVariableWithType("CHWorkoutDetailHeartRateChartTableViewCell",
+                                                     "_scrollView", "ScrollView");
+  }
+
+  void accessibilityIncrement() {
+    super(messages::accessibilityIncrement);
+    axUpdateStateForDetailView(self);
+  }
+
+  void accessibilityDecrement() {
+    super(messages::accessibilityDecrement);
+    axUpdateStateForDetailView(self);
+  }
+
+  // The two kinds of cell name their scroll view differently.
+  Ref<Object> _axScrollView() {
+    if (const Ref<Object> cell = enclosing("ChartDetailCell"))
+      return castAsClass<ScrollView>(cell->safeValueForKey("_scrollview"_key));
+    if (const Ref<Object> cell = enclosing("CHWorkoutDetailHeartRateChartTableViewCell"))
+      return castAsClass<ScrollView>(cell->safeValueForKey("_scrollView"_key));
+    return nullptr;
+  }
+
+  void _axUpdateStateForDetailView() {
+    const Ref<ScrollView> scrollView = cast<ScrollView>(axScrollView(self));
+    const Ref<PageControl> pages = castAsClass<PageControl>(self);
+    const std::int64_t page = pages ? pages->currentPage() : 0;
+    if (scrollView) {
+      scrollView->setContentOffset(
+          {scrollView->bounds().width * static_cast<double>(page), scrollView->contentOffset().y});
+    }
+    if (pages) pages->setCurrentPage(page);
+    postNotification(LayoutChangedNotification);
+  }
+
+ private:
+  Ref<Object> enclosing(std::string_view className) {
+    const Class* cellClass = safeClassFromString(className);
+    return _accessibilityFindAncestor(
+        self, [&](Object& object) { return object.isKindOf(cellClass); }, false);
+  }
+};
+
+using C = VeltoUIPageControlAccessibility;
+
+const CategoryRegistration<C> registration{
+    "VeltoUIPageControlAccessibility",
+    "PageControl",
+    {overrides<&C::accessibilityIncrement>(messages::accessibilityIncrement),
+     overrides<&C::accessibilityDecrement>(messages::accessibilityDecrement),
+     overrides<&C::_axScrollView>(axScrollView),
+     overrides<&C::_axUpdateStateForDetailView>(axUpdateStateForDetailView)}};
+
+}  // namespace
+
+}  // namespace ax

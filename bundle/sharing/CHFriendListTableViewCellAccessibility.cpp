@@ -1,0 +1,71 @@
+#include "bundle/core/Category.h"
+#include "bundle/shared/LocalizedString.h"
+#include "platform/toolkit/TableViewCell.h"
+
+namespace ax {
+
+namespace {
+
+const Message<void(Ref<Object>, Ref<Object>, Ref<Object>, bool)> setFriend{
+    "setFriend:snapshot:formattingManager:animated:"};
+
+// The row of one friend: one element, labelled anew each time the list shows a friend in it.
+class CHFriendListTableViewCellAccessibility : public SafeCategory<CHFriendListTableViewCellAccessibility> {
+ public:
+  using SafeCategory::SafeCategory;
+
+  static void _accessibilityPerformValidations(Manager& manager) {
+    constexpr auto target = "CHFriendListTableViewCell";
+    manager.validateClassIsKindOfClass(target, "TableViewCell");
+    manager.validateClassHasInstanceMethodWithFullSignature(target, "detailLineOneLabel", {"@"});
+    manager.validateClassHasInstanceMethodWithFullSignature(target, "detailLineTwoLabel", {"@"});
+    manager.validateClassHasInstanceMethodWithFullSignature(target, "competitionBadgeView", {"@"});
+    manager.validateClassHasInstanceMethodWithFullSignature(
+        target, "setFriend:snapshot:formattingManager:animated:", {"v", "@", "@", "@", "B"});
+  }
+
+  bool isAccessibilityElement() { return true; }
+
+  void setFriendSnapshotFormattingManagerAnimated(Ref<Object> shown, Ref<Object> snapshot,
+                                                  Ref<Object> formattingManager, bool animated) {
+    super(setFriend, shown, snapshot, formattingManager, animated);
+    messages::_accessibilityLoadAccessibilityInformation(self);
+  }
+
+  void _accessibilityLoadAccessibilityInformation() {
+    super(messages::_accessibilityLoadAccessibilityInformation);
+    const Ref<TableViewCell> cell = castAsClass<TableViewCell>(self);
+    const Ref<Label> name = cell ? cell->textLabel() : nullptr;
+    if (!name) return;
+    const Ref<Object> lineOne = self.safeValueForKey("detailLineOneLabel"_key);
+    const Ref<Object> lineTwo = self.safeValueForKey("detailLineTwoLabel"_key);
+    const Ref<Object> badge = self.safeValueForKey("competitionBadgeView"_key);
+    messages::setIsAccessibilityElement(badge, true);
+    messages::setAccessibilityLabel(badge, accessibilityLocalizedString("competition.in.progress"));
+    speakWithoutBullets(*name);
+    messages::setAccessibilityLabel(
+        self, labelForElements(axArrayByIgnoringNilElementsWithCount(4, {name, lineOne, lineTwo, badge})));
+  }
+
+ private:
+  static void speakWithoutBullets(Label& label) {
+    _setAccessibilityLabelBlock(label, [weakLabel = Weak<Label>(label)]() -> Ref<String> {
+      const Ref<Label> shown = weakLabel.lock();
+      return shown ? stringByRemoving(shown->text(), "\u2022") : nullptr;
+    });
+  }
+};
+
+using C = CHFriendListTableViewCellAccessibility;
+
+const CategoryRegistration<C> registration{
+    "CHFriendListTableViewCellAccessibility",
+    "CHFriendListTableViewCell",
+    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
+     overrides<&C::setFriendSnapshotFormattingManagerAnimated>(setFriend),
+     overrides<&C::_accessibilityLoadAccessibilityInformation>(
+         messages::_accessibilityLoadAccessibilityInformation)}};
+
+}  // namespace
+
+}  // namespace ax

@@ -1,0 +1,34 @@
+#include "bundle/core/Category.h"
+#include "bundle/shared/LocalizedString.h"
+#include "platform/toolkit/Control.h"
+
+namespace ax {
+
+namespace {
+
+// The row that sorts the friends: its button says what it is for.
+class FriendListSortTableViewCellAccessibility
+    : public SafeCategory<FriendListSortTableViewCellAccessibility> {
+ public:
+  using SafeCategory::SafeCategory;
+
+  static void _accessibilityPerformValidations(Manager&) {}
+
+  void _accessibilityLoadAccessibilityInformation() {
+    super(messages::_accessibilityLoadAccessibilityInformation);
+    const Ref<Array> buttons = _accessibilityFindUnsortedDescendantsPassingTest(
+        self, [](Object& object) { return cast<Button>(&object) != nullptr; });
+    messages::setAccessibilityLabel(buttons->firstObject(), accessibilityLocalizedString("sort.button"));
+  }
+};
+
+using C = FriendListSortTableViewCellAccessibility;
+
+const CategoryRegistration<C> registration{"FriendListSortTableViewCellAccessibility",
+                                           "Velto.FriendListSortTableViewCell",
+                                           {overrides<&C::_accessibilityLoadAccessibilityInformation>(
+                                               messages::_accessibilityLoadAccessibilityInformation)}};
+
+}  // namespace
+
+}  // namespace ax
