@@ -8,4 +8,15 @@ void addUnplaced(View& parent, std::initializer_list<Ref<View>> parts) {
   }
 }
 
+void addUnplaced(View& parent, const Ref<View>& part, Rect frame) {
+  if (!part || part->superview() != nullptr) return;
+  if (part->frame() == Rect()) part->setFrame(frame);
+  parent.addSubview(part);
+}
+
+Rect columnOf(const View& view, std::size_t index, std::size_t count) {
+  const double width = view.frame().width / static_cast<double>(count);
+  return {static_cast<double>(index) * width, 0, width, view.frame().height};
+}
+
 }  // namespace ax::host

@@ -10,4 +10,10 @@ namespace ax::host {
 // may call it again and again.
 void addUnplaced(View& parent, std::initializer_list<Ref<View>> parts);
 
+// The same for one part, which gets the frame unless it has one of its own.
+void addUnplaced(View& parent, const Ref<View>& part, Rect frame);
+
+// One of several equal columns of a view, counted from 0, in the view's own space.
+Rect columnOf(const View& view, std::size_t index, std::size_t count);
+
 }  // namespace ax::host
