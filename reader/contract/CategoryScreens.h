@@ -1,11 +1,13 @@
 #pragma once
 
+#include <string>
 #include <string_view>
+#include <vector>
 
 namespace ax::reader {
 
-// The screen that a category speaks for: "Workout detail". "Every screen" for one that is not known, and for
-// the empty name, which stands for the bundle as a whole.
-std::string_view screenOfCategory(std::string_view category);
+// The screens that a category speaks for, such as "Workout detail"; of the empty name those that rely on the
+// checks of the bundle as a whole. None for a category that is not known.
+std::vector<std::string> screensOfCategory(std::string_view category);
 
 }  // namespace ax::reader

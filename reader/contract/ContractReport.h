@@ -26,8 +26,9 @@ class ContractReport {
   static ContractReport ofProcess();
   explicit ContractReport(const ValidationManager& manager);
 
+  std::size_t failures() const;
   // Whether every check passed.
-  bool holds() const;
+  bool holds() const { return failures() == 0; }
   const std::string& target() const { return target_; }
   const std::vector<ContractFinding>& findings() const { return findings_; }
   // The screens of the failed checks, none twice.
@@ -35,7 +36,7 @@ class ContractReport {
   std::size_t installed() const { return installed_; }
   std::size_t requested() const { return requested_; }
 
-  // One line per check, then the sums.
+  // One line per check that passed, three per check that failed, then the sums.
   std::string text() const;
   nlohmann::ordered_json json() const;
 

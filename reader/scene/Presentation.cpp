@@ -1,0 +1,43 @@
+#include "reader/scene/Presentation.h"
+
+#include "platform/runtime/KeyReading.h"
+#include "platform/toolkit/ViewController.h"
+#include "reader/scene/Raised.h"
+
+namespace ax::reader {
+
+template <class M>
+void Presentation::send(const M& message, const Ref<Object>& receiver) {
+  const auto raised = raisedBy([&] { message(receiver); });
+  if (!raised) return;
+  hostFaults_.push_back(receiver->isa().name() + " " + std::string(message.selector().name()) + ": " +
+                        *raised);
+}
+
+void Presentation::present(const Ref<Object>& screen) {
+  const bool isController = cast<ViewController>(screen.get()) != nullptr;
+  if (isController) {
+    send(messages::loadView, screen);
+    send(messages::viewDidLoad, screen);
+  }
+  const Ref<View> view = isController ? safeUIViewForKey(screen, "view"_key) : cast<View>(screen);
+  if (view) {
+    layOut(view);
+    loadAccessibility(view);
+  }
+  if (isController) send(messages::_accessibilityLoadAccessibilityInformation, screen);
+}
+
+void Presentation::layOut(const Ref<View>& view) {
+  send(messages::layoutSubviews, view);
+  const std::vector<Ref<View>> children = view->subviews();
+  for (const Ref<View>& child : children) layOut(child);
+}
+
+void Presentation::loadAccessibility(const Ref<View>& view) {
+  const std::vector<Ref<View>> children = view->subviews();
+  for (const Ref<View>& child : children) loadAccessibility(child);
+  send(messages::_accessibilityLoadAccessibilityInformation, view);
+}
+
+}  // namespace ax::reader

@@ -1,0 +1,115 @@
+#include "reader/scene/SceneRun.h"
+
+#include "platform/accessibility/Notifications.h"
+#include "platform/accessibility/ValidationManager.h"
+#include "platform/health/ActivitySummary.h"
+#include "platform/runtime/Message.h"
+#include "reader/scene/ObjectBuilder.h"
+#include "reader/scene/Omissions.h"
+#include "reader/scene/Presentation.h"
+#include "reader/scene/StepRunner.h"
+
+namespace ax::reader {
+
+namespace {
+
+using Json = nlohmann::ordered_json;
+
+constexpr const char* principalClass = "AXVeltoGlue";
+
+// Nothing is kept by a host that lost its cache, or a member of it.
+void keepDay(const SceneDay& day) {
+  static const Message<Ref<Object>()> sharedInstance{"sharedInstance"};
+  static const Message<void(Ref<Object>, std::int64_t)> setSummaryForCacheIndex{"setSummary:forCacheIndex:"};
+  const Ref<ActivitySummary> summary = make<ActivitySummary>();
+  summary->setFractions(day.move, day.exercise, day.stand);
+  setSummaryForCacheIndex(sharedInstance(Class::named("ActivitySummaryCache")), summary, day.index);
+}
+
+Json postedJson(const StepRunner& runner) {
+  Json list = Json::array();
+  for (const PostedNotification& posted : postedNotifications()) {
+    list.push_back(
+        {{"name", notificationName(posted.notification)}, {"argument", runner.asJson(posted.argument)}});
+  }
+  return list;
+}
+
+Json assertionsJson() {
+  Json list = Json::array();
+  for (const FailedAssertion& failed : failedAssertions()) {
+    list.push_back({{"message", failed.message},
+                    {"source", failed.source},
+                    {"line", failed.line},
+                    {"function", failed.function}});
+  }
+  return list;
+}
+
+Json contractFailuresJson() {
+  Json list = Json::array();
+  for (const ContractCheck& check : ValidationManager::sharedInstance()->failedChecks()) {
+    list.push_back({{"category", check.category.empty() ? Json() : Json(check.category)},
+                    {"check", check.description()},
+                    {"expected", check.expected},
+                    {"found", check.found}});
+  }
+  return list;
+}
+
+}  // namespace
+
+SceneRun::SceneRun(const Scene& scene, const SceneRunOptions& options)
+    : scene_(scene), builder_(std::make_unique<ObjectBuilder>(scene.file)) {
+  forgetReports();
+  scene.environment.apply(Environment());
+  for (const std::string& name : options.without) checkOmission({"", name}, "--without");
+  for (const HostOmission& omission : scene.without) takeAway(omission.name);
+  for (const std::string& name : options.without) takeAway(name);
+  if (!options.modulePath.empty()) openBundle(options.modulePath);
+  for (const SceneDay& day : scene.days) keepDay(day);
+  makeObjects();
+  if (!screen_) return;
+  Presentation presentation;
+  presentation.present(screen_);
+  hostFaults_ = presentation.hostFaults();
+}
+
+SceneRun::~SceneRun() = default;
+
+void SceneRun::openBundle(const std::string& modulePath) {
+  std::string error;
+  bundle_ = LoadedBundle::open(modulePath, principalClass, error);
+  if (!bundle_) throw Fault{modulePath, "", error, "an accessibility bundle"};
+  bundle_->start();
+}
+
+void SceneRun::makeObjects() {
+  for (const SceneObject& object : scene_.objects) builder_->allocate(object);
+  if (scene_.screen) builder_->allocate(*scene_.screen);
+  for (const SceneObject& object : scene_.objects) objects_.push_back(builder_->build(object));
+  if (scene_.screen) screen_ = builder_->build(*scene_.screen);
+}
+
+Ref<Object> SceneRun::objectWithId(const std::string& id) const {
+  return builder_->table().withId(id);
+}
+
+const std::string& SceneRun::idOf(const Object& object) const {
+  return builder_->table().idOf(object);
+}
+
+Json SceneRun::runSteps() {
+  StepRunner runner(*builder_, bundle_.get());
+  Json results = Json::array();
+  for (std::size_t i = 0; i < scene_.steps.size(); ++i) {
+    Json result = runner.run(scene_.steps[i], i);
+    if (!result.is_null()) results.push_back(std::move(result));
+  }
+  return {{"results", std::move(results)},
+          {"notifications", postedJson(runner)},
+          {"assertions", assertionsJson()},
+          {"contractFailures", contractFailuresJson()}};
+}
+
+}  // namespace ax::reader
