@@ -25,9 +25,10 @@ void writeMember(Object& object, const std::string& key, const Ref<Object>& valu
                  const std::string& file) {
   const Class& declaring = object.isa();
   if (const InstanceVariable* variable = declaring.instanceVariableEvenIfHidden(Selector::intern(key))) {
-    const bool isObject = Class::namedEvenIfHidden(variable->type) != nullptr;
-    if ((isObject || fits(value, variable->type)) && variable->write(object, value)) return;
-    throw Fault{file, place, classOf(value) + " for " + key, expectedFor(variable->type)};
+    const std::string type = variable->type();
+    const bool isObject = Class::namedEvenIfHidden(type) != nullptr;
+    if ((isObject || fits(value, type)) && variable->write(object, value)) return;
+    throw Fault{file, place, classOf(value) + " for " + key, expectedFor(type)};
   }
   const Selector setter = Selector::intern(setterName(key));
   const Method& method = declaring.lookUp(setter);
