@@ -1,0 +1,42 @@
+#include "bundle/core/Category.h"
+#include "platform/foundation/AttributedString.h"
+#include "platform/foundation/Number.h"
+
+namespace ax {
+
+namespace {
+
+const Message<Ref<Object>(Ref<Object>, Ref<Object>)> formattedDurationForWorkoutContext{
+    "formattedDurationForWorkout:context:"};
+
+// Gives every duration that the host writes a spoken form that is read as one.
+class CHWorkoutFormattingManagerAccessibility : public SafeCategory<CHWorkoutFormattingManagerAccessibility> {
+ public:
+  using SafeCategory::SafeCategory;
+
+  static void _accessibilityPerformValidations(Manager& manager) {
+    manager.validateClassHasInstanceMethodWithFullSignature(
+        "CHWorkoutFormattingManager", "formattedDurationForWorkout:context:", {"@", "@", "@"});
+  }
+
+  Ref<Object> formattedDurationForWorkoutContext(Ref<Object> workout, Ref<Object> context) {
+    const Ref<Object> result = super(ax::formattedDurationForWorkoutContext, workout, context);
+    const Ref<AttributedString> formatted = castAsClass<AttributedString>(result);
+    if (!formatted || isEmpty(formatted->string())) return result;
+    const auto spoken = AccessibilityAttributedString::initWithString(formatted->string());
+    spoken->setAttributeForKey(number(true), DurationTimeHHMMSS);
+    messages::setAccessibilityLabel(formatted, spoken);
+    return result;
+  }
+};
+
+using C = CHWorkoutFormattingManagerAccessibility;
+
+const CategoryRegistration<C> registration{
+    "CHWorkoutFormattingManagerAccessibility",
+    "CHWorkoutFormattingManager",
+    {overrides<&C::formattedDurationForWorkoutContext>(ax::formattedDurationForWorkoutContext)}};
+
+}  // namespace
+
+}  // namespace ax

@@ -1,0 +1,55 @@
+#include "bundle/core/Category.h"
+#include "bundle/workouts/SummaryLabelAttribute.h"
+#include "platform/foundation/AttributedString.h"
+#include "platform/toolkit/TableViewCell.h"
+
+namespace ax {
+
+namespace {
+
+const Message<void()> updateUI{"_updateUI"};
+
+// The summary on top of a workout: all its figures, the duration spoken as one.
+class CHWorkoutSummaryTableViewCellAccessibility
+    : public SafeCategory<CHWorkoutSummaryTableViewCellAccessibility> {
+ public:
+  using SafeCategory::SafeCategory;
+
+  static void _accessibilityPerformValidations(Manager& manager) {
+    constexpr auto target = "CHWorkoutSummaryTableViewCell";
+    manager.validateClassHasInstanceVariableWithType(target, "_durationLabel",
+                                                     "_CHWorkoutSummaryTabbedLabelContainer");
+    manager.validateClassHasInstanceMethodWithFullSignature(target, "_updateUI", {"v"});
+  }
+
+  Ref<String> accessibilityLabel() {
+    const Ref<TableViewCell> cell = castAsClass<TableViewCell>(self);
+    if (!cell || cell->contentView()->subviews().empty()) return super(messages::accessibilityLabel);
+    return labelForElements(cell->contentView()->subviewArray());
+  }
+
+  void _accessibilityLoadAccessibilityInformation() {
+    super(messages::_accessibilityLoadAccessibilityInformation);
+    const Ref<Object> duration =
+        safeClass("_CHWorkoutSummaryTabbedLabelContainer", self.safeValueForKey("_durationLabel"_key));
+    messages::_accessibilitySetLabelAttribute(duration, string(std::string(DurationTimeHHMMSS.name())));
+  }
+
+  void _updateUI() {
+    super(updateUI);
+    messages::_accessibilityLoadAccessibilityInformation(self);
+  }
+};
+
+using C = CHWorkoutSummaryTableViewCellAccessibility;
+
+const CategoryRegistration<C> registration{"CHWorkoutSummaryTableViewCellAccessibility",
+                                           "CHWorkoutSummaryTableViewCell",
+                                           {overrides<&C::accessibilityLabel>(messages::accessibilityLabel),
+                                            overrides<&C::_accessibilityLoadAccessibilityInformation>(
+                                                messages::_accessibilityLoadAccessibilityInformation),
+                                            overrides<&C::_updateUI>(updateUI)}};
+
+}  // namespace
+
+}  // namespace ax
