@@ -1,5 +1,6 @@
 #include "host/workouts/CHWorkoutDetailMapAndWeatherTableViewCell.h"
 
+#include "host/workouts/Placement.h"
 #include "platform/runtime/ClassBuilder.h"
 
 namespace ax::host {
@@ -15,10 +16,9 @@ Class& CHWorkoutDetailMapAndWeatherTableViewCell::staticClass() {
 }
 
 void CHWorkoutDetailMapAndWeatherTableViewCell::layoutSubviews() {
-  const std::initializer_list<Ref<View>> parts = {mapView_, weatherView_};
-  for (const Ref<View>& part : parts) {
-    if (part && part->superview() == nullptr) contentView()->addSubview(part);
-  }
+  const double mapHeight = frame().height * (weatherView_ ? 0.75 : 1);
+  showIn(*contentView(), mapView_, {0, 0, frame().width, mapHeight});
+  showIn(*contentView(), weatherView_, {0, mapHeight, frame().width, frame().height - mapHeight});
 }
 
 static const RegisteredClass<CHWorkoutDetailMapAndWeatherTableViewCell> registered;

@@ -1,5 +1,6 @@
 #include "host/workouts/CHWorkoutDetailMapView.h"
 
+#include "host/workouts/Placement.h"
 #include "platform/runtime/ClassBuilder.h"
 
 namespace ax::host {
@@ -20,7 +21,9 @@ Class& CHWorkoutDetailMapViewInCell::staticClass() {
 }
 
 void CHWorkoutDetailMapView::layoutSubviews() {
-  if (titleLabel_ && titleLabel_->superview() == nullptr) addSubview(titleLabel_);
+  ensure(routeView_);
+  showIn(*this, routeView_, {0, 0, frame().width, frame().height});
+  showIn(*this, titleLabel_, {0, 0, frame().width, std::min(frame().height, 30.0)});
 }
 
 static const RegisteredClass<CHWorkoutDetailMapView> registered;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/toolkit/ImageView.h"
 #include "platform/toolkit/Label.h"
 
 namespace ax::host {
@@ -9,11 +10,12 @@ class CHWorkoutDetailMapView : public View {
  public:
   static Class& staticClass();
 
-  // Puts the title over the map.
+  // Draws the route over the whole view and puts the title over it.
   void layoutSubviews() override;
 
  private:
   Ref<Label> titleLabel_;
+  Ref<ImageView> routeView_;
 };
 
 // The map as a cell shows it: "_CHWorkoutDetailMapView".

@@ -1,16 +1,11 @@
 #include "host/workouts/CHWorkoutDetailWeatherView.h"
 
+#include "host/workouts/Placement.h"
 #include "platform/runtime/ClassBuilder.h"
 
 namespace ax::host {
 
 namespace {
-
-void showIn(View& parent, const Ref<View>& part, Rect frame) {
-  if (!part) return;
-  if (part->frame() == Rect()) part->setFrame(frame);
-  if (part->superview() == nullptr) parent.addSubview(part);
-}
 
 void show(Ref<Label>& label, const Ref<Object>& content) {
   if (!label) label = make<Label>();

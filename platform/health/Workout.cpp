@@ -1,12 +1,48 @@
 #include "platform/health/Workout.h"
 
+#include <array>
+
 #include "platform/runtime/ClassBuilder.h"
 
 namespace ax {
 
+namespace {
+
+struct ActivityType {
+  std::int64_t number;
+  std::string_view sport;
+};
+
+constexpr std::array activityTypes = {
+    ActivityType{10, "walking"},    ActivityType{11, "running"},
+    ActivityType{12, "hiking"},     ActivityType{WorkoutActivityTypeCycling, "cycling"},
+    ActivityType{14, "swimming"},   ActivityType{15, "rowing"},
+    ActivityType{16, "strength"},   ActivityType{17, "yoga"},
+    ActivityType{18, "wheelchair"},
+};
+
+}  // namespace
+
+std::int64_t workoutActivityTypeNamed(std::string_view sport) {
+  for (const ActivityType& type : activityTypes) {
+    if (type.sport == sport) return type.number;
+  }
+  return 0;
+}
+
+std::string_view nameOfWorkoutActivityType(std::int64_t number) {
+  for (const ActivityType& type : activityTypes) {
+    if (type.number == number) return type.sport;
+  }
+  return "other";
+}
+
 Class& Source::staticClass() {
-  static Class& result =
-      ClassBuilder<Source>("Source", Object::staticClass()).instanceVariable<&Source::name_>("name").build();
+  static Class& result = ClassBuilder<Source>("Source", Object::staticClass())
+                             .instanceVariable<&Source::name_>("name")
+                             .instanceVariable<&Source::isNorvaleWatch_>("isNorvaleWatch")
+                             .method<&Source::_isNorvaleWatch>("_isNorvaleWatch")
+                             .build();
   return result;
 }
 

@@ -11,9 +11,12 @@ class Source final : public Object {
   static Class& staticClass();
 
   const Ref<String>& name() const { return name_; }
+  // Whether it is the maker's own watch, which needs no naming beside a record.
+  bool _isNorvaleWatch() const { return isNorvaleWatch_; }
 
  private:
   Ref<String> name_;
+  bool isNorvaleWatch_ = false;
 };
 
 class SourceRevision final : public Object {
@@ -27,6 +30,10 @@ class SourceRevision final : public Object {
 };
 
 inline constexpr std::int64_t WorkoutActivityTypeCycling = 13;
+// By a sport's name such as "running"; 0 for any that is not known.
+std::int64_t workoutActivityTypeNamed(std::string_view sport);
+// "other" for 0 and for numbers that stand for no sport.
+std::string_view nameOfWorkoutActivityType(std::int64_t type);
 
 class Workout final : public Object {
  public:

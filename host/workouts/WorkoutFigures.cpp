@@ -1,0 +1,142 @@
+#include "host/workouts/WorkoutFigures.h"
+
+#include <algorithm>
+#include <array>
+#include <cmath>
+#include <cstdio>
+
+#include "host/core/HostStrings.h"
+#include "platform/foundation/Environment.h"
+#include "platform/foundation/Formatters.h"
+#include "platform/toolkit/AccessibilityMessages.h"
+
+namespace ax::host {
+
+namespace {
+
+const Message<Ref<Object>(Ref<Object>, Ref<String>)> attrStringWithValueUnit{"attrStringWithValue:unit:"};
+
+// How a unit is shown: its key in the app's texts, and whether its figures have decimals.
+struct ShownUnit {
+  std::string_view unitString;
+  std::string_view key;
+  int formatOption;
+};
+
+constexpr std::array shownUnits = {
+    ShownUnit{"kcal", "unit.kcal", 0},
+    ShownUnit{"kJ", "unit.kj", 0},
+    ShownUnit{"km", "unit.km", 1},
+    ShownUnit{"mi", "unit.mi", 1},
+    ShownUnit{"m", "unit.m", 0},
+    ShownUnit{"yd", "unit.yd", 0},
+    ShownUnit{"ft", "unit.ft", 0},
+    ShownUnit{"km/hr", "unit.km.per.hour", 1},
+    ShownUnit{"mi/hr", "unit.mi.per.hour", 1},
+    ShownUnit{"count/min", "unit.bpm", 0},
+};
+
+const ShownUnit* shownUnit(const Unit& unit) {
+  const auto found = std::ranges::find(shownUnits, std::string_view(unit.text()), &ShownUnit::unitString);
+  return found == shownUnits.end() ? nullptr : &*found;
+}
+
+double wholeSeconds(double seconds) {
+  return std::isfinite(seconds) ? std::clamp(std::round(seconds), 0.0, 1e9) : 0;
+}
+
+Ref<AttributedString> withUnit(const Ref<String>& number, std::string_view unitKey,
+                               const Ref<String>& spokenUnit) {
+  const Ref<String> unit = textWithSpokenForm(hostText(unitKey)->text(), spokenUnit);
+  return cast<AttributedString>(attrStringWithValueUnit(String::staticClass(), number, unit));
+}
+
+Ref<String> spokenUnit(const ShownUnit& unit, const String& number) {
+  const std::string key = std::string(unit.key) + ".spoken";
+  const Ref<String> one = number.isEqual(*formatInteger(1)) ? hostText(key + ".one") : nullptr;
+  return isEmpty(one) ? hostText(key) : one;
+}
+
+Ref<Quantity> asShown(const Ref<Quantity>& quantity) {
+  const Ref<Unit> preferred = Unit::unitFromString(environment().energyUnit);
+  if (!preferred || !quantity->isCompatibleWithUnit(preferred)) return quantity;
+  return ax::quantity(quantity->doubleValueForUnit(preferred), preferred);
+}
+
+Ref<AttributedString> missingFigure() {
+  return make<AttributedString>(string("--"));
+}
+
+std::string paceText(double secondsPerUnit) {
+  if (!std::isfinite(secondsPerUnit) || secondsPerUnit <= 0) return "--'--\"";
+  const auto seconds = static_cast<long>(wholeSeconds(secondsPerUnit));
+  char text[32];
+  std::snprintf(text, sizeof text, "%ld'%02ld\"", seconds / 60, seconds % 60);
+  return text;
+}
+
+std::string paceKey(const Unit& unitOfDistance) {
+  return unitOfDistance.text() == "mi" ? "unit.per.mi" : "unit.per.km";
+}
+
+}  // namespace
+
+std::string clockText(double seconds) {
+  const auto whole = static_cast<long>(wholeSeconds(seconds));
+  char text[32];
+  if (whole < 3600) {
+    std::snprintf(text, sizeof text, "%ld:%02ld", whole / 60, whole % 60);
+  } else {
+    std::snprintf(text, sizeof text, "%ld:%02ld:%02ld", whole / 3600, whole / 60 % 60, whole % 60);
+  }
+  return text;
+}
+
+Ref<AttributedString> figureOf(const Ref<Quantity>& given) {
+  if (!given) return missingFigure();
+  const Ref<Quantity> quantity = asShown(given);
+  const ShownUnit* unit = shownUnit(*quantity->unit());
+  if (unit == nullptr) return make<AttributedString>(string(quantity->description()));
+  const Ref<String> number = formatFloat(unit->formatOption, static_cast<float>(quantity->value()));
+  return withUnit(number, unit->key, spokenUnit(*unit, *number));
+}
+
+Ref<AttributedString> paceFigure(double secondsPerUnit, const Unit& unitOfDistance) {
+  const std::string key = paceKey(unitOfDistance);
+  return withUnit(string(paceText(secondsPerUnit)), key, hostText(key + ".spoken"));
+}
+
+Ref<String> spokenPace(double secondsPerUnit, const Unit& unitOfDistance) {
+  return string(durationStringForDuration(secondsPerUnit)->text() + " " +
+                hostText(paceKey(unitOfDistance) + ".spoken")->text());
+}
+
+Ref<String> plainText(const Ref<AttributedString>& figure) {
+  if (!figure) return nullptr;
+  return textWithSpokenForm(figure->description(), messages::accessibilityLabel(figure));
+}
+
+Ref<String> textWithSpokenForm(std::string text, const Ref<String>& spoken) {
+  Ref<String> result = string(std::move(text));
+  if (spoken) messages::setAccessibilityLabel(result, spoken);
+  return result;
+}
+
+Ref<String> distanceInWords(const Ref<Quantity>& distance) {
+  const ShownUnit* unit = distance ? shownUnit(*distance->unit()) : nullptr;
+  if (unit == nullptr) return nullptr;
+  const Ref<String> number = formatFloat(unit->formatOption, static_cast<float>(distance->value()));
+  return string(number->text() + " " + spokenUnit(*unit, *number)->text());
+}
+
+Ref<String> hostText(std::string_view key, std::initializer_list<Ref<Object>> arguments) {
+  const Ref<String> text = HostStrings::textForKey(string(std::string(key)));
+  if (!text) return emptyString();
+  return arguments.size() == 0 ? text : stringWithFormat(text, arguments);
+}
+
+Ref<String> titleOf(const Workout& workout) {
+  return hostText("workout." + std::string(nameOfWorkoutActivityType(workout.workoutActivityType())));
+}
+
+}  // namespace ax::host
