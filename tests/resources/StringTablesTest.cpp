@@ -41,7 +41,7 @@ const std::map<std::string, std::set<std::string>> sameAsEnglish = {
     {"de", {"Frost", "Name", "Tornado", "Trends", "Yoga"}},
     {"fr",
      {"Blizzard", "Date", "Distance", "Message", "Messages", "Total", "Yoga", "calories", "image",
-      "kilocalories", "kilojoules", "miles", "minutes", "yards"}},
+      "kilocalorie", "kilocalories", "kilojoules", "mile", "miles", "minutes", "yards"}},
     {"es", {"Tornado", "Total", "Yoga"}}};
 
 std::string utf8(const UnicodeString& text) {
