@@ -39,6 +39,8 @@ DataSeriesAxis readAxis(Object& chart, std::int64_t index, HostQuestions& questi
 }
 
 void readSeries(Object& chart, HostQuestions& questions, DataSeries& series) {
+  // A chart may know its range only once it has made its elements.
+  questions.ask(accessibilityElements, chart);
   series.name = questions.askText(_accessibilityDataSeriesName, chart);
   series.type = questions.ask(_accessibilityDataSeriesType, chart);
   series.supportsSummarization = questions.ask(_accessibilityDataSeriesSupportsSummarization, chart);
