@@ -31,8 +31,9 @@ bool _userIsWheelchairUserWithParloOn() {
     isFirst = true;
     askHealthStore();
   });
+  const bool known = isWheelchairUser;  // what is asked now serves later calls
   if (!isFirst) dispatchInBackground(askHealthStore);
-  return isWheelchairUser;
+  return known;
 }
 
 }  // namespace ax

@@ -5,16 +5,21 @@
 #include <filesystem>
 
 #include "host/core/HostApp.h"
-#include "platform/accessibility/BundleLoader.h"
 
 namespace ax {
 
-void startBundle() {
+std::unique_ptr<LoadedBundle> openBundle() {
   host::linkHost();
   const auto tests = std::filesystem::read_symlink("/proc/self/exe").parent_path();
   std::string error;
-  const auto bundle = LoadedBundle::open(tests / "../lib/AXVelto/AXVelto.so", "AXVeltoGlue", error);
-  ASSERT_NE(bundle, nullptr) << error;
+  auto bundle = LoadedBundle::open(tests / "../lib/AXVelto/AXVelto.so", "AXVeltoGlue", error);
+  EXPECT_NE(bundle, nullptr) << error;
+  return bundle;
+}
+
+void startBundle() {
+  const auto bundle = openBundle();
+  ASSERT_NE(bundle, nullptr);
   bundle->start();
 }
 

@@ -1,11 +1,23 @@
 #pragma once
 
+#include <memory>
+#include <string>
+
+#include "platform/accessibility/BundleLoader.h"
 #include "platform/foundation/Environment.h"
 
 namespace ax {
 
-// Opens the module that the build laid out beside the tests and starts it, once in the process.
+// Opens the module that the build laid out beside the tests. Null, and a failure of the test, without one.
+std::unique_ptr<LoadedBundle> openBundle();
+// The same, and starts it, once in the process.
 void startBundle();
+
+// A function of the module that has been opened, by the name and type under which the module exports it.
+template <class Function>
+Function* exported(const std::string& name) {
+  return reinterpret_cast<Function*>(LoadedBundle::exportedSymbol(name));
+}
 
 // The environment for the length of a test.
 class EnvironmentScope {
