@@ -10,14 +10,18 @@ namespace {
 
 const Message<void()> setupSubviewsMessage{"_setupSubviews"};
 
-void makeCaption(Ref<Label>& label, const char* key) {
-  if (label) return;
-  label = make<Label>();
-  label->setText(HostStrings::textForKey(string(key)));
+Ref<Label> labelAt(int column, double y) {
+  const Ref<Label> label = make<Label>();
+  label->setFrame({16 + column * 120.0, y, 110, 22});
+  return label;
 }
 
-void makeFigure(Ref<Label>& label) {
-  if (!label) label = make<Label>();
+void makePair(Ref<Label>& title, Ref<Label>& value, const char* key, int column) {
+  if (!title) {
+    title = labelAt(column, 8);
+    title->setText(HostStrings::textForKey(string(key)));
+  }
+  if (!value) value = labelAt(column, 30);
 }
 
 }  // namespace
@@ -38,12 +42,9 @@ Class& StepsDistanceCell::staticClass() {
 
 void StepsDistanceCell::setupSubviews() {
   isSetUp_ = true;
-  makeCaption(stepsTitle_, "day.steps.title");
-  makeFigure(stepsValue_);
-  makeCaption(distanceTitle_, "day.distance.title");
-  makeFigure(distanceValue_);
-  makeCaption(flightsTitle_, "day.flights.title");
-  makeFigure(flightsValue_);
+  makePair(stepsTitle_, stepsValue_, "day.steps.title", 0);
+  makePair(distanceTitle_, distanceValue_, "day.distance.title", 1);
+  makePair(flightsTitle_, flightsValue_, "day.flights.title", 2);
   addUnplaced(*contentView(),
               {stepsTitle_, stepsValue_, distanceTitle_, distanceValue_, flightsTitle_, flightsValue_});
 }
