@@ -1,0 +1,68 @@
+#include "reader/contract/ContractReport.h"
+
+#include <gtest/gtest.h>
+
+#include "platform/accessibility/CategoryRegistration.h"
+#include "reader/contract/CategoryScreens.h"
+
+namespace ax::reader {
+namespace {
+
+void checkTitle(ValidationManager& manager) {
+  manager.validateClassHasInstanceVariableWithType("View", "_title", "String");
+  manager.validateClass("Label");
+}
+
+// Two categories with real names and the same check, and one whose host class is missing.
+void registerCategories() {
+  registerCategory("TrendListMetricViewAccessibility", "Label", checkTitle, {});
+  registerCategory("LoadingViewAccessibility", "Label", checkTitle, {});
+  registerCategory("TrendListHeaderViewAccessibility", "Tests.NoSuchHeader", checkTitle, {});
+}
+
+TEST(ContractReport, GroupsChecksAndNamesTheScreens) {
+  registerCategories();
+  const Ref<ValidationManager> manager = make<ValidationManager>();
+  manager->performValidationsWithPreValidationHandlerPostValidationHandlerSafeCategoryInstallationHandler(
+      [](ValidationManager& m) { return m.validateClass("Button"); },
+      [](ValidationManager& m) {
+        m.setValidationTargetName(string("Target"));
+        return true;
+      },
+      nullptr,
+      [](ValidationManager& m) {
+        for (const char* name : {"TrendListMetricViewAccessibility", "LoadingViewAccessibility",
+                                 "TrendListHeaderViewAccessibility", "NotBuiltYetAccessibility"}) {
+          m.installSafeCategoryCanInteractWithTargetClass(name, true);
+        }
+      });
+  const ContractReport report(*manager);
+  EXPECT_FALSE(report.holds());
+  EXPECT_EQ(report.text(),
+            "Target\n"
+            "ok      Button exists\n"
+            "FAILED  View has instance variable _title: expected String, found no such member\n"
+            "          relied on by TrendListMetricViewAccessibility, LoadingViewAccessibility\n"
+            "          screens: Trends, Loading\n"
+            "ok      Label exists\n"
+            "FAILED  Tests.NoSuchHeader exists: expected a class, found no such class\n"
+            "          relied on by TrendListHeaderViewAccessibility\n"
+            "          screens: Trends\n"
+            "2 checks passed, 2 failed; 2 of 4 categories installed\n"
+            "Screens that lose speech: Trends, Loading\n");
+  const nlohmann::ordered_json json = report.json();
+  EXPECT_EQ(json["checks"][1]["screens"].dump(), R"(["Trends","Loading"])");
+  EXPECT_EQ(json["installed"], 2);
+}
+
+TEST(ContractReport, ChecksOfTheWholeBundleNameTheirScreens) {
+  const Ref<ValidationManager> manager = make<ValidationManager>();
+  manager->validateClass("Tests.NoSuchCache");
+  const ContractReport report(*manager);
+  EXPECT_NE(report.text().find("relied on by the bundle as a whole\n"
+                               "          screens: Month calendar, Week palette, Day list\n"),
+            std::string::npos);
+}
+
+}  // namespace
+}  // namespace ax::reader
