@@ -1,0 +1,47 @@
+#pragma once
+
+#include <benchmark/benchmark.h>
+
+#include <functional>
+#include <string>
+#include <vector>
+
+// The measurements. Every operation has sides: ours, the floor, and the peers that are installed. All sides
+// of all operations run in one process, interleaved at random, and the median of each is compared.
+namespace bench {
+
+// Runs the operation `items` times per iteration.
+struct Side {
+  std::string operation;
+  std::string name;  // "ours", "floor", or a peer's
+  std::function<void(benchmark::State&)> body;
+  int items = 1;
+};
+
+void addSide(Side side);
+
+// Stands in a source file for each side that it brings.
+struct RegisteredSide {
+  template <class Body>
+  RegisteredSide(std::string operation, std::string name, Body once, int items = 1) {
+    addSide({std::move(operation), std::move(name),
+             [once](benchmark::State& state) {
+               auto run = once();
+               for ([[maybe_unused]] auto iteration : state) run();
+             },
+             items});
+  }
+};
+
+// Nanoseconds per item; the sides of an operation in the order in which they were added.
+struct Timing {
+  std::string name;
+  double nanoseconds = 0;
+};
+void runSides();
+std::vector<Timing> timingsOf(const std::string& operation);
+
+// How many operations an iteration of the small ones runs.
+inline constexpr int batch = 256;
+
+}  // namespace bench
