@@ -37,8 +37,8 @@ void CHWorkoutSummaryTableViewCell::_updateUI() {
     const WorkoutTotals totals(workouts_);
     ensure(titleLabel_).setText(titleOf(*first));
     showDuration(ensure(durationLabel_), totals.seconds, totals.count);
-    showFigure(ensure(distanceLabel_), "figure.distance", totals.distance, totals.count);
-    showFigure(ensure(activeEnergyLabel_), "figure.active.calories", totals.energy, totals.count);
+    showFigure(ensure(distanceLabel_), "figure.distance", totals.distance);
+    showFigure(ensure(activeEnergyLabel_), "figure.active.calories", totals.energy);
   }
   layoutSubviews();
 }

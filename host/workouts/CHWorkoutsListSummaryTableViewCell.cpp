@@ -26,9 +26,9 @@ void CHWorkoutsListSummaryTableViewCell::setWorkouts(Ref<Array> workouts) {
   const WorkoutTotals totals(workouts_);
   ensure(numberOfWorkoutsLabel_)
       .show(hostText("figure.workouts"), formatInteger(static_cast<std::int64_t>(totals.count)), nullptr);
-  showFigure(ensure(activeEnergyLabel_), "figure.active.calories", totals.energy, totals.count);
+  showFigure(ensure(activeEnergyLabel_), "figure.active.calories", totals.energy);
   showDuration(ensure(durationLabel_), totals.seconds, totals.count);
-  showFigure(ensure(distanceLabel_), "figure.distance", totals.distance, totals.count);
+  showFigure(ensure(distanceLabel_), "figure.distance", totals.distance);
   showPace(ensure(paceLabel_), totals);
   layoutSubviews();
 }

@@ -8,11 +8,6 @@ namespace ax::host {
 
 namespace {
 
-void addTo(Ref<Quantity>& sum, const Ref<Quantity>& more) {
-  if (!more) return;
-  sum = sum ? quantity(sum->value() + more->doubleValueForUnit(sum->unit()), sum->unit()) : more;
-}
-
 bool countsForPace(const Workout& workout) {
   return workout.totalDistance() && workout.totalDistance()->value() > 0 &&
          workout.workoutActivityType() != WorkoutActivityTypeCycling;
@@ -24,6 +19,12 @@ Ref<String> spokenClock(double seconds) {
 
 }  // namespace
 
+void WorkoutTotals::Sum::add(const Ref<Quantity>& more) {
+  if (!more) return;
+  total = total ? quantity(total->value() + more->doubleValueForUnit(total->unit()), total->unit()) : more;
+  ++count;
+}
+
 WorkoutTotals::WorkoutTotals(const Ref<Array>& workouts) {
   if (!workouts) return;
   for (const Ref<Object>& item : *workouts) {
@@ -31,34 +32,35 @@ WorkoutTotals::WorkoutTotals(const Ref<Array>& workouts) {
     if (workout == nullptr) continue;
     ++count;
     seconds += workout->duration();
-    addTo(distance, workout->totalDistance());
-    addTo(energy, workout->totalEnergyBurned());
+    distance.add(workout->totalDistance());
+    energy.add(workout->totalEnergyBurned());
     if (!countsForPace(*workout)) continue;
     pacedSeconds += workout->duration();
-    addTo(pacedDistance, workout->totalDistance());
+    pacedDistance.add(workout->totalDistance());
   }
 }
 
 void showFigure(CHWorkoutSummaryTabbedLabelContainer& container, std::string_view titleKey,
-                const Ref<Quantity>& total, std::size_t count) {
-  container.setHidden(!total);
-  if (!total) return container.show(nullptr, nullptr, nullptr);
-  const Ref<Quantity> average = quantity(total->value() / static_cast<double>(count), total->unit());
-  container.show(hostText(titleKey), plainText(figureOf(total)),
-                 count > 1 ? plainText(figureOf(average)) : nullptr);
+                const WorkoutTotals::Sum& sum) {
+  container.setHidden(!sum.total);
+  if (!sum.total) return container.show(nullptr, nullptr, nullptr);
+  const double mean = sum.total->value() / static_cast<double>(sum.count);
+  container.show(hostText(titleKey), plainText(figureOf(sum.total)),
+                 sum.count > 1 ? plainText(figureOf(quantity(mean, sum.total->unit()))) : nullptr);
 }
 
 void showDuration(CHWorkoutSummaryTabbedLabelContainer& container, double seconds, std::size_t count) {
   container.setHidden(count == 0);
-  container.show(hostText("figure.total.time"), spokenClock(seconds),
+  container.show(hostText("figure.active.time"), spokenClock(seconds),
                  count > 1 ? spokenClock(seconds / static_cast<double>(count)) : nullptr);
 }
 
 void showPace(CHWorkoutSummaryTabbedLabelContainer& container, const WorkoutTotals& totals) {
-  container.setHidden(!totals.pacedDistance);
-  if (!totals.pacedDistance) return container.show(nullptr, nullptr, nullptr);
-  const double pace = CHWorkoutDataCalculator::pace(totals.pacedDistance, totals.pacedSeconds);
-  const Ref<Unit> unit = CHWorkoutDataCalculator::unitOf(totals.pacedDistance);
+  const Ref<Quantity>& distance = totals.pacedDistance.total;
+  container.setHidden(!distance);
+  if (!distance) return container.show(nullptr, nullptr, nullptr);
+  const double pace = CHWorkoutDataCalculator::pace(distance, totals.pacedSeconds);
+  const Ref<Unit> unit = CHWorkoutDataCalculator::unitOf(distance);
   container.show(hostText("pace.title"), nullptr,
                  textWithSpokenForm(paceFigure(pace, *unit)->description(), spokenPace(pace, *unit)));
 }

@@ -32,9 +32,13 @@ Json sceneDate(double time) {
   return {{"date", text}};
 }
 
-Json sceneQuantity(double value, const std::string& unit) {
+double sceneNumber(double value) {
   constexpr double places = 1e4;
-  return {{"quantity", {std::round(value * places) / places, unit}}};
+  return std::round(value * places) / places;
+}
+
+Json sceneQuantity(double value, const std::string& unit) {
+  return {{"quantity", {sceneNumber(value), unit}}};
 }
 
 Json appText(const std::string& key) {

@@ -44,7 +44,7 @@ Json distanceQuantity(double metres, const DistanceUnit& unit) {
 
 Json workoutRecord(const WorkoutActivity& activity, const DistanceUnit& unit, const std::string& id) {
   Json members = {{"workoutActivityType", workoutActivityTypeNamed(activity.sport)},
-                  {"duration", activity.activeSeconds}};
+                  {"duration", sceneNumber(activity.activeSeconds)}};
   if (isDated(activity)) {
     members["startDate"] = sceneDate(activity.start);
     members["endDate"] = sceneDate(activity.start + activity.duration);

@@ -22,10 +22,16 @@ struct Figure {
   Json value;
 };
 
+// Pauses included. The cell takes a time as that of a workout.
+Json elapsedTime(const WorkoutActivity& activity) {
+  return sceneObject("Workout",
+                     {{"duration", sceneNumber(std::max(activity.duration, activity.activeSeconds))}});
+}
+
 // In pairs: an odd one is followed by a heart rate, which is missing when there is none.
 std::vector<Figure> figuresOf(const WorkoutActivity& activity, const DistanceUnit& unit) {
   const auto heartRate = heartRateFigures(activity);
-  std::vector<Figure> figures = {{"figure.total.time", sceneReference(recordId)}};
+  std::vector<Figure> figures = {{"figure.total.time", elapsedTime(activity)}};
   if (activity.metres > 0) figures.push_back({"figure.distance", distanceQuantity(activity.metres, unit)});
   if (activity.kilocalories) {
     figures.push_back({"figure.active.calories", sceneQuantity(*activity.kilocalories, "kcal")});
@@ -49,7 +55,7 @@ Json twoValues(const Figure& first, const Figure& second) {
 }
 
 Json splitRow(const Lap& lap, std::size_t number, const DistanceUnit& unit) {
-  Json split = {{"index", number}, {"duration", lap.seconds}};
+  Json split = {{"index", number}, {"duration", sceneNumber(lap.seconds)}};
   if (lap.metres > 0) split["distance"] = distanceQuantity(lap.metres, unit);
   return sceneObject("CHWorkoutDetailSplitTableViewCell",
                      {{"split", sceneObject("CHWorkoutSplit", std::move(split))}});
