@@ -110,4 +110,12 @@ Json ContractReport::json() const {
           {"checks", std::move(checks)}};
 }
 
+Json ContractReport::failuresJson() const {
+  Json failed = Json::array();
+  for (const ContractFinding& finding : findings_) {
+    if (!finding.passed) failed.push_back(jsonOf(finding));
+  }
+  return failed;
+}
+
 }  // namespace ax::reader

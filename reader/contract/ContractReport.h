@@ -39,6 +39,8 @@ class ContractReport {
   // One line per check that passed, three per check that failed, then the sums.
   std::string text() const;
   nlohmann::ordered_json json() const;
+  // The failed checks alone.
+  nlohmann::ordered_json failuresJson() const;
 
  private:
   void add(const ContractCheck& check);

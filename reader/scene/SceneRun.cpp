@@ -1,9 +1,9 @@
 #include "reader/scene/SceneRun.h"
 
 #include "platform/accessibility/Notifications.h"
-#include "platform/accessibility/ValidationManager.h"
 #include "platform/health/ActivitySummary.h"
 #include "platform/runtime/Message.h"
+#include "reader/contract/ContractReport.h"
 #include "reader/scene/ObjectBuilder.h"
 #include "reader/scene/Omissions.h"
 #include "reader/scene/Presentation.h"
@@ -42,17 +42,6 @@ Json assertionsJson() {
                     {"source", failed.source},
                     {"line", failed.line},
                     {"function", failed.function}});
-  }
-  return list;
-}
-
-Json contractFailuresJson() {
-  Json list = Json::array();
-  for (const ContractCheck& check : ValidationManager::sharedInstance()->failedChecks()) {
-    list.push_back({{"category", check.category.empty() ? Json() : Json(check.category)},
-                    {"check", check.description()},
-                    {"expected", check.expected},
-                    {"found", check.found}});
   }
   return list;
 }
@@ -109,7 +98,7 @@ Json SceneRun::runSteps() {
   return {{"results", std::move(results)},
           {"notifications", postedJson(runner)},
           {"assertions", assertionsJson()},
-          {"contractFailures", contractFailuresJson()}};
+          {"contractFailures", ContractReport::ofProcess().failuresJson()}};
 }
 
 }  // namespace ax::reader
