@@ -1,4 +1,6 @@
+#include <deque>
 #include <iostream>
+#include <unordered_set>
 
 #include "apps/axvelto/Output.h"
 #include "apps/axvelto/Presentation.h"
@@ -20,36 +22,60 @@ void declare(CLI::App& app, Arguments& arguments) {
   declareWithout(app, arguments);
 }
 
-// An object need not be on the screen to be described.
-Snapshot snapshotFor(Presentation& presentation, const std::string& id) {
-  if (id.empty()) return presentation.snapshot();
+// Charts with the snapshots that they stand in.
+struct Charts {
+  std::deque<Snapshot> snapshots;
+  std::vector<std::pair<const Snapshot*, const Node*>> found;
+  std::unordered_set<const Object*> known;
+
+  void add(Snapshot snapshot) {
+    const Snapshot& kept = snapshots.emplace_back(std::move(snapshot));
+    for (const Node* chart : reader::charts(kept)) {
+      if (known.insert(kept.object(chart->id).get()).second) found.emplace_back(&kept, chart);
+    }
+  }
+};
+
+// All of the scene: on the screen, and in what is made beside it.
+Charts allCharts(Presentation& presentation) {
+  Charts charts;
+  if (presentation.run().screen()) charts.add(presentation.snapshot());
+  for (const Ref<Object>& object : presentation.run().objects()) charts.add(presentation.snapshotOf(object));
+  return charts;
+}
+
+Charts chartsOf(Presentation& presentation, const std::string& id) {
   const Ref<Object> object = presentation.run().objectWithId(id);
   if (!object) {
     throw reader::Fault{presentation.scene().file, "--of", "no object \"" + id + "\"", "an id of the scene"};
   }
-  return presentation.snapshotOf(object);
+  Charts charts;
+  charts.add(presentation.snapshotOf(object));
+  return charts;
 }
 
-void printText(const Snapshot& snapshot, const std::vector<const Node*>& charts) {
-  if (charts.empty()) std::cout << reader::readerText("chart.none") << '\n';
-  for (const Node* chart : charts) {
-    if (chart != charts.front()) std::cout << '\n';
-    print(reader::describeChart(snapshot, *chart));
+void printText(const Charts& charts) {
+  if (charts.found.empty()) std::cout << reader::readerText("chart.none") << '\n';
+  for (const auto& [snapshot, chart] : charts.found) {
+    if (chart != charts.found.front().second) std::cout << '\n';
+    print(reader::describeChart(*snapshot, *chart));
   }
 }
 
-void printJson(const Snapshot& snapshot, const std::vector<const Node*>& charts) {
+void printJson(const Charts& charts) {
   nlohmann::ordered_json json = {{"charts", nlohmann::ordered_json::array()}};
-  for (const Node* chart : charts) json["charts"].push_back(reader::chartAsJson(snapshot, *chart));
+  for (const auto& [snapshot, chart] : charts.found) {
+    json["charts"].push_back(reader::chartAsJson(*snapshot, *chart));
+  }
   print(json);
 }
 
 ExitCode run(const Arguments& arguments) {
   Presentation presentation(arguments);
-  const Snapshot snapshot = snapshotFor(presentation, arguments.chart);
-  const std::vector<const Node*> charts = reader::charts(snapshot);
-  (arguments.asJson ? printJson : printText)(snapshot, charts);
-  return charts.empty() ? exitFallsShort : exitDone;
+  const bool isAll = arguments.chart.empty();
+  const Charts charts = isAll ? allCharts(presentation) : chartsOf(presentation, arguments.chart);
+  (arguments.asJson ? printJson : printText)(charts);
+  return charts.found.empty() && !isAll ? exitFallsShort : exitDone;
 }
 
 }  // namespace

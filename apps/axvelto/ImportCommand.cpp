@@ -7,12 +7,14 @@ namespace {
 
 void declare(CLI::App& app, Arguments& arguments) {
   app.add_option("FILE", arguments.files, "workout files (.tcx, .gpx); - is standard input")->required();
+  declareLocale(app, arguments);
 }
 
 ExitCode run(const Arguments& arguments) {
+  checkLocale(arguments.locale);
   std::vector<InputFile> files;
   for (const std::string& name : arguments.files) files.push_back({name, readInput(name)});
-  print(importWorkouts(files));
+  print(importWorkouts(files, arguments.locale));
   return exitDone;
 }
 

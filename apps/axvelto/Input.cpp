@@ -37,12 +37,9 @@ bool isWorkoutFile(std::string_view bytes) {
   return first != std::string_view::npos && bytes[first] == '<';
 }
 
-void setLocale(reader::Scene& scene, const std::string& locale) {
-  if (locale.empty()) return;
-  if (!formatting::isKnownLocale(locale)) {
-    throw Fault{"--locale", "", "\"" + locale + "\" is no known locale", "one such as en_US"};
-  }
-  scene.environment.locale = locale;
+void checkLocale(const std::string& locale) {
+  if (locale.empty() || formatting::isKnownLocale(locale)) return;
+  throw Fault{"--locale", "", "\"" + locale + "\" is no known locale", "one such as en_US"};
 }
 
 void checkOmissions(const std::vector<std::string>& names) {
@@ -51,10 +48,11 @@ void checkOmissions(const std::vector<std::string>& names) {
 
 reader::Scene sceneFor(const Arguments& arguments) {
   const std::string& file = arguments.files.front();
+  checkLocale(arguments.locale);
   std::string text = readInput(file);
-  if (isWorkoutFile(text)) text = importWorkouts({{file, std::move(text)}}).dump();
+  if (isWorkoutFile(text)) text = importWorkouts({{file, std::move(text)}}, arguments.locale).dump();
   reader::Scene scene = reader::readScene(text, file);
-  setLocale(scene, arguments.locale);
+  if (!arguments.locale.empty()) scene.environment.locale = arguments.locale;
   checkOmissions(arguments.without);
   return scene;
 }

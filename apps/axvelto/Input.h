@@ -20,16 +20,16 @@ struct InputFile {
   std::string bytes;
 };
 
-// The scene of one workout file, or of several as one. Throws a Fault.
-nlohmann::ordered_json importWorkouts(const std::vector<InputFile>& files);
+// The scene of one workout file in detail, or of several as a list, for the locale ("" is the default one).
+// Throws a Fault.
+nlohmann::ordered_json importWorkouts(const std::vector<InputFile>& files, const std::string& locale);
 
 // The scene that the command line names, imported where it is a workout file, with its locale and the
 // omissions checked. Throws a Fault.
 reader::Scene sceneFor(const Arguments& arguments);
 
-// The locale of the command line put into a scene's environment, if one was given. Throws a Fault for one
-// that is not known.
-void setLocale(reader::Scene& scene, const std::string& locale);
+// Throw a Fault for a locale that is not known, and for a class or member that the host does not have.
+void checkLocale(const std::string& locale);
 void checkOmissions(const std::vector<std::string>& names);
 
 }  // namespace ax::app

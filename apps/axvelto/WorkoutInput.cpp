@@ -1,5 +1,6 @@
 #include "apps/axvelto/Input.h"
 #include "reader/importers/WorkoutFileReader.h"
+#include "reader/importers/WorkoutScene.h"
 
 namespace ax::app {
 
@@ -17,9 +18,12 @@ WorkoutFile readWorkout(const InputFile& file) {
 
 }  // namespace
 
-nlohmann::ordered_json importWorkouts(const std::vector<InputFile>& files) {
-  for (const InputFile& file : files) readWorkout(file);
-  throw Fault{files.front().name, "", "workout files cannot be made into scenes yet", "a scene"};
+nlohmann::ordered_json importWorkouts(const std::vector<InputFile>& files, const std::string& locale) {
+  WorkoutSceneOptions options;
+  if (!locale.empty()) options.locale = locale;
+  std::vector<WorkoutFile> workouts;
+  for (const InputFile& file : files) workouts.push_back(readWorkout(file));
+  return workouts.size() == 1 ? workoutScene(workouts.front(), options) : workoutListScene(workouts, options);
 }
 
 }  // namespace ax::app

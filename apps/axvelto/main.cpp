@@ -10,6 +10,10 @@ using namespace ax::app;
 const Command* const commands[] = {&speakCommand, &treeCommand, &graphCommand,
                                    &checkCommand, &askCommand,  &importCommand};
 
+std::string usageFailure(const CLI::App*, const CLI::Error& error) {
+  return std::string("axvelto: ") + error.what() + " (axvelto --help tells the use)\n";
+}
+
 int runCommand(const Command& command, const Arguments& arguments) {
   try {
     const ExitCode code = command.run(arguments);
@@ -29,6 +33,7 @@ int main(int argc, char** argv) {
   CLI::App app("Speaks, describes and checks screens of the activity app.", "axvelto");
   app.set_version_flag("--version", "axvelto " AXVELTO_VERSION);
   app.require_subcommand(1);
+  app.failure_message(usageFailure);
   Arguments arguments;
   for (const Command* command : commands) {
     command->declare(*app.add_subcommand(command->name, command->help), arguments);
