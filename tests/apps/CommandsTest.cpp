@@ -1,0 +1,153 @@
+#include <gtest/gtest.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <cstdio>
+#include <filesystem>
+#include <fstream>
+#include <iterator>
+#include <nlohmann/json.hpp>
+#include <string>
+
+// Runs the program itself, as its users do.
+namespace ax::app {
+
+namespace {
+
+namespace fs = std::filesystem;
+using Json = nlohmann::ordered_json;
+
+struct Outcome {
+  int code;
+  std::string out, err;
+};
+
+// A folder of this process's own, gone when the test ends.
+class Commands : public testing::Test {
+ protected:
+  void SetUp() override { fs::create_directories(folder_); }
+  void TearDown() override { fs::remove_all(folder_); }
+
+  std::string file(const std::string& name, const std::string& text) const {
+    const fs::path path = folder_ / name;
+    std::ofstream(path, std::ios::binary) << text;
+    return path.string();
+  }
+
+  Outcome run(const std::string& arguments, const std::string& input = "") const {
+    const fs::path program = fs::read_symlink("/proc/self/exe").parent_path() / "axvelto";
+    const std::string in = file("in", input), out = file("out", ""), err = file("err", "");
+    const std::string line =
+        "'" + program.string() + "' " + arguments + " <'" + in + "' >'" + out + "' 2>'" + err + "'";
+    const int status = std::system(line.c_str());
+    return {WIFEXITED(status) ? WEXITSTATUS(status) : -1, textOf(out), textOf(err)};
+  }
+
+  static std::string sample(const std::string& name) { return std::string(AXVELTO_SAMPLES "/") + name; }
+
+ private:
+  static std::string textOf(const std::string& path) {
+    std::ifstream in(path, std::ios::binary);
+    return {std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>()};
+  }
+
+  const fs::path folder_ = fs::path(testing::TempDir()) / ("axvelto-commands-" + std::to_string(getpid()));
+};
+
+constexpr const char* oneButton = R"({
+  "format": "axvelto-scene/1", "title": "Deck",
+  "screen": {"class": "View", "set": {"frame": {"rect": [0, 0, 100, 100]}}, "subviews": [
+    {"class": "PageControl", "id": "pages", "set": {"frame": {"rect": [0, 0, 100, 20]}, "numberOfPages": 3}},
+    {"class": "Label", "id": "note", "set": {"frame": {"rect": [0, 50, 100, 20]}, "text": "Note"}}]}})";
+
+std::string firstLine(const std::string& text) {
+  return text.substr(0, text.find('\n'));
+}
+
+TEST_F(Commands, RefuseBadUseWithOneLineAndNothingElse) {
+  const std::string scene = file("deck.json", oneButton);
+  const std::string cut = file("cut.tcx", "  <?xml version=\"1.0\"?><TrainingCenterDatabase><Activ");
+  for (const std::string& arguments :
+       {std::string(), std::string("speak"), std::string("shout x"), std::string("speak /nowhere/x.json"),
+        std::string("speak /"), "speak " + scene + " --locale xx_YY",
+        "speak " + scene + " --without Nobody.x", "graph " + scene + " --of nobody",
+        "ask " + scene + " --activate nobody", "ask " + scene + " --at 1",
+        "ask " + scene + " --activate pages --increment pages", "speak " + cut, "import " + scene}) {
+    const Outcome outcome = run(arguments);
+    EXPECT_EQ(outcome.code, 2) << arguments;
+    EXPECT_EQ(outcome.out, "") << arguments;
+    EXPECT_TRUE(outcome.err.starts_with("axvelto: ")) << arguments << ": " << outcome.err;
+    EXPECT_EQ(outcome.err.find('\n'), outcome.err.size() - 1) << arguments << ": " << outcome.err;
+  }
+  EXPECT_NE(run("speak " + cut).err.find(cut), std::string::npos);
+}
+
+TEST_F(Commands, SpeakAndTreeReadAFileOrStandardInput) {
+  const Outcome spoken = run("speak -", oneButton);
+  EXPECT_EQ(spoken.code, 0);
+  EXPECT_EQ(spoken.out, "Screen: Deck\nPage 1 of 3, adjustable\nNote\n");
+  EXPECT_EQ(run("speak " + file("deck.json", oneButton)).out, spoken.out);
+  EXPECT_EQ(firstLine(run("speak --locale de_DE -", oneButton).out), "Bildschirm: Deck");
+
+  const Json tree = Json::parse(run("tree -", oneButton).out);
+  EXPECT_EQ(tree["elements"][0]["id"], "pages");
+  EXPECT_EQ(tree["elements"][0]["actions"], Json({"increment", "decrement"}));
+  EXPECT_EQ(tree["elements"][1]["frame"], Json({0, 50, 100, 20}));
+}
+
+TEST_F(Commands, AskActsOnTheScreen) {
+  const Outcome next = run("ask - --increment pages", oneButton);
+  EXPECT_EQ(next.code, 0);
+  EXPECT_EQ(firstLine(next.out), "Page 2 of 3, adjustable");
+
+  const Outcome none = run("ask - --increment Note", oneButton);
+  EXPECT_EQ(none.code, 1);
+  EXPECT_EQ(none.out, "");
+  EXPECT_NE(none.err.find("no increment of \"Note\""), std::string::npos);
+
+  EXPECT_EQ(run("ask - --at 50,55", oneButton).out, "Note\n");
+  EXPECT_EQ(run("ask - --at 50,99", oneButton).code, 1);
+}
+
+TEST_F(Commands, GraphDescribesChartsOnAndBesideTheScreen) {
+  const Outcome day = run("graph " + sample("day.json") + " --json");
+  EXPECT_EQ(day.code, 0);
+  EXPECT_GE(Json::parse(day.out)["charts"].size(), 4u);
+
+  const std::string beside = R"({"format": "axvelto-scene/1", "objects": [
+    {"class": "ActivityQuantityChart", "id": "energy"}, {"class": "View", "id": "plain"}]})";
+  const Json charts = Json::parse(run("graph - --json", beside).out)["charts"];
+  ASSERT_EQ(charts.size(), 1u);
+  EXPECT_EQ(charts[0]["id"], "energy");
+  EXPECT_EQ(charts[0]["slices"].size(), 8u);
+  EXPECT_EQ(run("graph - --of plain", beside).code, 1);
+  EXPECT_EQ(run("graph -", oneButton).code, 0);
+}
+
+TEST_F(Commands, CheckTellsWhetherTheHostHolds) {
+  EXPECT_EQ(run("check").code, 0);
+  const Outcome broken = run("check --without CHFriendDetailGoalCell --json");
+  EXPECT_EQ(broken.code, 1);
+  EXPECT_NE(broken.out.find("Friend detail"), std::string::npos);
+  EXPECT_EQ(run("check -", R"({"format": "axvelto-scene/1", "environment": {"checks": false},
+                               "host": {"without": ["LoadingView"]}})")
+                .code,
+            1);
+}
+
+TEST_F(Commands, ImportGivesTheSceneThatSpeakSpeaks) {
+  const std::string run1 = sample("workouts/morning-run.tcx"), ride = sample("workouts/evening-ride.gpx");
+  const Outcome scene = run("import " + run1);
+  EXPECT_EQ(scene.code, 0);
+  EXPECT_EQ(run("speak -", scene.out).out, run("speak " + run1).out);
+
+  const Outcome list = run("import " + run1 + " " + ride);
+  EXPECT_EQ(list.code, 0);
+  const std::string spoken = run("speak -", list.out).out;
+  EXPECT_NE(spoken.find("Cycling"), std::string::npos);
+  EXPECT_NE(spoken.find("Running"), std::string::npos);
+}
+
+}  // namespace
+
+}  // namespace ax::app
