@@ -63,6 +63,8 @@ class WheelchairTest : public RingsDescriptionTest {
     if (wheelchairQueries() != 0) GTEST_SKIP() << "the first question has been asked in this process";
     RingsDescriptionTest::SetUp();
   }
+
+  const EnvironmentScope environment_{Environment{}};
 };
 
 TEST_F(WheelchairTest, IsAskedFirstWhenTheScreenReaderRunsAndThenInTheBackground) {
