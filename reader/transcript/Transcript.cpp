@@ -4,6 +4,7 @@
 
 #include "platform/formatting/Lists.h"
 #include "reader/ReaderStrings.h"
+#include "reader/graph/ChartDescription.h"
 #include "reader/transcript/SpokenTime.h"
 
 namespace ax::reader {
@@ -73,11 +74,18 @@ void addStates(const Node& node, SpokenPieces& pieces) {
   if (node.states.modal) pieces.add(readerText("state.modal"));
 }
 
+// A chart with a name but nothing in it to step to would otherwise pass unheard.
+bool isSpoken(const Snapshot& snapshot, const Node& node) {
+  const bool isNamedChart = node.series && (node.label || node.series->name);
+  return node.isElement || (isNamedChart && elementsOfChart(snapshot, node).empty());
+}
+
 }  // namespace
 
 std::string spokenLine(const Node& node) {
   SpokenPieces pieces;
   pieces.add(node.label);
+  if (node.series && !node.label) pieces.add(node.series->name);
   pieces.add(node.value);
   addStates(node, pieces);
   pieces.add(node.hint);
@@ -90,7 +98,7 @@ std::vector<std::string> transcript(const Snapshot& snapshot, const std::string&
   bool isModalAhead = false;
   for (Node node : snapshot.nodes()) {
     isModalAhead |= node.states.modal;
-    if (!node.isElement) continue;
+    if (!isSpoken(snapshot, node)) continue;
     node.states.modal = std::exchange(isModalAhead, false);
     std::string line = spokenLine(node);
     if (!line.empty()) lines.push_back(std::move(line));

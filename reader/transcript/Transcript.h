@@ -13,8 +13,8 @@ namespace ax::reader {
 // stands, hint. Empty for a node that has nothing to say.
 std::string spokenLine(const Node& node);
 
-// The screen's title, then a line for each element in reading order. What covers the rest of the screen says
-// so with its first element.
+// The screen's title, then a line for each element in reading order, and for a chart with a name that holds
+// none. What covers the rest of the screen says so with its first element.
 std::vector<std::string> transcript(const Snapshot& snapshot, const std::string& title);
 
 }  // namespace ax::reader
