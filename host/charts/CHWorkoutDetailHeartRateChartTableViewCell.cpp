@@ -43,6 +43,7 @@ void CHWorkoutDetailHeartRateChartTableViewCell::layoutSubviews() {
   if (!chartView_) return;
   chartView_->showReadings();
   const bool isShown = chartView_->hasAdequateDataForDisplay();
+  chartView_->setHidden(!isShown);
   if (!isShown) createAndConstraintNoDataOverlay(*this);
   if (noDataOverlayView_) noDataOverlayView_->setHidden(isShown);
 }
