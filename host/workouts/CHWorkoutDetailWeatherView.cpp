@@ -1,16 +1,28 @@
 #include "host/workouts/CHWorkoutDetailWeatherView.h"
 
+#include "host/workouts/CHWorkoutFormattingManager.h"
 #include "host/workouts/Placement.h"
+#include "host/workouts/WorkoutFigures.h"
+#include "platform/foundation/Formatters.h"
 #include "platform/runtime/ClassBuilder.h"
 
 namespace ax::host {
 
 namespace {
 
-void show(Ref<Label>& label, const Ref<Object>& content) {
-  if (!label) label = make<Label>();
-  const Ref<String> text = cast<String>(content);
-  label->setText(text || !content ? text : string(content->description()));
+const Message<void(Ref<Object>, Ref<Object>, std::int64_t, Ref<Object>)> setWeather{
+    "setTemperature:humidity:weatherCondition:formattingManager:"};
+
+Ref<String> temperatureText(const Ref<Object>& temperature) {
+  const Ref<Number> degrees = cast<Number>(temperature);
+  return degrees ? hostText("weather.temperature", {formatFloat(0, degrees->floatValue())})
+                 : cast<String>(temperature);
+}
+
+Ref<String> humidityText(const Ref<Object>& humidity) {
+  const Ref<Number> fraction = cast<Number>(humidity);
+  return fraction ? hostText("weather.humidity", {formatFloatWithPercentage(fraction->floatValue(), 0)})
+                  : cast<String>(humidity);
 }
 
 }  // namespace
@@ -22,6 +34,9 @@ Class& CHWorkoutDetailWeatherView::staticClass() {
                              .instanceVariable<&T::temperatureLabel_>("_temperatureLabel")
                              .instanceVariable<&T::humidityLabel_>("_humidityLabel")
                              .instanceVariable<&T::twcButton_>("_twcButton")
+                             .property<&T::temperature, &T::setTemperature>("temperature")
+                             .property<&T::humidity, &T::setHumidity>("humidity")
+                             .property<&T::weatherCondition, &T::setWeatherCondition>("weatherCondition")
                              .method<&T::setTemperatureHumidityWeatherConditionFormattingManager>(
                                  "setTemperature:humidity:weatherCondition:formattingManager:")
                              .build();
@@ -30,11 +45,15 @@ Class& CHWorkoutDetailWeatherView::staticClass() {
 
 void CHWorkoutDetailWeatherView::setTemperatureHumidityWeatherConditionFormattingManager(
     Ref<Object> temperature, Ref<Object> humidity, std::int64_t condition, Ref<Object>) {
-  show(temperatureLabel_, temperature);
-  show(humidityLabel_, humidity);
-  if (!weatherConditionImageView_) weatherConditionImageView_ = make<ImageView>();
-  weatherConditionImageView_->setImage(condition == 0 ? nullptr : make<Image>());
+  ensure(temperatureLabel_).setText(temperatureText(temperature));
+  ensure(humidityLabel_).setText(humidityText(humidity));
+  ensure(weatherConditionImageView_).setImage(condition == 0 ? nullptr : make<Image>());
   layoutSubviews();
+}
+
+void CHWorkoutDetailWeatherView::setWeatherCondition(std::int64_t condition) {
+  weatherCondition_ = condition;
+  setWeather(*this, temperature_, humidity_, condition, CHWorkoutFormattingManager::sharedInstance());
 }
 
 void CHWorkoutDetailWeatherView::layoutSubviews() {
