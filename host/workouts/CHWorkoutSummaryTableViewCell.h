@@ -6,8 +6,8 @@
 
 namespace ax::host {
 
-// The summary on top of a workout's screen: what it was, and its figures. The cell is read as one element. A
-// session of several workouts shows their totals and averages.
+// The summary on top of a workout's screen: what it was, and its figures. A session of several workouts shows
+// their totals and averages.
 class CHWorkoutSummaryTableViewCell : public TableViewCell {
  public:
   static Class& staticClass();
@@ -16,9 +16,6 @@ class CHWorkoutSummaryTableViewCell : public TableViewCell {
   // Shows them at once.
   void setWorkouts(Ref<Array> workouts);
   void layoutSubviews() override;
-
- protected:
-  bool defaultIsElement() override { return true; }
 
  private:
   using Container = CHWorkoutSummaryTabbedLabelContainer;

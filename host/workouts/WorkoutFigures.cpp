@@ -48,7 +48,8 @@ double wholeSeconds(double seconds) {
 Ref<AttributedString> withUnit(const Ref<String>& number, std::string_view unitKey,
                                const Ref<String>& spokenUnit) {
   const Ref<String> unit = textWithSpokenForm(hostText(unitKey)->text(), spokenUnit);
-  return cast<AttributedString>(attrStringWithValueUnit(String::staticClass(), number, unit));
+  const auto styled = cast<AttributedString>(attrStringWithValueUnit(String::staticClass(), number, unit));
+  return styled ? styled : make<AttributedString>(string(number->text() + " " + unit->text()));
 }
 
 Ref<String> spokenUnit(const ShownUnit& unit, const String& number) {
