@@ -102,9 +102,14 @@ std::set<std::string> wordsOfLanguage() {
   return words;
 }
 
+// The words of "812 kilocalories" and of "Ada!".
+std::string withoutFigure(const std::string& piece) {
+  return std::regex_replace(piece, std::regex(R"(^[0-9][0-9.,]*\s*|[!.]$)"), "");
+}
+
 // Names of people, apps and places sound alike in every language, and so do some figures.
 bool isName(const std::string& piece) {
-  static const std::set<std::string> names = {"Ada", "Kenji", "Mia", "Noor"};
+  static const std::set<std::string> names = {"Ada", "Kenji", "Mia", "Noor", "Riverside Runner"};
   return names.contains(piece) || !std::regex_search(piece, std::regex("[A-Za-z]{3}"));
 }
 
@@ -142,7 +147,8 @@ TEST(Tour, LeavesNoEnglishInOtherLanguages) {
       const std::set<std::string> words = wordsOfLanguage();
       for (const std::string& label : labels) {
         for (const std::string& piece : piecesOf(label)) {
-          EXPECT_TRUE(isName(piece) || words.contains(piece) || !english.contains(piece))
+          const std::string said = withoutFigure(piece);
+          EXPECT_TRUE(isName(said) || words.contains(said) || !english.contains(piece))
               << file.filename() << " in " << locale << ": " << piece;
         }
       }
