@@ -106,6 +106,7 @@ TEST(Snapshot, FollowsListedElementsAndVisitsEachOnce) {
 
   messages::setAccessibilityElements(screen, array({}));
   EXPECT_TRUE(takeSnapshot(screen).nodes().empty());
+  messages::setAccessibilityElements(loop, nullptr);  // it held itself
 }
 
 TEST(Snapshot, EndsWhereTheHostDoesNot) {
