@@ -3,6 +3,7 @@
 #include <regex>
 #include <set>
 
+#include "platform/formatting/Dates.h"
 #include "platform/formatting/Lists.h"
 #include "platform/formatting/Region.h"
 #include "platform/formatting/StringTable.h"
@@ -90,7 +91,7 @@ std::vector<std::string> labelsOf(const reader::Snapshot& snapshot) {
   return labels;
 }
 
-// The words that the current language itself has in its tables: some are English ones too.
+// The words that the current language itself has in its tables, and its months: some are English ones too.
 std::set<std::string> wordsOfLanguage() {
   std::set<std::string> words;
   for (const char* folder : {"../share/axvelto/Host", "../share/axvelto/Platform", "../share/axvelto/Reader",
@@ -99,6 +100,8 @@ std::set<std::string> wordsOfLanguage() {
         formatting::resourceFolderBeside(reinterpret_cast<const void*>(&wordsOfLanguage), folder));
     for (const std::string& key : table.keys()) words.insert(*table.find(key));
   }
+  constexpr double month = 30.5 * 86400;
+  for (int i = 0; i < 12; ++i) words.insert(formatting::dateString((i + 0.5) * month, "MMMM"));
   return words;
 }
 
