@@ -13,7 +13,9 @@ using namespace ax;
 namespace {
 
 const std::regex& pacePattern() {
-  static const auto& pattern = *new std::regex(R"re((\d+)'\s?([0-5]?[0-9])(?:''|"))re");
+  // The pattern reads bytes: it knows the spaces of other alphabets only when they are spelled out.
+  static const auto& pattern =
+      *new std::regex("(\\d+)'(?:\\s|\u00a0|\u2009|\u202f|\u3000)?([0-5]?[0-9])(?:''|\")");
   return pattern;
 }
 

@@ -38,6 +38,9 @@ class PaceTest : public testing::Test {
 TEST_F(PaceTest, IsMarkedAsADurationInSeconds) {
   EXPECT_EQ(spokenPace("5'30\""), (Spoken{"330", "330"}));
   EXPECT_EQ(spokenPace("12' 05''"), (Spoken{"725", "725"}));
+  for (const std::string space : {"\t", "\u00a0", "\u2009", "\u202f", "\u3000"}) {
+    EXPECT_EQ(spokenPace("5'" + space + "30\""), (Spoken{"330", "330"})) << '"' << space << '"';
+  }
   EXPECT_EQ(spokenPace("0'0\""), (Spoken{"0", "0"}));
   EXPECT_EQ(spokenPace("7'9''"), (Spoken{"429", "429"}));
   EXPECT_EQ(spokenPace("20'00\""), (Spoken{"1200", "1200"})) << "without grouping";
@@ -48,9 +51,10 @@ TEST_F(PaceTest, IsMarkedAsADurationInSeconds) {
 }
 
 TEST_F(PaceTest, LeavesOtherTextsAsTheyAre) {
-  const std::string others[] = {"330",     "5:30",   "5'",      "5' 30",  "5'  30\"", "5'60\"",
-                                "5'300\"", "'30\"",  "5'3 0''", "\u2013", "-",        "5\u203230\u2033",
-                                "a'30\"",  "5'30 \""};
+  const std::string others[] = {
+      "330",     "5:30",  "5'",      "5' 30",  "5'  30\"", "5'\u202f\u202f30\"", "5'60\"",
+      "5'300\"", "'30\"", "5'3 0''", "\u2013", "-",        "5\u203230\u2033",    "a'30\"",
+      "5'30 \""};
   for (const std::string& text : others) EXPECT_EQ(spokenPace(text), (Spoken{text, ""}));
   EXPECT_EQ(spokenPace(""), (Spoken{"(nil)", ""}));
 }
