@@ -86,10 +86,11 @@ void addElements(const std::vector<const Node*>& elements, Lines& lines) {
 void addSlices(const DataSeries& series, Lines& lines) {
   if (!series.usesSlices) return;
   const auto hours = static_cast<std::int64_t>(series.hoursPerSlice);
+  const bool isWholeHours = hours > 0 && static_cast<double>(hours) * 3600 == series.secondsPerSlice;
   add(lines, once,
       joined({count("chart.slices", series.slices.size()),
-              hours == 0 ? formatting::spokenDuration(series.secondsPerSlice)
-                         : readerText("chart.slice.hours", {hours})}));
+              isWholeHours ? readerText("chart.slice.hours", {hours})
+                           : formatting::spokenDuration(series.secondsPerSlice)}));
   std::int64_t index = 0;
   for (const DataSlice& slice : series.slices) {
     const std::string from = formatting::spokenDuration(slice.start),

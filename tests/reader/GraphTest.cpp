@@ -125,6 +125,20 @@ TEST(Graph, AsksConsecutiveSlices) {
   EXPECT_TRUE(charts(takeSnapshot(chart)).empty());
 }
 
+TEST(Graph, TellsTheLengthOfASliceInHoursOnlyWhenTheyAreWhole) {
+  const Ref<Slices> chart = view<Slices>({});
+  const auto length = [&chart] {
+    const Snapshot snapshot = takeSnapshot(chart);
+    return describeChart(snapshot, *charts(snapshot).at(0)).at(1);
+  };
+  chart->secondsPerSlice = 3 * 3600;
+  chart->hoursPerSlice = 3;
+  EXPECT_EQ(length(), "  2 slices, 3 hours per slice");
+  chart->secondsPerSlice = 5400;
+  chart->hoursPerSlice = 1;
+  EXPECT_EQ(length(), "  2 slices, 1 hour, 30 minutes");
+}
+
 TEST(Graph, BoundsWhatABrokenHostCounts) {
   const Ref<Slices> chart = view<Slices>({});
   chart->count = std::numeric_limits<std::uint64_t>::max();
