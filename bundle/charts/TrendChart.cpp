@@ -38,10 +38,11 @@ double keptFigure(Object& chart, Key key) {
   return unboxDouble(chart._accessibilityValueForKey(key));
 }
 
-Ref<String> spokenFigureInRange(Object& chart, const RangeKeys& keys, double position) {
+Ref<String> spokenFigureInRange(Object& chart, const RangeKeys& keys, double position,
+                                const Ref<Unit>& unit) {
   const double minimum = keptFigure(chart, keys.minimum);
   const double maximum = keptFigure(chart, keys.maximum);
-  return spokenFigure(minimum + (maximum - minimum) * position, trendUnit(chart));
+  return spokenFigure(minimum + (maximum - minimum) * position, unit);
 }
 
 }  // namespace ax

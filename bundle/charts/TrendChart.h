@@ -45,7 +45,7 @@ struct RangeKeys {
 double keptFigure(Object& chart, Key key);
 
 // The figure that lies at a position from 0 to 1 of the kept range, in words.
-Ref<String> spokenFigureInRange(Object& chart, const RangeKeys& keys, double position);
+Ref<String> spokenFigureInRange(Object& chart, const RangeKeys& keys, double position, const Ref<Unit>& unit);
 
 // The base of both categories. C says, besides what GraphDataChart asks, under which keys it keeps its range:
 // `static RangeKeys rangeKeys()`.

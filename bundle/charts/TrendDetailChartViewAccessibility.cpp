@@ -84,7 +84,7 @@ class TrendDetailChartViewAccessibility : public TrendChart<TrendDetailChartView
   }
 
   Ref<String> _accessibilityDataSeriesValueDescriptionForPositionAxis(double position, std::int64_t axis) {
-    if (axis == 1) return spokenFigureInRange(self, rangeKeys(), position);
+    if (axis == 1) return spokenFigureInRange(self, rangeKeys(), position, trendUnit(self));
     return axis == 0 ? spokenDay(position) : nullptr;
   }
 
@@ -124,7 +124,7 @@ class TrendDetailChartViewAccessibility : public TrendChart<TrendDetailChartView
     formatter->setDateTemplate("MMMMdyyyy");
     const Ref<View> view = castAsClass<View>(self);
     const Ref<Array> stops = messages::_accessibilityGraphData(self);
-    if (!view || barCount() == 0) return;
+    if (!view || !stops || stops->isEmpty()) return;
     const double top = 2 * titleHeight;
     const double width = view->frame().width / static_cast<double>(stops->count());
     const double height = std::floor(view->frame().height) - top;

@@ -72,7 +72,8 @@ class TrendDetailDailyAverageViewAccessibility : public TrendChart<TrendDetailDa
 
   Ref<String> _accessibilityDataSeriesValueDescriptionForPositionAxis(double position, std::int64_t axis) {
     if (axis == 0) return axDayStringForIndex(self, nearestColumn(position * 6), make<DateFormatter>());
-    return axis == 1 && trendUnit(self) ? spokenFigureInRange(self, rangeKeys(), position) : nullptr;
+    const Ref<Unit> unit = axis == 1 ? trendUnit(self) : nullptr;
+    return unit ? spokenFigureInRange(self, rangeKeys(), position, unit) : nullptr;
   }
 
   Ref<Array> accessibilityElements() {
