@@ -125,6 +125,17 @@ TEST_F(TrendChartTest, TakesTenThousandBars) {
   EXPECT_EQ(values(chart, 1)[9999], 9999);
 }
 
+TEST_F(TrendChartTest, CountsInIntegersAndMeasuresInDoubles) {
+  const auto chart = trend(2, [](std::size_t) { return kilocalories(7); });
+  const auto valueOf = [&chart](std::int64_t axis) {
+    return cast<Number>(messages::_accessibilityDataSeriesValuesForAxis(chart, axis)->at(1));
+  };
+  EXPECT_EQ(messages::_accessibilityDataSeriesMaximumValueForAxis(chart, 0)->content(),
+            Number::Content(std::uint64_t(2)));
+  EXPECT_EQ(valueOf(0)->content(), Number::Content(std::int32_t(1)));
+  EXPECT_EQ(valueOf(1)->content(), Number::Content(7.0));
+}
+
 TEST_F(TrendChartTest, RoundsEachAverageHalfUpAndKeepsTheRangeOfThose) {
   const auto chart = averages([](std::size_t) { return kilocalories(0.125); },
                               [](std::size_t) { return kilocalories(-0.125); });
