@@ -2,6 +2,7 @@
 #include <limits>
 
 #include "bundle/charts/DataSeriesChart.h"
+#include "bundle/charts/Extremes.h"
 #include "bundle/shared/LocalizedString.h"
 #include "platform/foundation/Calendar.h"
 #include "platform/foundation/Formatters.h"
@@ -18,26 +19,12 @@ constexpr std::uint64_t sliceCount = 8;
 const Message<Ref<DateInterval>()> axDateInterval{"_axDateInterval"};
 const Message<float(Ref<Date>)> decimalForDate{"_decimalForDate:"};
 
-// The lowest and the highest of the whole heart rates in a stretch of time.
-struct RateRange {
-  double minimum = std::numeric_limits<double>::max();
-  double maximum = std::numeric_limits<double>::min();
-
-  void include(double rate) {
-    if (rate > maximum) maximum = rate;
-    if (rate < minimum) minimum = rate;
-  }
-  bool isEmpty() const {
-    return minimum == std::numeric_limits<double>::max() || maximum == std::numeric_limits<double>::min();
-  }
-};
-
 Ref<String> spokenRate(double rate) {
   return formatFloat(0, static_cast<float>(rate));
 }
 
-Ref<String> spokenRange(const RateRange& range) {
-  if (range.isEmpty()) return nullptr;
+Ref<String> spokenRange(const Extremes& range) {
+  if (range.isIncomplete()) return nullptr;
   if (std::abs(range.maximum - range.minimum) < std::numeric_limits<double>::epsilon()) {
     return stringWithFormat(accessibilityLocalizedString("heart.rate.graph.single"),
                             {spokenRate(range.maximum)});
@@ -165,8 +152,9 @@ class CHWorkoutDetailHeartRateChartViewAccessibility
     return cast<Number>(safeValueForKey(chart, key));
   }
 
-  RateRange ratesIn(const DateInterval& interval) {
-    RateRange range;
+  // Of the whole heart rates in a stretch of time.
+  Extremes ratesIn(const DateInterval& interval) {
+    Extremes range;
     const Ref<Array> readings = safeArrayForKey(self, "_heartRateReadings"_key);
     if (!readings) return range;
     for (const Ref<Object>& item : *readings) {

@@ -1,6 +1,6 @@
 #include <cmath>
-#include <limits>
 
+#include "bundle/charts/Extremes.h"
 #include "bundle/charts/TrendChart.h"
 #include "bundle/shared/LocalizedString.h"
 #include "platform/foundation/Formatters.h"
@@ -13,17 +13,6 @@ namespace {
 const Message<Ref<Quantity>(std::int32_t)> accessibilityQuantityForIndex{"accessibilityQuantityForIndex:"};
 const Message<Ref<DateInterval>(std::int32_t)> accessibilityDateIntervalForIndex{
     "accessibilityDateIntervalForIndex:"};
-
-// The smallest and the largest figure of one build. Over no figure at all they stay where they start.
-struct Extremes {
-  double minimum = std::numeric_limits<double>::max();
-  double maximum = std::numeric_limits<double>::min();
-
-  void include(double figure) {
-    if (figure > maximum) maximum = figure;
-    if (figure < minimum) minimum = figure;
-  }
-};
 
 // A trend over time: the title as a header, then one element per bar that has a figure.
 class TrendDetailChartViewAccessibility : public TrendChart<TrendDetailChartViewAccessibility> {
