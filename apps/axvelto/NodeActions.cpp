@@ -50,7 +50,7 @@ struct Change {
 };
 
 void printOutcome(Presentation& presentation, const Snapshot& before, const Ref<Object>& acted) {
-  const std::string& title = presentation.scene().title;
+  const std::string& title = presentation.run().title();
   const Snapshot after = presentation.snapshot();
   const Change change{transcript(before, title), transcript(after, title)};
   const Node* node = after.nodeOf(*acted);

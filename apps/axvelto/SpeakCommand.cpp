@@ -14,7 +14,7 @@ void declare(CLI::App& app, Arguments& arguments) {
 
 ExitCode run(const Arguments& arguments) {
   Presentation presentation(arguments);
-  print(reader::transcript(presentation.snapshot(), presentation.scene().title));
+  print(reader::transcript(presentation.snapshot(), presentation.run().title()));
   return exitDone;
 }
 

@@ -14,7 +14,7 @@ void declare(CLI::App& app, Arguments& arguments) {
 
 ExitCode run(const Arguments& arguments) {
   Presentation presentation(arguments);
-  print(nlohmann::ordered_json{{"title", presentation.scene().title},
+  print(nlohmann::ordered_json{{"title", presentation.run().title()},
                                {"elements", reader::treeAsJson(presentation.snapshot())}});
   return exitDone;
 }

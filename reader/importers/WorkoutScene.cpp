@@ -38,20 +38,19 @@ double endOf(const WorkoutActivity& activity) {
   return activity.start + activity.duration;
 }
 
-Json sceneOf(const std::string& title, Json screenTitle, double now, const SceneRows& rows) {
+Json sceneOf(Json title, Json screenTitle, double now, const SceneRows& rows) {
   const formatting::Region& region = formatting::currentRegion();
   return {
       {"format", "axvelto-scene/1"},
-      {"title", title},
+      {"title", std::move(title)},
       {"environment",
        {{"locale", region.locale}, {"timeZone", region.timeZone}, {"now", sceneDate(now)["date"]}}},
       {"screen", sceneObject("ViewController", {{"title", std::move(screenTitle)}, {"view", rows.table()}})}};
 }
 
-std::string titleOf(const WorkoutActivity& activity) {
-  constexpr std::size_t day = 10;  // of "2026-03-08T14:30:00"
-  if (!activity.title.empty()) return activity.title;
-  return activity.sport + ' ' + sceneDate(activity.start)["date"].get<std::string>().substr(0, day);
+// The file's own name for it, else the kind of workout.
+Json titleOf(const WorkoutActivity& activity) {
+  return activity.title.empty() ? appText("workout." + activity.sport) : Json(activity.title);
 }
 
 std::vector<const WorkoutActivity*> activitiesOf(const std::vector<WorkoutFile>& files) {
@@ -101,7 +100,7 @@ Json workoutListScene(const std::vector<WorkoutFile>& files, const WorkoutSceneO
     activities[i].record = sceneReference("workout-" + std::to_string(i + 1));
   }
   addListRows(rows, std::move(activities));
-  return sceneOf("Workouts", appText("workouts.title"), now, rows);
+  return sceneOf(appText("workouts.title"), appText("workouts.title"), now, rows);
 }
 
 }  // namespace ax::reader

@@ -10,6 +10,7 @@
 #include "reader/scene/HostNames.h"
 #include "reader/scene/ObjectReader.h"
 #include "reader/scene/StepReader.h"
+#include "reader/scene/ValueReader.h"
 
 namespace ax::reader {
 
@@ -68,6 +69,19 @@ void readScreen(const JsonNode& node, Scene& scene, SceneIds& ids) {
   }
 }
 
+// Titles stay in front of what is shown, so they are texts without references to it.
+SceneValue readTitle(const JsonNode& node) {
+  if (node.isObject()) {
+    node.field("localized").text();
+  } else {
+    node.text();
+  }
+  SceneIds none;
+  SceneValue title = readValue(node, none);
+  none.settleObjects();
+  return title;
+}
+
 void readContent(const JsonNode& root, Scene& scene) {
   SceneIds ids;
   if (const auto objects = root.optionalField("objects")) {
@@ -92,7 +106,7 @@ Scene readScene(std::string_view text, const std::string& file) {
     root.field("format").failKind("\"" + std::string(format) + "\"");
   }
   Scene scene{file};
-  if (const auto title = root.optionalField("title")) scene.title = title->text();
+  if (const auto title = root.optionalField("title")) scene.title = readTitle(*title);
   if (const auto environment = root.optionalField("environment")) {
     scene.environment = readEnvironment(*environment);
   }

@@ -25,8 +25,8 @@ struct SceneDay {
 
 // A screen as a file describes it. A plain record: nothing has been made or changed when it stands.
 struct Scene {
-  std::string file;  // for faults
-  std::string title = {};
+  std::string file;       // for faults
+  SceneValue title = {};  // a text, literal or of the host's; nil when it has none
   SceneEnvironment environment = {};
   std::vector<HostOmission> without = {};
   std::vector<SceneDay> days = {};

@@ -74,6 +74,7 @@ void SceneRun::openBundle(const std::string& modulePath) {
 }
 
 void SceneRun::makeObjects() {
+  if (const Ref<Object> title = builder_->value(scene_.title)) title_ = title->description();
   for (const SceneObject& object : scene_.objects) builder_->allocate(object);
   if (scene_.screen) builder_->allocate(*scene_.screen);
   for (const SceneObject& object : scene_.objects) objects_.push_back(builder_->build(object));

@@ -27,6 +27,8 @@ class SceneRun {
   ~SceneRun();
 
   const Scene& scene() const { return scene_; }
+  // In the language of the scene; empty when it has none.
+  const std::string& title() const { return title_; }
   // Nil when the scene has none. A view or a view controller.
   const Ref<Object>& screen() const { return screen_; }
   const std::vector<Ref<Object>>& objects() const { return objects_; }
@@ -51,6 +53,7 @@ class SceneRun {
   const Scene& scene_;
   std::unique_ptr<LoadedBundle> bundle_;
   std::unique_ptr<ObjectBuilder> builder_;
+  std::string title_;
   Ref<Object> screen_;
   std::vector<Ref<Object>> objects_;
   std::vector<std::string> hostFaults_;
