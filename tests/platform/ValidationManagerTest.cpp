@@ -1,0 +1,193 @@
+#include "platform/accessibility/ValidationManager.h"
+
+#include <gtest/gtest.h>
+
+#include "platform/accessibility/CategoryRegistration.h"
+#include "platform/accessibility/Notifications.h"
+#include "platform/toolkit/Label.h"
+
+namespace ax {
+
+namespace {
+
+const Message<Ref<String>()> reply{"validationTestReply"};
+
+class Screen : public View {
+ public:
+  static Class& staticClass() {
+    static Class& result = ClassBuilder<Screen>("Velto.ValidationTestScreen", View::staticClass())
+                               .instanceVariable<&Screen::title>("_titleLabel")
+                               .instanceVariable<&Screen::isBusy>("_isBusy")
+                               .method<&Screen::configure>("configureWithTitle1:value1:")
+                               .method<&Screen::run>("runWithBlock:")
+                               .method<&Screen::place>("placeAt:")
+                               .method<&Screen::reply>("validationTestReply")
+                               .classMethod<&Screen::shared>("sharedScreen")
+                               .conformsTo("ValidationTestSource")
+                               .build();
+    return result;
+  }
+  void configure(Ref<String>, Ref<String>) {}
+  bool run(std::function<void()>) { return false; }
+  double place(Rect, std::int32_t) { return 0; }
+  Ref<String> reply() { return string("host"); }
+  static Ref<Screen> shared() { return nullptr; }
+  Ref<Label> title;
+  bool isBusy = false;
+};
+
+class SubScreen : public Screen {
+ public:
+  static Class& staticClass() {
+    static Class& result = ClassBuilder<SubScreen>("ValidationTestSubScreen", Screen::staticClass()).build();
+    return result;
+  }
+};
+
+constexpr const char* screen = "Velto.ValidationTestScreen";
+constexpr const char* subScreen = "ValidationTestSubScreen";
+constexpr const char* nobody = "ValidationTestNobody";
+
+TEST(ValidationManager, checksAndTellsWhatItFound) {
+  SubScreen::staticClass();
+  const Ref<ValidationManager> owned = make<ValidationManager>();
+  ValidationManager& m = *owned;
+  EXPECT_TRUE(m.validateClass(screen));
+  EXPECT_TRUE(m.validateClassIsKindOfClass(subScreen, "View"));
+  EXPECT_TRUE(m.validateClassHasInstanceVariableWithType(subScreen, "_titleLabel", "Label"));
+  EXPECT_TRUE(m.validateClassHasInstanceVariableWithType(screen, "_isBusy", "B"));
+  EXPECT_TRUE(m.validateClassHasInstanceMethodWithFullSignature(
+      screen, "configureWithTitle1: value1:", {"v", "@", "@"}));
+  EXPECT_TRUE(m.validateClassHasInstanceMethodWithFullSignature(screen, "runWithBlock:", {"B", "@?"}));
+  EXPECT_TRUE(
+      m.validateClassHasInstanceMethodWithFullSignature(screen, "placeAt:", {"d", rectEncoding, "i"}));
+  EXPECT_TRUE(m.validateClassHasClassMethodWithFullSignature(subScreen, "sharedScreen", {"@"}));
+  EXPECT_TRUE(m.validateClassConformsToProtocol(subScreen, "ValidationTestSource"));
+  EXPECT_TRUE(m.failedChecks().empty());
+  EXPECT_EQ(m.checks().size(), 9u);
+}
+
+TEST(ValidationManager, namesWhatFails) {
+  const Ref<ValidationManager> owned = make<ValidationManager>();
+  ValidationManager& m = *owned;
+  const struct {
+    bool held;
+    const char* text;
+    const char* expected;
+    const char* found;
+  } cases[] = {
+      {m.validateClass(nobody), "ValidationTestNobody exists", "a class", "no such class"},
+      {m.validateClassIsKindOfClass(screen, "Label"), "Velto.ValidationTestScreen is kind of Label",
+       "a subclass of Label", "a subclass of View"},
+      {m.validateClassIsKindOfClass(screen, nobody),
+       "Velto.ValidationTestScreen is kind of ValidationTestNobody", "a subclass of ValidationTestNobody",
+       "no class ValidationTestNobody"},
+      {m.validateClassHasInstanceVariableWithType(screen, "_titleLabel", "View"),
+       "Velto.ValidationTestScreen has instance variable _titleLabel", "View", "Label"},
+      {m.validateClassHasInstanceVariableWithType(screen, "_validationTestMissing", "View"),
+       "Velto.ValidationTestScreen has instance variable _validationTestMissing", "View", "no such member"},
+      {m.validateClassHasInstanceMethodWithFullSignature(screen, "validationTestReply", {"@", "q"}),
+       "Velto.ValidationTestScreen has instance method validationTestReply", "@ q", "@"},
+      {m.validateClassHasInstanceMethodWithFullSignature(screen, "sharedScreen", {"@"}),
+       "Velto.ValidationTestScreen has instance method sharedScreen", "@", "no such member"},
+      {m.validateClassHasClassMethodWithFullSignature(screen, "validationTestReply", {"@"}),
+       "Velto.ValidationTestScreen has class method validationTestReply", "@", "no such member"},
+      {m.validateClassConformsToProtocol(screen, "ValidationTestOther"),
+       "Velto.ValidationTestScreen conforms to protocol ValidationTestOther", "adopted", "not adopted"},
+      {m.validateClassConformsToProtocol(nobody, "ValidationTestSource"),
+       "ValidationTestNobody conforms to protocol ValidationTestSource", "adopted", "no such class"}};
+  const std::vector<ContractCheck> failed = m.failedChecks();
+  ASSERT_EQ(failed.size(), std::size(cases));
+  for (std::size_t i = 0; i < failed.size(); ++i) {
+    EXPECT_FALSE(cases[i].held);
+    EXPECT_EQ(failed[i].description(), cases[i].text);
+    EXPECT_EQ(failed[i].expected, cases[i].expected) << cases[i].text;
+    EXPECT_EQ(failed[i].found, cases[i].found) << cases[i].text;
+  }
+}
+
+template <int N>
+class Category : public SafeCategory<Category<N>> {
+ public:
+  using SafeCategory<Category>::SafeCategory;
+  static void _accessibilityPerformValidations(ValidationManager& manager) {
+    manager.validateClass("View");
+    manager.validateClassHasInstanceVariableWithType(screen, "_gone" + std::to_string(N), "Label");
+  }
+  Ref<String> reply() { return string(this->super(ax::reply)->text() + " " + std::to_string(N)); }
+};
+
+template <int N>
+Class& registerNumbered(const char* name, const char* target) {
+  const Override override = overrides<&Category<N>::reply>(reply);
+  return registerCategory(name, target, &Category<N>::_accessibilityPerformValidations, {&override, 1});
+}
+
+void startWith(ValidationManager& manager, bool checks, const ValidationManager::Handler& installation) {
+  manager.performValidationsWithPreValidationHandlerPostValidationHandlerSafeCategoryInstallationHandler(
+      [](ValidationManager& m) { return m.validateClass(nobody); },
+      [checks](ValidationManager& m) {
+        m.setValidationTargetName(string("AX Velto"));
+        return checks;
+      },
+      nullptr, installation);
+}
+
+TEST(ValidationManager, installsInOrderWhateverIsMissing) {
+  registerNumbered<1>("ValidationTestOne", screen);
+  registerNumbered<2>("ValidationTestTwo", nobody);
+  registerNumbered<3>("ValidationTestThree", screen);
+  const Ref<ValidationManager> owned = make<ValidationManager>();
+  ValidationManager& m = *owned;
+  startWith(m, true, [](ValidationManager& manager) {
+    for (const char* name : {"ValidationTestOne", "ValidationTestNone", "ValidationTestTwo",
+                             "ValidationTestThree", "ValidationTestOne"}) {
+      manager.installSafeCategoryCanInteractWithTargetClass(name, true);
+    }
+  });
+  std::vector<bool> installed;
+  for (const InstallationRequest& request : m.installationRequests()) {
+    EXPECT_TRUE(request.canInteractWithTargetClass);
+    installed.push_back(request.installed);
+  }
+  EXPECT_EQ(installed, (std::vector{true, false, false, true, false}));
+  EXPECT_EQ(reply(make<SubScreen>())->text(), "host 1 3") << "failed checks do not stop a category";
+  EXPECT_EQ(m.validationTargetName(), "AX Velto");
+  const std::vector<ContractCheck> failed = m.failedChecks();
+  ASSERT_EQ(failed.size(), 3u) << "one of the bundle, one of each category that has a target";
+  EXPECT_EQ(failed[0].category, "");
+  EXPECT_EQ(failed[1].category, "ValidationTestOne");
+  EXPECT_EQ(failed[1].member, "_gone1");
+  EXPECT_EQ(failed[2].category, "ValidationTestThree");
+}
+
+TEST(ValidationManager, installsWithoutChecksWhenTheyAreOff) {
+  registerNumbered<4>("ValidationTestFour", subScreen);
+  const Ref<ValidationManager> owned = make<ValidationManager>();
+  ValidationManager& m = *owned;
+  startWith(m, false, [](ValidationManager& manager) {
+    manager.installSafeCategoryCanInteractWithTargetClass("ValidationTestFour", true);
+  });
+  EXPECT_TRUE(m.checks().empty());
+  EXPECT_TRUE(m.installationRequests().at(0).installed);
+  EXPECT_EQ(reply(make<SubScreen>())->text().back(), '4');
+}
+
+TEST(Reports, keepWhatWasPostedAndBroken) {
+  forgetReports();
+  const Ref<String> about = string("about");
+  postNotification(LayoutChangedNotification, about);
+  assertion(true, "holds", "source", 1, "function");
+  assertion(false, "broken", "source", 52, "function");
+  ASSERT_EQ(postedNotifications().size(), 1u);
+  EXPECT_EQ(postedNotifications()[0].argument, about);
+  ASSERT_EQ(failedAssertions().size(), 1u);
+  EXPECT_EQ(failedAssertions()[0].message, "broken");
+  EXPECT_EQ(failedAssertions()[0].line, 52);
+  forgetReports();
+  EXPECT_TRUE(postedNotifications().empty());
+}
+
+}  // namespace
+
+}  // namespace ax
