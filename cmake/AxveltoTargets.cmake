@@ -16,7 +16,7 @@ set(CMAKE_BUILD_RPATH_USE_ORIGIN ON)
 add_library(axvelto-settings INTERFACE)
 target_include_directories(axvelto-settings INTERFACE ${CMAKE_SOURCE_DIR})
 target_compile_options(axvelto-settings INTERFACE -Wall -Wextra -Wpedantic -Werror -Wshadow -Wnon-virtual-dtor
-                                                  -Wcast-align -Woverloaded-virtual)
+                                                  -Wcast-align -Woverloaded-virtual -fno-plt)
 
 set(AXVELTO_SANITIZE "" CACHE STRING "Sanitizers to build with, as -fsanitize takes them")
 if(AXVELTO_SANITIZE)

@@ -104,7 +104,9 @@ const KeyReader& Class::readerForKeySlowly(Key key) const {
   KeyReader& reader = ownedReaders_.emplace_back();
   reader.selector = key;
   reader.variable = instanceVariable(key);
-  if (reader.variable == nullptr) {
+  if (reader.variable != nullptr) {
+    reader.objectOffset = reader.variable->objectOffset;
+  } else {
     const Method& method = lookUp(key);
     const bool isReadable = method.function != nullptr && method.signature->encodings.size() == 1 &&
                             method.signature->encodings[0] != "v";

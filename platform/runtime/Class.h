@@ -16,6 +16,7 @@ namespace ax {
 // another.
 struct InstanceVariable {
   Selector selector = {};
+  std::ptrdiff_t objectOffset = -1;  // where it lies, if it is nothing but the address of an object
   std::string (*type)() = nullptr;
   Ref<Object> (*read)(const Object&) = nullptr;
   bool (*write)(Object&, const Ref<Object>&) = nullptr;  // false: the value is of another kind
@@ -24,6 +25,7 @@ struct InstanceVariable {
 // How a class answers one key: an instance variable, a method without arguments, or neither.
 struct KeyReader {
   Selector selector = {};
+  std::ptrdiff_t objectOffset = -1;
   const InstanceVariable* variable = nullptr;
   const Method* method = nullptr;
 };

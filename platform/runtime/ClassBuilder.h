@@ -1,5 +1,7 @@
 #pragma once
 
+#include <bit>
+
 #include "platform/runtime/Class.h"
 #include "platform/runtime/Signature.h"
 #include "platform/runtime/Weak.h"
@@ -66,6 +68,29 @@ struct Variable {
   }
 };
 
+// How far from the beginning of an object a member lies that is nothing but the address of another; -1 for
+// members of any other form.
+template <auto Member, class Owner, class T>
+std::ptrdiff_t offsetIn(T Owner::*) {
+  return -1;
+}
+template <auto Member, class Owner, class T>
+requires std::is_base_of_v<Object, Owner> && std::is_base_of_v<Object, T> std::ptrdiff_t offsetIn(
+    Ref<T> Owner::*) {
+  static_assert(sizeof(Ref<T>) == sizeof(Object*) && sizeof(Member) == sizeof(std::ptrdiff_t));
+  const auto atSameAddress = []<class U>(U* object) {
+    return static_cast<void*>(static_cast<Object*>(object)) == static_cast<void*>(object);
+  };
+  const auto somewhere = std::uintptr_t(1) << 16;
+  const bool begins =
+      atSameAddress(reinterpret_cast<Owner*>(somewhere)) && atSameAddress(reinterpret_cast<T*>(somewhere));
+  return begins ? std::bit_cast<std::ptrdiff_t>(Member) : -1;
+}
+template <auto Member>
+std::ptrdiff_t objectOffset() {
+  return offsetIn<Member>(Member);
+}
+
 // The canonical form of a result or an argument, and back.
 template <class T>
 CanonicalType<T> canonical(T&& value) {
@@ -101,6 +126,7 @@ Method record(Selector selector, CanonicalType<R> (*function)(Object&, const Met
   return {.selector = selector,
           .signature = &signatureOf<R, A...>(),
           .function = reinterpret_cast<GenericFunction>(function),
+          .result = identityOf<std::remove_cvref_t<R>>(),
           .takes = &takesArguments<A...>};
 }
 
@@ -171,6 +197,7 @@ class ClassBuilder {
   ClassBuilder& instanceVariable(std::string_view name) {
     using Type = typename registration::MemberType<decltype(Member)>::type;
     class_.addInstanceVariable({.selector = Selector::intern(name),
+                                .objectOffset = registration::objectOffset<Member>(),
                                 .type = &registration::Declared<Type>::type,
                                 .read = &registration::Variable<T, Member>::read,
                                 .write = &registration::Variable<T, Member>::write});

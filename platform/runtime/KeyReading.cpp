@@ -2,6 +2,7 @@
 
 #include <atomic>
 #include <cstdio>
+#include <cstring>
 #include <mutex>
 #include <set>
 
@@ -9,16 +10,27 @@
 
 namespace ax {
 
-Ref<Object> Object::safeValueForKey(Key key) const {
-  if (!key) return nullptr;
-  const KeyReader& reader = isa_->readerForKey(key);
+namespace {
+
+Ref<Object> readGuarded(const Object& object, const KeyReader& reader) {
   try {
-    if (reader.variable != nullptr) return reader.variable->read(*this);
+    if (reader.variable != nullptr) return reader.variable->read(object);
     if (reader.method == nullptr) return nullptr;
-    return reader.method->signature->invoke(const_cast<Object&>(*this), *reader.method, {});
+    return reader.method->signature->invoke(const_cast<Object&>(object), *reader.method, {});
   } catch (...) {
     return nullptr;
   }
+}
+
+}  // namespace
+
+Ref<Object> Object::safeValueForKey(Key key) const {
+  if (!key) return nullptr;
+  const KeyReader& reader = isa_->readerForKey(key);
+  if (reader.objectOffset < 0) return readGuarded(*this, reader);
+  Object* value;
+  std::memcpy(&value, reinterpret_cast<const char*>(this) + reader.objectOffset, sizeof value);
+  return Ref<Object>(value);
 }
 
 Ref<Object> Object::safeValueForKeyPath(std::string_view dottedKeys) const {

@@ -33,7 +33,9 @@ template <class R, class... A>
 class Message<R(A...)> {
  public:
   explicit Message(std::string_view name)
-      : selector_(Selector::intern(name)), signature_(&signatureOf<R, A...>()) {}
+      : selector_(Selector::intern(name)),
+        signature_(&signatureOf<R, A...>()),
+        result_(identityOf<std::remove_cvref_t<R>>()) {}
 
   Selector selector() const { return selector_; }
   const Signature& signature() const { return *signature_; }
@@ -52,13 +54,16 @@ class Message<R(A...)> {
     if constexpr (std::is_same_v<R, CanonicalType<R>>) {
       return function(object, method, std::move(arguments)...);
     } else {
-      return cast<typename R::Target>(function(object, method, std::move(arguments)...));
+      Ref<Object> result = function(object, method, std::move(arguments)...);
+      if (method.result != result_) return cast<typename R::Target>(std::move(result));
+      return R::adopt(static_cast<typename R::Target*>(result.leak()));
     }
   }
 
  private:
   Selector selector_;
   const Signature* signature_;
+  const void* result_;  // methods that return the same C++ type are believed
 };
 
 // Whether an object's class answers the message with the message's own type.

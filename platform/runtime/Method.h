@@ -21,6 +21,7 @@ struct Method {
   Selector selector = {};
   const Signature* signature = nullptr;
   GenericFunction function = nullptr;    // null: the class lacks the message
+  const void* result = nullptr;          // the C++ type of what it returns; null: any object
   const Class* owner = nullptr;          // the class in whose table the entry stands
   const Method* former = nullptr;        // what a grafted entry replaced in the same table, if anything
   const CategoryGraft* graft = nullptr;  // the graft that brought it, if one did

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <atomic>
 #include <cstdint>
 #include <string>
 
@@ -84,11 +85,20 @@ class Object {
   Attachment* attachments_ = nullptr;
 };
 
+// The class of a C++ type, asked for once.
+template <class T>
+const Class& classOf() {
+  static std::atomic<const Class*> known = nullptr;
+  const Class* result = known.load(std::memory_order_relaxed);
+  if (result == nullptr) known.store(result = &T::staticClass(), std::memory_order_release);
+  return *result;
+}
+
 // Makes an object of a C++ class, with the class that it registered under its name.
 template <class T, class... Arguments>
 Ref<T> make(Arguments&&... arguments) {
   T* object = new T(std::forward<Arguments>(arguments)...);
-  object->isa_ = &T::staticClass();
+  object->isa_ = &classOf<T>();
   return Ref<T>::adopt(object);
 }
 
@@ -98,7 +108,9 @@ T* cast(Object* object) {
   if constexpr (std::is_same_v<T, Object>) {
     return object;
   } else {
-    return object != nullptr && object->isKindOf(T::staticClass()) ? static_cast<T*>(object) : nullptr;
+    if (object == nullptr) return nullptr;
+    const Class& wanted = classOf<T>();
+    return &object->isa() == &wanted || object->isKindOf(wanted) ? static_cast<T*>(object) : nullptr;
   }
 }
 

@@ -41,6 +41,7 @@ bool setScriptedAnswer(Object& object, Selector selector, ScriptedAnswer answer)
   if (method->unscripted == nullptr) {
     method->unscripted = method->function;
     method->function = method->signature->scripted;
+    method->result = nullptr;
   }
   Object* answers = object.attached(&answersKey);
   if (answers == nullptr) {

@@ -3,16 +3,60 @@
 #include <atomic>
 #include <cstring>
 #include <deque>
-#include <memory>
 #include <mutex>
 #include <string>
 #include <vector>
 
 #include "platform/runtime/Method.h"
+#include "platform/runtime/PointerSlots.h"
 
 namespace ax {
 
 namespace {
+
+std::uint64_t word(const char* bytes) {
+  std::uint64_t value;
+  std::memcpy(&value, bytes, sizeof value);
+  return value;
+}
+
+std::uint64_t halfWord(const char* bytes) {
+  std::uint32_t value;
+  std::memcpy(&value, bytes, sizeof value);
+  return value;
+}
+
+struct Ends {
+  std::uint64_t head;
+  std::uint64_t tail;
+};
+
+// All bytes of a text of at most 16, some of them perhaps twice.
+Ends ends(const char* bytes, std::size_t size) {
+  if (size >= 8) return {word(bytes), word(bytes + size - 8)};
+  if (size >= 4) return {halfWord(bytes), halfWord(bytes + size - 4)};
+  if (size == 0) return {0, 0};
+  const auto byte = [&](std::size_t i) { return std::uint64_t(std::uint8_t(bytes[i])); };
+  return {byte(0) | byte(size / 2) << 8, byte(size - 1)};
+}
+
+std::uint64_t folded(std::uint64_t a, std::uint64_t b) {
+  __extension__ using Wide = unsigned __int128;
+  const Wide product = Wide(a) * b;
+  return std::uint64_t(product) ^ std::uint64_t(product >> 64);
+}
+
+bool isSameText(std::string_view a, std::string_view b) {
+  if (a.size() != b.size()) return false;
+  if (a.size() > 32) return std::memcmp(a.data(), b.data(), a.size()) == 0;
+  std::size_t done = 0;
+  for (; done + 16 < a.size(); done += 8) {
+    if (word(a.data() + done) != word(b.data() + done)) return false;
+  }
+  const Ends left = ends(a.data() + done, a.size() - done);
+  const Ends right = ends(b.data() + done, b.size() - done);
+  return left.head == right.head && left.tail == right.tail;
+}
 
 // All names of the process. Finding takes no lock: slots are single pointers, published when complete.
 class NameTable {
@@ -20,9 +64,9 @@ class NameTable {
   const SelectorRecord* find(std::string_view name, std::uint64_t hash) const {
     const Slots& slots = *slots_.load(std::memory_order_acquire);
     for (std::size_t i = hash & slots.mask;; i = (i + 1) & slots.mask) {
-      const SelectorRecord* record = slots.records[i].load(std::memory_order_acquire);
+      const SelectorRecord* record = slots.at(i).load(std::memory_order_acquire);
       if (record == nullptr) return nullptr;
-      if (record->textHash == hash && record->name == name) return record;
+      if (record->textHash == hash && isSameText(record->name, name)) return record;
     }
   }
 
@@ -40,21 +84,16 @@ class NameTable {
   }
 
  private:
-  struct Slots {
-    explicit Slots(std::size_t size)
-        : mask(size - 1), records(std::make_unique<std::atomic<const SelectorRecord*>[]>(size)) {}
-    std::size_t mask;
-    std::unique_ptr<std::atomic<const SelectorRecord*>[]> records;
-  };
+  using Slots = PointerSlots<const SelectorRecord>;
 
   static void place(Slots& slots, const SelectorRecord* record) {
     std::size_t i = record->textHash & slots.mask;
-    while (slots.records[i].load(std::memory_order_relaxed) != nullptr) i = (i + 1) & slots.mask;
-    slots.records[i].store(record, std::memory_order_release);
+    while (slots.at(i).load(std::memory_order_relaxed) != nullptr) i = (i + 1) & slots.mask;
+    slots.at(i).store(record, std::memory_order_release);
   }
 
   void grow() {
-    auto larger = std::make_unique<Slots>((generations_.back()->mask + 1) * 2);
+    auto larger = Slots::make((generations_.back()->mask + 1) * 2);
     for (const SelectorRecord& record : arena_) place(*larger, &record);
     slots_.store(larger.get(), std::memory_order_release);
     generations_.push_back(std::move(larger));
@@ -64,12 +103,12 @@ class NameTable {
   std::deque<SelectorRecord> arena_;
   std::deque<std::string> names_;
   std::deque<Method> missing_;
-  std::vector<std::unique_ptr<Slots>> generations_ = initialGenerations();
+  std::vector<Slots::Owner> generations_ = initialGenerations();
   std::atomic<const Slots*> slots_ = generations_.back().get();
 
-  static std::vector<std::unique_ptr<Slots>> initialGenerations() {
-    std::vector<std::unique_ptr<Slots>> generations;
-    generations.push_back(std::make_unique<Slots>(4096));
+  static std::vector<Slots::Owner> initialGenerations() {
+    std::vector<Slots::Owner> generations;
+    generations.push_back(Slots::make(4096));
     return generations;
   }
 };
@@ -82,23 +121,20 @@ NameTable& names() {
 }  // namespace
 
 std::uint64_t hashText(std::string_view text) {
-  constexpr std::uint64_t multiplier = 0x9E3779B97F4A7C15u;
-  std::uint64_t hash = text.size() * multiplier;
-  const auto mix = [&](std::uint64_t word) {
-    hash = (hash ^ word) * multiplier;
-    hash ^= hash >> 32;
-  };
+  constexpr std::uint64_t first = 0x9E3779B97F4A7C15u;
+  constexpr std::uint64_t second = 0xD1B54A32D192ED03u;
   const char* bytes = text.data();
-  std::size_t left = text.size();
-  for (; left >= 8; bytes += 8, left -= 8) {
-    std::uint64_t word;
-    std::memcpy(&word, bytes, 8);
-    mix(word);
+  const std::size_t size = text.size();
+  std::uint64_t hash = size * first;
+  std::size_t done = 0;
+  for (; done + 16 < size; done += 16) {
+    hash = folded(word(bytes + done) ^ first, word(bytes + done + 8) ^ hash);
   }
-  std::uint64_t tail = 0;
-  for (std::size_t i = 0; i < left; ++i) tail |= std::uint64_t(std::uint8_t(bytes[i])) << (8 * i);
-  mix(tail);
-  return hash;
+  if (size >= 16) {
+    return folded(word(bytes + size - 16) ^ second, word(bytes + size - 8) ^ hash);
+  }
+  const auto [head, tail] = ends(bytes, size);
+  return folded(head ^ second, tail ^ hash);
 }
 
 Selector Selector::intern(std::string_view name) {

@@ -1,9 +1,9 @@
 #pragma once
 
 #include <atomic>
-#include <memory>
 #include <vector>
 
+#include "platform/runtime/PointerSlots.h"
 #include "platform/runtime/Selector.h"
 
 namespace ax {
@@ -18,7 +18,7 @@ class SelectorTable {
     const Slots* slots = slots_.load(std::memory_order_acquire);
     if (slots == nullptr) return nullptr;
     for (std::size_t i = selector.hash() & slots->mask;; i = (i + 1) & slots->mask) {
-      const Record* record = slots->records[i].load(std::memory_order_acquire);
+      const Record* record = slots->at(i).load(std::memory_order_acquire);
       if (record == nullptr || record->selector == selector) return record;
     }
   }
@@ -54,30 +54,25 @@ class SelectorTable {
     if (generations_.empty()) return;
     const Slots& slots = *generations_.back();
     for (std::size_t i = 0; i <= slots.mask; ++i) {
-      if (const Record* record = slots.records[i].load(std::memory_order_relaxed)) visit(*record);
+      if (const Record* record = slots.at(i).load(std::memory_order_relaxed)) visit(*record);
     }
   }
 
   std::size_t size() const { return count_; }
 
  private:
-  struct Slots {
-    explicit Slots(std::size_t size)
-        : mask(size - 1), records(std::make_unique<std::atomic<const Record*>[]>(size)) {}
-    std::size_t mask;
-    std::unique_ptr<std::atomic<const Record*>[]> records;
-  };
+  using Slots = PointerSlots<const Record>;
 
   static std::atomic<const Record*>& slotFor(Slots& slots, Selector selector) {
     for (std::size_t i = selector.hash() & slots.mask;; i = (i + 1) & slots.mask) {
-      const Record* record = slots.records[i].load(std::memory_order_relaxed);
-      if (record == nullptr || record->selector == selector) return slots.records[i];
+      const Record* record = slots.at(i).load(std::memory_order_relaxed);
+      if (record == nullptr || record->selector == selector) return slots.at(i);
     }
   }
 
   void grow() {
     const std::size_t size = generations_.empty() ? 8 : (generations_.back()->mask + 1) * 2;
-    auto larger = std::make_unique<Slots>(size);
+    auto larger = Slots::make(size);
     forEach([&](const Record& record) {
       slotFor(*larger, record.selector).store(&record, std::memory_order_relaxed);
     });
@@ -86,8 +81,8 @@ class SelectorTable {
   }
 
   std::atomic<const Slots*> slots_ = nullptr;
-  std::vector<std::unique_ptr<Slots>> generations_;  // the last one is in use
-  std::vector<std::unique_ptr<Slots>> retired_;
+  std::vector<typename Slots::Owner> generations_;  // the last one is in use
+  std::vector<typename Slots::Owner> retired_;
   std::size_t count_ = 0;
 };
 

@@ -36,6 +36,15 @@ struct Signature {
   GenericFunction scripted;
 };
 
+// One address per C++ type, in all modules of the process.
+const void* internType(const std::type_info& type);
+
+template <class T>
+const void* identityOf() {
+  static const void* const identity = internType(typeid(T));
+  return identity;
+}
+
 const Signature& internSignature(const std::type_info& type, const Signature& signature);
 
 // The reply that an object has been given for a message, if any. The first tells whether there is one.

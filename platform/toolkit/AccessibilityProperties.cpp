@@ -7,8 +7,6 @@ namespace ax {
 
 namespace {
 
-const char propertiesKey = 0;
-
 AccessibilityProperties::Blocks* blocksOf(Receiver receiver) {
   if (receiver.get() == nullptr) return nullptr;
   auto& blocks = AccessibilityProperties::of(*receiver.get()).blocks;
@@ -26,22 +24,20 @@ const AccessibilityProperties* findProperties(Receiver receiver) {
 
 }  // namespace
 
+const char AccessibilityProperties::key = 0;
+
 Class& AccessibilityProperties::staticClass() {
   static Class& result = Class::add("AccessibilityProperties", &Object::staticClass(), nullptr);
   return result;
 }
 
 AccessibilityProperties& AccessibilityProperties::of(Object& object) {
-  Object* properties = object.attached(&propertiesKey);
+  Object* properties = object.attached(&key);
   if (properties == nullptr) {
-    object.attach(&propertiesKey, make<AccessibilityProperties>());
-    properties = object.attached(&propertiesKey);
+    object.attach(&key, make<AccessibilityProperties>());
+    properties = object.attached(&key);
   }
   return *static_cast<AccessibilityProperties*>(properties);
-}
-
-const AccessibilityProperties* AccessibilityProperties::find(const Object& object) {
-  return static_cast<const AccessibilityProperties*>(object.attached(&propertiesKey));
 }
 
 void _accessibilityAddTrait(Receiver receiver, Traits bits) {

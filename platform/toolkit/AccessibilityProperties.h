@@ -21,7 +21,9 @@ class AccessibilityProperties final : public Object {
   // The object's properties; made when there are none yet.
   static AccessibilityProperties& of(Object& object);
   // Null when nothing was ever set.
-  static const AccessibilityProperties* find(const Object& object);
+  static const AccessibilityProperties* find(const Object& object) {
+    return static_cast<const AccessibilityProperties*>(object.attached(&key));
+  }
 
   struct Blocks {
     std::function<Ref<String>()> label;
@@ -45,6 +47,9 @@ class AccessibilityProperties final : public Object {
   bool isMarkedVisible = false;
   bool overridesInvisibility = false;
   std::unique_ptr<Blocks> blocks;
+
+ private:
+  static const char key;
 };
 
 // Ors bits into the receiver's traits, overrides included.

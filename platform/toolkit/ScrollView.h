@@ -9,14 +9,12 @@ class ScrollView : public View {
  public:
   static Class& staticClass();
 
-  Point contentOffset() const { return contentOffset_; }
-  void setContentOffset(Point offset) { contentOffset_ = offset; }
+  Point contentOffset() const { return boundsOrigin(); }
+  void setContentOffset(Point offset) { setBoundsOrigin(offset); }
   Size contentSize() const { return contentSize_; }
   void setContentSize(Size size) { contentSize_ = size; }
-  Point boundsOrigin() const override { return contentOffset_; }
 
  private:
-  Point contentOffset_;
   Size contentSize_;
 };
 

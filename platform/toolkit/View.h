@@ -16,7 +16,9 @@ class View : public Responder {
 
   Rect frame() const { return frame_; }
   void setFrame(Rect frame) { frame_ = frame; }
-  virtual Point boundsOrigin() const { return {}; }
+  // Where the view's own space begins: other than zero where the view shows a part of it.
+  Point boundsOrigin() const { return boundsOrigin_; }
+  void setBoundsOrigin(Point origin) { boundsOrigin_ = origin; }
   Rect bounds() const { return {boundsOrigin().x, boundsOrigin().y, frame_.width, frame_.height}; }
   Point center() const { return frame_.center(); }
 
@@ -46,6 +48,7 @@ class View : public Responder {
 
  private:
   Rect frame_;
+  Point boundsOrigin_;
   View* superview_ = nullptr;
   std::vector<Ref<View>> subviews_;
   Ref<Layer> layer_;
