@@ -50,13 +50,20 @@ std::string range(const DataSeriesAxis& axis) {
   return axis.maximum ? readerText("chart.highest", {number(*axis.maximum)}) : std::string();
 }
 
+// Kept apart by a mark that is no decimal sign in any language.
+std::string separatedFigures(const Lines& figures) {
+  std::string text;
+  for (const std::string& figure : figures) text += (text.empty() ? "" : "; ") + figure;
+  return text;
+}
+
 void addAxis(const DataSeriesAxis& axis, std::string_view key, Lines& lines) {
   add(lines, once,
       readerText(key, {joined({words(axis.title), named("chart.unit", words(axis.unitLabel)), range(axis),
                                count("chart.values", axis.values.size())})}));
   Lines values;
   for (const double value : axis.values) values.push_back(number(value));
-  add(lines, twice, joined(values));
+  add(lines, twice, separatedFigures(values));
   for (const auto& [position, text] : axis.positions) {
     add(lines, twice, readerText("chart.position", {formatting::percentString(position), words(text)}));
   }

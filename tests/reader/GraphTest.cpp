@@ -102,9 +102,9 @@ TEST(Graph, DescribesASeriesWithItsElements) {
   const Snapshot snapshot = takeSnapshot(chart);
   EXPECT_EQ(describeChart(snapshot, *charts(snapshot).at(0)),
             (Lines{"Chart: Moves", "  Kind of series: 2, Can be played as sound",
-                   "  Horizontal axis: Time, from 0 to 24, 2 values", "    0.5, 12", "    At 0%: 0 o'clock",
+                   "  Horizontal axis: Time, from 0 to 24, 2 values", "    0.5; 12", "    At 0%: 0 o'clock",
                    "    At 25%: 6 o'clock", "    At 50%: 12 o'clock", "    At 75%: 18 o'clock",
-                   "  Vertical axis: Lowest: 0, 2 values", "    3, 4.25", "  1 element",
+                   "  Vertical axis: Lowest: 0, 2 values", "    3; 4.25", "  1 element",
                    "    Noon, 3 calories, at 15 by 26, 7 wide, 8 high"}));
 }
 
