@@ -17,9 +17,15 @@ struct SceneValue;
 
 // A text of a scene: literal, or a key of the host's string table with what fills its pattern.
 struct SceneText {
+  explicit SceneText(std::string literal);
+  SceneText(std::string key, std::vector<SceneValue> fillings);
+  SceneText(SceneText&&) noexcept;
+  SceneText& operator=(SceneText&&) noexcept;
+  ~SceneText();
+
   std::string text;  // or the key
-  bool isLocalized = false;
-  std::vector<SceneValue> with = {};
+  bool isLocalized;
+  std::vector<SceneValue> with;
 };
 
 // What a VALUE may be, besides the plain kinds. Dates stay text until they are made: local times count in the
@@ -83,5 +89,13 @@ struct SceneObject {
   std::vector<SceneAnswer> answers = {};
   std::vector<SceneMember> set = {};
 };
+
+// Down here, where what the vector holds is known.
+inline SceneText::SceneText(std::string literal) : text(std::move(literal)), isLocalized(false) {}
+inline SceneText::SceneText(std::string key, std::vector<SceneValue> fillings)
+    : text(std::move(key)), isLocalized(true), with(std::move(fillings)) {}
+inline SceneText::SceneText(SceneText&&) noexcept = default;
+inline SceneText& SceneText::operator=(SceneText&&) noexcept = default;
+inline SceneText::~SceneText() = default;
 
 }  // namespace ax::reader

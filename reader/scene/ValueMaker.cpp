@@ -72,8 +72,9 @@ std::pair<Ref<String>, Ref<String>> ValueMaker::Visitor::text(const SceneText& g
 }
 
 Ref<Object> ValueMaker::Visitor::operator()(const SceneString& given) const {
-  auto [shown, spoken] = text(given.text);
-  if (given.label) spoken = text(*given.label).first;
+  const auto both = text(given.text);
+  const Ref<String> shown = both.first;
+  const Ref<String> spoken = given.label ? text(*given.label).first : both.second;
   Ref<Object> result = given.isAttributed ? Ref<Object>(make<AttributedString>(shown)) : Ref<Object>(shown);
   if (spoken) messages::setAccessibilityLabel(result, spoken);
   return result;
@@ -103,6 +104,7 @@ Ref<Object> ValueMaker::value(const SceneValue& given) const {
 
 std::vector<Ref<Object>> ValueMaker::values(const std::vector<SceneValue>& given) const {
   std::vector<Ref<Object>> made;
+  made.reserve(given.size());
   for (const SceneValue& one : given) made.push_back(value(one));
   return made;
 }

@@ -13,11 +13,10 @@ namespace ax::reader {
 namespace {
 
 SceneText readText(const JsonNode& node, SceneIds& ids) {
-  if (!node.isObject()) return {node.text()};
+  if (!node.isObject()) return SceneText(node.text());
   node.expectKeys({"localized", "with"});
-  SceneText text{node.field("localized").text(), true};
-  if (const auto with = node.optionalField("with")) text.with = readValues(*with, ids);
-  return text;
+  const auto with = node.optionalField("with");
+  return {node.field("localized").text(), with ? readValues(*with, ids) : std::vector<SceneValue>()};
 }
 
 SceneDate readDate(const JsonNode& node) {
@@ -188,7 +187,7 @@ SceneValue readValue(const JsonNode& node, SceneIds& ids) {
   if (json.is_null()) return {node.place()};
   if (json.is_boolean()) return {node.place(), Number::Content(json.get<bool>())};
   if (json.is_number()) return {node.place(), readPlainNumber(node)};
-  if (json.is_string()) return {node.place(), SceneString{{node.text()}}};
+  if (json.is_string()) return {node.place(), SceneString{SceneText(node.text())}};
   if (json.is_array()) return {node.place(), readValues(node, ids)};
   return {node.place(), readKind(node, ids)};
 }
