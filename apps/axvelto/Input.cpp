@@ -5,6 +5,7 @@
 #include <iterator>
 
 #include "platform/formatting/Region.h"
+#include "platform/foundation/Environment.h"
 
 namespace ax::app {
 
@@ -14,6 +15,13 @@ namespace {
 
 std::string allOf(std::istream& in) {
   return {std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>()};
+}
+
+// The app would lay its screen out from the other side for a language of the other direction.
+void speakFor(reader::Scene& scene, const std::string& locale) {
+  const std::string& own = scene.environment.locale.value_or(Environment().locale);
+  scene.isMirrored = formatting::isRightToLeft(own) != formatting::isRightToLeft(locale);
+  scene.environment.locale = locale;
 }
 
 constexpr std::string_view byteOrderMarks[] = {"\xEF\xBB\xBF", "\xFF\xFE", "\xFE\xFF"};
@@ -52,7 +60,7 @@ reader::Scene sceneFor(const Arguments& arguments) {
   std::string text = readInput(file);
   if (isWorkoutFile(text)) text = importWorkouts({{file, std::move(text)}}, arguments.locale).dump();
   reader::Scene scene = reader::readScene(text, file);
-  if (!arguments.locale.empty()) scene.environment.locale = arguments.locale;
+  if (!arguments.locale.empty()) speakFor(scene, arguments.locale);
   checkOmissions(arguments.without);
   return scene;
 }

@@ -45,8 +45,9 @@ Class& MonthWeekView::staticClass() {
 
 void MonthWeekView::layoutSubviews() {
   QSCalendarWeekView::layoutSubviews();
-  addUnplaced(*this, goalTextLabel_, {0, titleHeight, goalWidth, titleHeight});
-  addUnplaced(*this, goalPercentChangeTextLabel_, {goalWidth, titleHeight, goalWidth, titleHeight});
+  addUnplaced(*this, goalTextLabel_, inDirection(*this, {0, titleHeight, goalWidth, titleHeight}));
+  addUnplaced(*this, goalPercentChangeTextLabel_,
+              inDirection(*this, {goalWidth, titleHeight, goalWidth, titleHeight}));
   layer()->addSublayer(topBorderLineOnDrag_);
   layOutDays();
 }
@@ -56,7 +57,7 @@ void MonthWeekView::layOutDays() {
   double x = (column - ringSize) / 2;
   for (const Ref<Layer>& day : layer()->sublayers()) {
     if (cast<QSCalendarDayCell>(day.get()) == nullptr) continue;
-    if (day->frame() == Rect()) day->setFrame({x, 2 * titleHeight, ringSize, ringSize});
+    if (day->frame() == Rect()) day->setFrame(inDirection(*this, {x, 2 * titleHeight, ringSize, ringSize}));
     x += column;
   }
 }

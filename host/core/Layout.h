@@ -13,7 +13,11 @@ void addUnplaced(View& parent, std::initializer_list<Ref<View>> parts);
 // The same for one part, which gets the frame unless it has one of its own.
 void addUnplaced(View& parent, const Ref<View>& part, Rect frame);
 
-// One of several equal columns of a view, counted from 0, in the view's own space.
+// A frame in a view as the language has it: it is meant for one that is written from the left, and is turned
+// around for one that is written from the right.
+Rect inDirection(const View& view, Rect frame);
+
+// One of several equal columns of a view, counted from 0 at the left, in the view's own space.
 Rect columnOf(const View& view, std::size_t index, std::size_t count);
 
 }  // namespace ax::host

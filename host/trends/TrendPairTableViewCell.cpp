@@ -17,10 +17,10 @@ Class& TrendPairTableViewCell::staticClass() {
 }
 
 void TrendPairTableViewCell::layoutSubviews() {
-  addUnplaced(*contentView(), leadingView_, columnOf(*this, 0, 2));
-  addUnplaced(*contentView(), trailingView_, columnOf(*this, 1, 2));
-  addUnplaced(*contentView(), leadingButton_, columnOf(*this, 0, 2));
-  addUnplaced(*contentView(), trailingButton_, columnOf(*this, 1, 2));
+  addUnplaced(*contentView(), leadingView_, inDirection(*this, columnOf(*this, 0, 2)));
+  addUnplaced(*contentView(), trailingView_, inDirection(*this, columnOf(*this, 1, 2)));
+  addUnplaced(*contentView(), leadingButton_, inDirection(*this, columnOf(*this, 0, 2)));
+  addUnplaced(*contentView(), trailingButton_, inDirection(*this, columnOf(*this, 1, 2)));
 }
 
 static const RegisteredClass<TrendPairTableViewCell> registered;

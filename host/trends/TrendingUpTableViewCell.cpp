@@ -15,8 +15,8 @@ Class& TrendingUpTableViewCell::staticClass() {
 }
 
 void TrendingUpTableViewCell::layoutSubviews() {
-  addUnplaced(*contentView(), leadingView_, columnOf(*this, 0, 2));
-  addUnplaced(*contentView(), trailingView_, columnOf(*this, 1, 2));
+  addUnplaced(*contentView(), leadingView_, inDirection(*this, columnOf(*this, 0, 2)));
+  addUnplaced(*contentView(), trailingView_, inDirection(*this, columnOf(*this, 1, 2)));
 }
 
 static const RegisteredClass<TrendingUpTableViewCell> registered;

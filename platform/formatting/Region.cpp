@@ -68,6 +68,10 @@ bool currentLanguageIsRightToLeft() {
   return state().rightToLeft;
 }
 
+bool isRightToLeft(const std::string& locale) {
+  return icu::Locale(locale.c_str()).isRightToLeft();
+}
+
 bool isKnownLocale(std::string_view locale) {
   if (locale.empty() || locale.find('\0') != std::string_view::npos) return false;
   const icu::Locale parsed(std::string(locale).c_str());

@@ -28,6 +28,7 @@ std::uint64_t regionGeneration();
 // The language alone: "en".
 std::string currentLanguage();
 bool currentLanguageIsRightToLeft();
+bool isRightToLeft(const std::string& locale);
 
 // For checking input before it becomes current. A locale is known when its language is.
 bool isKnownLocale(std::string_view locale);

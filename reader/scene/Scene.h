@@ -33,6 +33,7 @@ struct Scene {
   std::optional<SceneObject> screen = {};
   std::vector<SceneObject> objects = {};
   std::vector<SceneStep> steps = {};
+  bool isMirrored = false;  // the screen's frames are meant for a language of the other direction
 };
 
 // Reads a scene and checks it whole against the classes that are registered, hidden ones included: syntax,

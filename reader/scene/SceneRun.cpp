@@ -4,6 +4,7 @@
 #include "platform/health/ActivitySummary.h"
 #include "platform/runtime/Message.h"
 #include "reader/contract/ContractReport.h"
+#include "reader/scene/Mirroring.h"
 #include "reader/scene/ObjectBuilder.h"
 #include "reader/scene/Omissions.h"
 #include "reader/scene/Presentation.h"
@@ -59,6 +60,7 @@ SceneRun::SceneRun(const Scene& scene, const SceneRunOptions& options)
   for (const SceneDay& day : scene.days) keepDay(day);
   makeObjects();
   if (!screen_) return;
+  if (scene.isMirrored) mirror(screen_);
   Presentation presentation;
   presentation.present(screen_);
   hostFaults_ = presentation.hostFaults();

@@ -95,6 +95,22 @@ TEST_F(Commands, SpeakAndTreeReadAFileOrStandardInput) {
   EXPECT_EQ(tree["elements"][1]["frame"], Json({0, 50, 100, 20}));
 }
 
+TEST_F(Commands, ALanguageOfTheOtherDirectionTurnsTheScreenAround) {
+  const std::string row = R"({"format": "axvelto-scene/1", "screen": {"class": "View",
+    "set": {"frame": {"rect": [0, 0, 300, 50]}}, "subviews": [
+    {"class": "Label", "set": {"frame": {"rect": [10, 0, 80, 20]}, "text": "One"}},
+    {"class": "Label", "set": {"frame": {"rect": [110, 0, 80, 20]}, "text": "Two"}}]}})";
+  const Json arabic = Json::parse(run("tree - --locale ar_EG", row).out)["elements"];
+  EXPECT_EQ(arabic[0]["label"], "One");
+  EXPECT_EQ(arabic[0]["frame"], Json({210, 0, 80, 20}));
+  EXPECT_EQ(arabic[1]["label"], "Two");
+  EXPECT_EQ(Json::parse(run("tree - --locale ja_JP", row).out)["elements"][0]["frame"],
+            Json({10, 0, 80, 20}));
+
+  const std::string month = run("speak " + sample("month.json") + " --locale ar_EG").out;
+  EXPECT_LT(month.find("٢٣ فبراير"), month.find("١ مارس"));
+}
+
 TEST_F(Commands, AskActsOnTheScreen) {
   const Outcome next = run("ask - --increment pages", oneButton);
   EXPECT_EQ(next.code, 0);
