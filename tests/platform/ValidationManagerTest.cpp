@@ -44,12 +44,14 @@ class SubScreen : public Screen {
   }
 };
 
+// Each test may run alone.
+const RegisteredClass<SubScreen> registered;
+
 constexpr const char* screen = "Velto.ValidationTestScreen";
 constexpr const char* subScreen = "ValidationTestSubScreen";
 constexpr const char* nobody = "ValidationTestNobody";
 
 TEST(ValidationManager, checksAndTellsWhatItFound) {
-  SubScreen::staticClass();
   const Ref<ValidationManager> owned = make<ValidationManager>();
   ValidationManager& m = *owned;
   EXPECT_TRUE(m.validateClass(screen));
