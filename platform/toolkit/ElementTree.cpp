@@ -16,11 +16,20 @@ void collectSubviews(View& view, const ElementTest& test, Array::Items& found) {
   }
 }
 
-void collectDescendants(Object& parent, const ElementTest& test, Array::Items& found) {
-  const Ref<Array> listed = messages::accessibilityElements(parent);
-  for (const Ref<Object>& child : listed ? listed->items() : drawnChildren(parent)) {
-    if (test(*child)) found.push_back(child);
-    collectDescendants(*child, test, found);
+// The objects that a walk is inside of.
+struct Path {
+  Object& object;
+  const Path* above;
+
+  bool holds(const Object& other) const {
+    return &object == &other || (above != nullptr && above->holds(other));
+  }
+};
+
+void visitBelow(const Path& path, const ElementTest& visit) {
+  const Ref<Array> listed = messages::accessibilityElements(path.object);
+  for (const Ref<Object>& child : listed ? listed->items() : drawnChildren(path.object)) {
+    if (!path.holds(*child) && visit(*child)) visitBelow({*child, &path}, visit);
   }
 }
 
@@ -53,7 +62,15 @@ bool standInOneRow(const Rect& upper, const Rect& lower) {
 Ref<Object> _accessibilityFindAncestor(Receiver receiver, const ElementTest& test, bool startWithSelf) {
   Ref<Object> object(receiver.get());
   if (!startWithSelf) object = messages::accessibilityContainer(object);
-  while (object && !test(*object)) object = messages::accessibilityContainer(object);
+  Ref<Object> milestone = object;
+  for (std::size_t steps = 0, lap = 1; object && !test(*object); ++steps) {
+    if (steps == lap) {
+      milestone = object;
+      lap += steps + 1;
+    }
+    object = messages::accessibilityContainer(object);
+    if (object == milestone) return nullptr;
+  }
   return object;
 }
 
@@ -70,8 +87,15 @@ Ref<Array> _accessibilityFindSubviewDescendantsPassingTest(Receiver receiver, co
 
 Ref<Array> _accessibilityFindUnsortedDescendantsPassingTest(Receiver receiver, const ElementTest& test) {
   Array::Items found;
-  if (receiver.get() != nullptr) collectDescendants(*receiver.get(), test, found);
+  visitDescendants(receiver, [&](Object& object) {
+    if (test(object)) found.push_back(Ref<Object>(&object));
+    return true;
+  });
   return array(std::move(found));
+}
+
+void visitDescendants(Receiver parent, const ElementTest& visit) {
+  if (parent.get() != nullptr) visitBelow({*parent.get(), nullptr}, visit);
 }
 
 bool _accessibilityViewIsVisible(Receiver receiver) {

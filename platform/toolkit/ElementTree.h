@@ -13,7 +13,7 @@ namespace ax {
 using ElementTest = std::function<bool(Object&)>;
 
 // Ancestors are followed through accessibilityContainer: a view's superview, a layer's superlayer and then
-// its view, an element's container.
+// its view, an element's container. Containers that form a ring are each asked, and then there are no more.
 Ref<Object> _accessibilityAncestorIsKindOf(Receiver receiver, const Class* ancestorClass);
 Ref<Object> _accessibilityFindAncestor(Receiver receiver, const ElementTest& test, bool startWithSelf);
 
@@ -22,6 +22,9 @@ Ref<Array> _accessibilityFindSubviewDescendantsPassingTest(Receiver receiver, co
 // Accessibility descendants: what `accessibilityElements` lists where there is a list, else subviews and
 // sublayers.
 Ref<Array> _accessibilityFindUnsortedDescendantsPassingTest(Receiver receiver, const ElementTest& test);
+// Visits the accessibility descendants, each before its own; a visit that answers false keeps the walk out of
+// that one. What lists itself, or something that it lies in, is not visited once more.
+void visitDescendants(Receiver parent, const ElementTest& visit);
 
 // Not hidden and not transparent, up to the root or to the first that was marked as visible and as
 // overriding invisibility.

@@ -26,6 +26,9 @@ Ref<Array> Layer::sublayerArray() const {
 
 void Layer::addSublayer(const Ref<Layer>& layer) {
   if (!layer || layer->superlayer_ != nullptr) return;
+  for (const Layer* above = this; above != nullptr; above = above->superlayer_) {
+    if (above == layer.get()) return;
+  }
   layer->superlayer_ = this;
   sublayers_.push_back(layer);
 }

@@ -45,22 +45,23 @@ class Composition {
   std::vector<TextAttribute> attributes_;
 };
 
-Ref<String> spokenForm(const Ref<Object>& element) {
-  const Ref<String> label = messages::accessibilityLabel(element);
-  if (label) return label;
-  return Ref<String>(cast<String>(element.get()));
+// Labels are composed of labels. What is being asked for its own adds nothing to it, or parts that hold one
+// another would never come to an end.
+Ref<String> labelOf(const Ref<Object>& element) {
+  thread_local std::vector<const Object*> asked;
+  if (std::find(asked.begin(), asked.end(), element.get()) != asked.end()) return nullptr;
+  struct Asking {
+    explicit Asking(const Object* object) { asked.push_back(object); }
+    ~Asking() { asked.pop_back(); }
+  };
+  const Asking asking(element.get());
+  return messages::accessibilityLabel(element);
 }
 
-void addChildren(Object& parent, Composition& composition) {
-  const Ref<Array> listed = messages::accessibilityElements(parent);
-  for (const Ref<Object>& child : listed ? listed->items() : drawnChildren(parent)) {
-    if (!_accessibilityViewIsVisible(child)) continue;
-    if (messages::isAccessibilityElement(child)) {
-      composition.add(messages::accessibilityLabel(child));
-    } else {
-      addChildren(*child, composition);
-    }
-  }
+Ref<String> spokenForm(const Ref<Object>& element) {
+  const Ref<String> label = labelOf(element);
+  if (label) return label;
+  return Ref<String>(cast<String>(element.get()));
 }
 
 struct SubhierarchyText {
@@ -83,7 +84,7 @@ struct SubhierarchyText {
     const bool isHeader = (messages::accessibilityTraits(child) & TraitHeader) != 0;
     const bool isFocusable = !isHeader && messages::isAccessibilityElement(child);
     if ((isHeader && !headers) || (isFocusable && !focusableItems)) return;
-    const Ref<String> label = messages::accessibilityLabel(child);
+    const Ref<String> label = labelOf(child);
     if (isEmpty(label)) return addBelow(*child);
     composition.add(label);
   }
@@ -116,7 +117,12 @@ Ref<String> labelForElements(std::initializer_list<Ref<Object>> elements) {
 
 Ref<String> stringForAllChildren(Receiver view) {
   Composition composition;
-  if (view.get() != nullptr) addChildren(*view.get(), composition);
+  visitDescendants(view, [&](Object& child) {
+    if (!_accessibilityViewIsVisible(child)) return false;
+    if (!messages::isAccessibilityElement(child)) return true;
+    composition.add(labelOf(Ref<Object>(&child)));
+    return false;
+  });
   return composition.result();
 }
 
@@ -125,8 +131,7 @@ Ref<String> _accessibilityStringForLabelKeyValues(Receiver receiver, std::string
   Composition composition;
   while (!keyList.empty()) {
     const std::size_t end = std::min(keyList.find(between), keyList.size());
-    composition.add(
-        messages::accessibilityLabel(safeValueForKey(receiver, Selector::find(keyList.substr(0, end)))));
+    composition.add(labelOf(safeValueForKey(receiver, Selector::find(keyList.substr(0, end)))));
     keyList.remove_prefix(std::min(end + between.size(), keyList.size()));
   }
   return composition.result();
