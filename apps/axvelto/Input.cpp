@@ -32,7 +32,7 @@ std::string readInput(const std::string& file) {
   if (file == "-") return allOf(std::cin);
   std::ifstream in(file, std::ios::binary);
   in.peek();  // a folder opens, and fails only here
-  if (in.fail()) throw Fault{file, "", "cannot be read", "a scene or a workout file"};
+  if (in.fail()) throw Fault{file.empty() ? "\"\"" : file, "", "cannot be read", "a scene or a workout file"};
   in.clear();
   return allOf(in);
 }

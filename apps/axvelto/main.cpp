@@ -10,8 +10,11 @@ using namespace ax::app;
 const Command* const commands[] = {&speakCommand, &treeCommand, &graphCommand,
                                    &checkCommand, &askCommand,  &importCommand};
 
-std::string usageFailure(const CLI::App*, const CLI::Error& error) {
-  return std::string("axvelto: ") + error.what() + " (axvelto --help tells the use)\n";
+std::string usageFailure(const CLI::App* app, const CLI::Error& error) {
+  const std::vector<std::string> left = app->remaining();
+  const bool isUnknownCommand = app->get_subcommands().empty() && !left.empty();
+  const std::string what = isUnknownCommand ? "unknown command \"" + left.front() + "\"" : error.what();
+  return "axvelto: " + what + " (axvelto --help tells the use)\n";
 }
 
 int runCommand(const Command& command, const Arguments& arguments) {

@@ -137,6 +137,10 @@ class CountingIterator {
 }  // namespace
 
 Json readJson(std::string_view text, const std::string& file) {
+  // The parser would take a zero byte for the end.
+  if (const std::size_t zero = text.find('\0'); zero != std::string_view::npos) {
+    throw Fault{file, lineAndColumn(text, zero + 1), "a zero byte", "valid JSON"};
+  }
   DocumentBuilder builder;
   std::size_t taken = 0;
   const CountingIterator begin(text.data(), &taken);

@@ -80,6 +80,7 @@ TEST_F(Commands, RefuseBadUseWithOneLineAndNothingElse) {
     EXPECT_EQ(outcome.err.find('\n'), outcome.err.size() - 1) << arguments << ": " << outcome.err;
   }
   EXPECT_NE(run("speak " + cut).err.find(cut), std::string::npos);
+  EXPECT_NE(run("shout x").err.find("\"shout\""), std::string::npos);
 }
 
 TEST_F(Commands, SpeakAndTreeReadAFileOrStandardInput) {

@@ -29,6 +29,7 @@ TEST(SceneFault, JsonIsReadStrictly) {
       {"{\"title\": \"\xff\"}", "line 1, column 12", "ill-formed UTF-8"},
       {"{\"title\": 1e999}", "line 1, column 15", "number overflow"},
       {"{} {}", "line 1, column 4", "end of input"},
+      {std::string("{\n}\0 {}", 7), "line 2, column 2", "a zero byte"},
       {"{\"a\": 1,\n\"a\": 2}", "line 2, column 3", "\"a\" twice"},
       {std::string(100000, '['), "line 1, column 101", "at most 100 levels"},
   });
