@@ -17,7 +17,7 @@ struct Row {
   std::optional<double> bound = {};
 
   double ratio() const { return other == 0 ? 0 : ours / other; }
-  bool isMet() const { return !bound || ratio() <= *bound; }
+  bool isMet() const { return !bound || ours <= *bound * other; }
 };
 
 std::string asText(const std::vector<Row>& rows, const std::vector<std::string>& notes);

@@ -7,7 +7,7 @@
 #include <vector>
 
 // The measurements. Every operation has sides: ours, the floor, and the peers that are installed. All sides
-// of all operations run in one process, interleaved at random, and the median of each is compared.
+// of one run run in one process, interleaved at random, and the median of each is compared.
 namespace bench {
 
 // Runs the operation `items` times per iteration.
@@ -38,6 +38,7 @@ struct Timing {
   std::string name;
   double nanoseconds = 0;
 };
+// Runs those that have been added since the last run.
 void runSides();
 std::vector<Timing> timingsOf(const std::string& operation);
 

@@ -1,6 +1,8 @@
 #include <cstdio>
 #include <cstring>
 
+#include "bench/BundleSides.h"
+#include "bench/Comparison.h"
 #include "bench/Report.h"
 #include "bench/Sides.h"
 #include "bench/Sizes.h"
@@ -11,14 +13,6 @@
 namespace bench {
 
 namespace {
-
-// What is compared, and how large the ratios may be: to the floor, and to every peer.
-struct Operation {
-  const char* name;
-  const char* title;
-  std::optional<double> boundToFloor;
-  std::optional<double> boundToPeers;
-};
 
 const Operation operations[] = {
     {"send", "typed send, cached class", 2.5, {}},
@@ -31,37 +25,6 @@ const Operation operations[] = {
     {"walk 10000", "walk, per node of 10,000", 2, 1 / 4.0},
     {"walk 100000", "walk, per node of 100,000", {}, {}},
 };
-
-void compare(const Operation& operation, std::vector<Row>& rows) {
-  const std::vector<Timing> timings = timingsOf(operation.name);
-  double ours = 0;
-  for (const Timing& timing : timings) {
-    if (timing.name == "ours") ours = timing.nanoseconds;
-  }
-  for (const Timing& timing : timings) {
-    if (timing.name == "ours") continue;
-    const bool isFloor = timing.name == "floor";
-    rows.push_back({operation.title, "ns", ours, timing.name, timing.nanoseconds,
-                    isFloor ? operation.boundToFloor : operation.boundToPeers});
-  }
-}
-
-double timingOf(const std::string& operation, const char* side) {
-  for (const Timing& timing : timingsOf(operation)) {
-    if (timing.name == side) return timing.nanoseconds;
-  }
-  return 0;
-}
-
-// The cost per node of the largest walk over that of the smallest, beside the same of the floor: what memory
-// costs both alike is not ours.
-void compareGrowth(std::vector<Row>& rows) {
-  const std::string large = walkName(walkSizes[2]);
-  const std::string small = walkName(walkSizes[0]);
-  rows.push_back({"walk, growth per node from 1,000 to 100,000", "x",
-                  timingOf(large, "ours") / timingOf(small, "ours"), "floor's growth",
-                  timingOf(large, "floor") / timingOf(small, "floor"), 1.25});
-}
 
 void compareSizes(std::vector<Row>& rows) {
   const Sizes sizes = measureSizes();
@@ -96,6 +59,12 @@ void compareStartUp(const std::string& program, std::vector<Row>& rows, std::vec
       {"opening the bundle before that", "us", startUp.opening, "opening 65 classes", startUp.classes, {}});
 }
 
+void measureBundle(const std::string& program, std::vector<Row>& rows, std::vector<std::string>& notes) {
+  if (!openBundleForSides(program)) return notes.push_back("the bundle is not built: its charts are skipped");
+  runSides();
+  compareBundleSides(rows);
+}
+
 std::vector<std::string> missingPeers() {
   std::vector<std::string> notes;
 #ifdef AXVELTO_WITHOUT_Qt
@@ -115,9 +84,12 @@ int run(const std::string& program, bool json) {
   std::vector<std::string> notes = missingPeers();
   runSides();
   for (const Operation& operation : operations) compare(operation, rows);
-  compareGrowth(rows);
+  compareGrowth(
+      {"walk, growth per node from 1,000 to 100,000", walkName(walkSizes[0]), walkName(walkSizes[2]), 1.25},
+      rows);
   compareSizes(rows);
   compareStartUp(program, rows, notes);
+  measureBundle(program, rows, notes);
   std::fputs((json ? asJson(rows, notes) : asText(rows, notes)).c_str(), stdout);
   return 0;
 }
