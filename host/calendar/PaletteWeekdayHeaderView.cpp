@@ -11,7 +11,6 @@ namespace ax::host {
 namespace {
 
 constexpr int daysOfWeek = 7;
-constexpr double firstSunday = 3.5 * 86400;  // noon of 1970-01-04
 constexpr double dimmed = 0.5;
 
 // 0 is the first day of the weekly goals.
@@ -21,7 +20,11 @@ int columnOfWeekday(int weekday) {
 
 Ref<String> initialOfColumn(int column) {
   const int daysAfterSunday = (column + firstDayOfWeekForWeeklyGoalCalculations() - 1) % daysOfWeek;
-  return dateStringForFormat(date(firstSunday + daysAfterSunday * 86400), "EEEEE");
+  // The noons of some week, at which it is the same day whether or not the clocks change in between.
+  const Ref<Calendar> calendar = Calendar::currentCalendar();
+  const Ref<Date> midnight = calendar->startOfDayForDate(*date(0));
+  const int daysAhead = daysAfterSunday + 1 - calendar->weekdayOfDate(*midnight);
+  return dateStringForFormat(midnight->dateByAddingTimeInterval((daysAhead + 0.5) * 86400), "EEEEE");
 }
 
 }  // namespace
