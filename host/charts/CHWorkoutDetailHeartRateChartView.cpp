@@ -29,10 +29,10 @@ struct Span {
 
 using Columns = std::map<int, Span>;
 
-// The readings outside the workout go into the column at its end.
+// The readings outside the workout go into the column at the end that they are nearer.
 int columnOf(const Date& date, const DateInterval& workout) {
   const double part = date.timeIntervalSinceDate(*workout.startDate()) / workout.duration();
-  return std::clamp(static_cast<int>(part * columnsOfWorkout), 0, columnsOfWorkout - 1);
+  return static_cast<int>(std::fmax(0, std::fmin(part * columnsOfWorkout, columnsOfWorkout - 1)));
 }
 
 Columns columnsOf(const Array& readings, const DateInterval& workout) {
