@@ -36,8 +36,10 @@ constexpr std::array shownUnits = {
     ShownUnit{"count/min", "unit.bpm", 0},
 };
 
-const ShownUnit* shownUnit(const Unit& unit) {
-  const auto found = std::ranges::find(shownUnits, std::string_view(unit.text()), &ShownUnit::unitString);
+// Null for none, and for one that the app has no texts for.
+const ShownUnit* shownUnit(const Ref<Unit>& unit) {
+  if (!unit) return nullptr;
+  const auto found = std::ranges::find(shownUnits, std::string_view(unit->text()), &ShownUnit::unitString);
   return found == shownUnits.end() ? nullptr : &*found;
 }
 
@@ -96,7 +98,7 @@ std::string clockText(double seconds) {
 Ref<AttributedString> figureOf(const Ref<Quantity>& given) {
   if (!given) return missingFigure();
   const Ref<Quantity> quantity = asShown(given);
-  const ShownUnit* unit = shownUnit(*quantity->unit());
+  const ShownUnit* unit = shownUnit(quantity->unit());
   if (unit == nullptr) return make<AttributedString>(string(quantity->description()));
   const Ref<String> number = formatFloat(unit->formatOption, static_cast<float>(quantity->value()));
   return withUnit(number, unit->key, spokenUnit(*unit, *number));
@@ -124,7 +126,7 @@ Ref<String> textWithSpokenForm(std::string text, const Ref<String>& spoken) {
 }
 
 Ref<String> distanceInWords(const Ref<Quantity>& distance) {
-  const ShownUnit* unit = distance ? shownUnit(*distance->unit()) : nullptr;
+  const ShownUnit* unit = distance ? shownUnit(distance->unit()) : nullptr;
   if (unit == nullptr) return nullptr;
   const Ref<String> number = formatFloat(unit->formatOption, static_cast<float>(distance->value()));
   return string(number->text() + " " + spokenUnit(*unit, *number)->text());
