@@ -3,6 +3,7 @@
 #include <regex>
 #include <set>
 
+#include "platform/accessibility/CategoryRegistration.h"
 #include "platform/formatting/Dates.h"
 #include "platform/formatting/Lists.h"
 #include "platform/formatting/Region.h"
@@ -156,6 +157,19 @@ TEST(Tour, LeavesNoEnglishInOtherLanguages) {
         }
       }
     }
+  }
+}
+
+TEST(Tour, NamesTheTargetOfEveryCategory) {
+  std::string samples;
+  for (const auto& file : sampleScenes()) samples += fileText(file);
+  const Presented started(sampleScenes().front(), "");
+  const auto& requests = ValidationManager::sharedInstance()->installationRequests();
+  EXPECT_EQ(requests.size(), 65u);
+  for (const InstallationRequest& request : requests) {
+    ASSERT_TRUE(request.installed) << request.category;
+    const std::string target = categoryTargetClassName(*Class::named(request.category));
+    EXPECT_NE(samples.find("\"" + target + "\""), std::string::npos) << target;
   }
 }
 
