@@ -97,15 +97,17 @@ TEST(Layout, PlacesWhatStandsNowhere) {
   const auto elsewhere = make<View>();
   const auto other = make<View>();
   placed->setFrame({1, 2, 3, 4});
+  elsewhere->setFrame({7, 7, 7, 7});
   other->addSubview(elsewhere);
   for (int i = 0; i < 2; ++i) {
     stackIn(*parent, {placed, nullptr, free});
+    stackIn(*parent, {elsewhere});
     addUnplaced(*parent, elsewhere, {0, 0, 5, 5});
     EXPECT_EQ(parent->subviews(), (std::vector<Ref<View>>{placed, free}));
     EXPECT_EQ(placed->frame(), (Rect{1, 2, 3, 4}));
     EXPECT_EQ(free->frame(), (Rect{0, 60, 100, 30})) << "the missing one keeps its place";
     EXPECT_EQ(elsewhere->superview(), other.get());
-    EXPECT_EQ(elsewhere->frame(), Rect());
+    EXPECT_EQ(elsewhere->frame(), (Rect{7, 7, 7, 7}));
   }
   EXPECT_EQ(columnOf(*parent, 2, 4), (Rect{50, 0, 25, 90}));
 }

@@ -178,12 +178,15 @@ TEST_F(PaletteTest, IsSetUpWhenItIsMadeIfItIsMade) {
 TEST_F(PaletteTest, AControllerListsTheHeaderThatItHasNow) {
   const auto controller = make<host::PaletteViewController>();
   messages::viewDidLoad(controller);
+  ASSERT_NE(messages::accessibilityElements(controller->view()), nullptr);
   EXPECT_TRUE(messages::accessibilityElements(controller->view())->isEmpty());
   for (int i = 0; i < 2; ++i) {
     const auto shown = make<host::PaletteWeekdayHeaderView>();
     setMember(*controller, "_paletteView", shown);
     messages::viewDidLoad(controller);
-    EXPECT_TRUE(messages::accessibilityElements(controller->view())->isEqual(*array({shown})));
+    const Ref<Array> listed = messages::accessibilityElements(controller->view());
+    ASSERT_NE(listed, nullptr);
+    EXPECT_TRUE(listed->isEqual(*array({shown})));
   }
 }
 

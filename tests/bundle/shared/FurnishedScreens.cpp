@@ -8,6 +8,7 @@
 #include "host/charts/DayViewTitleAndValueLabelPair.h"
 #include "platform/accessibility/CategoryRegistration.h"
 #include "platform/accessibility/ValidationManager.h"
+#include "platform/foundation/Number.h"
 #include "platform/toolkit/Control.h"
 #include "platform/toolkit/DataSeriesMessages.h"
 #include "platform/toolkit/ElementTree.h"
@@ -24,6 +25,13 @@ Ref<Label> captioned() {
   return label;
 }
 
+// Where a chart draws a week's columns.
+Ref<Array> columns() {
+  Array::Items items;
+  for (int i = 0; i < 7; ++i) items.push_back(number(50.0 * i));
+  return array(std::move(items));
+}
+
 // The first that a setter takes is given to it.
 std::vector<Ref<Object>> parts() {
   return {captioned(),
@@ -31,7 +39,8 @@ std::vector<Ref<Object>> parts() {
           make<host::DayViewTitleAndValueLabelPair>(),
           make<host::ActivityMoveAndExerciseChartView>(),
           make<host::ActivityStandChartView>(),
-          make<View>()};
+          make<View>(),
+          columns()};
 }
 
 bool belongsToTheToolkit(const Class* c) {
