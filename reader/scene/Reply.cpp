@@ -144,8 +144,8 @@ Json ReplyWriter::writeShown(Object& shown) const {
 
 // A class stands for itself, everything else is known by its id.
 Json ReplyWriter::writeOther(const Object& other) const {
-  if (other.isKindOf(Class::staticClass()))
-    return named("classNamed", static_cast<const Class&>(other).name());
+  if (const auto* itself = cast<Class>(const_cast<Object*>(&other)))
+    return named("classNamed", itself->name());
   Json record = Json::object();
   const std::string id = idOf_(other);
   record["id"] = id.empty() ? Json() : Json(id);
