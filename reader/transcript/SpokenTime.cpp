@@ -34,7 +34,7 @@ bool isField(double value, bool isFirst, bool isLast) {
 
 // Minutes are not gathered into hours: that is how a pace is told.
 std::string minutesAndSeconds(double seconds) {
-  if (seconds < secondsPerHour) return formatting::spokenDuration(seconds);
+  if (std::round(seconds) < secondsPerHour) return formatting::spokenDuration(seconds);
   const auto whole = std::llround(std::min(seconds, 9e15));
   std::vector<std::string> parts = {readerText("duration.minutes", {std::int64_t(whole / 60)})};
   if (whole % 60 != 0) parts.push_back(readerText("duration.seconds", {std::int64_t(whole % 60)}));
