@@ -29,9 +29,9 @@ reader::Snapshot Presentation::snapshot() const {
 reader::Snapshot Presentation::snapshotOf(Receiver object) const {
   reader::Snapshot snapshot =
       reader::takeSnapshot(object, [this](const Object& named) { return run_->idOf(named); });
-  if (snapshot.timesRaised() != 0) {
-    std::cerr << "axvelto: " << scene_->file << ": the host raised while it was asked, "
-              << snapshot.timesRaised() << " times\n";
+  if (const std::size_t times = snapshot.timesRaised(); times != 0) {
+    std::cerr << "axvelto: " << scene_->file << ": the host raised while it was asked, " << times
+              << (times == 1 ? " time\n" : " times\n");
   }
   return snapshot;
 }
