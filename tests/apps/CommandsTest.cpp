@@ -1,58 +1,14 @@
-#include <gtest/gtest.h>
-#include <sys/wait.h>
-#include <unistd.h>
-
-#include <cstdio>
-#include <filesystem>
-#include <fstream>
-#include <iterator>
 #include <nlohmann/json.hpp>
-#include <string>
 
-// Runs the program itself, as its users do.
+#include "tests/apps/ProgramTest.h"
+
 namespace ax::app {
 
 namespace {
 
-namespace fs = std::filesystem;
 using Json = nlohmann::ordered_json;
 
-struct Outcome {
-  int code;
-  std::string out, err;
-};
-
-// A folder of this process's own, gone when the test ends.
-class Commands : public testing::Test {
- protected:
-  void SetUp() override { fs::create_directories(folder_); }
-  void TearDown() override { fs::remove_all(folder_); }
-
-  std::string file(const std::string& name, const std::string& text) const {
-    const fs::path path = folder_ / name;
-    std::ofstream(path, std::ios::binary) << text;
-    return path.string();
-  }
-
-  Outcome run(const std::string& arguments, const std::string& input = "") const {
-    const fs::path program = fs::read_symlink("/proc/self/exe").parent_path() / "axvelto";
-    const std::string in = file("in", input), out = file("out", ""), err = file("err", "");
-    const std::string line =
-        "'" + program.string() + "' " + arguments + " <'" + in + "' >'" + out + "' 2>'" + err + "'";
-    const int status = std::system(line.c_str());
-    return {WIFEXITED(status) ? WEXITSTATUS(status) : -1, textOf(out), textOf(err)};
-  }
-
-  static std::string sample(const std::string& name) { return std::string(AXVELTO_SAMPLES "/") + name; }
-
- private:
-  static std::string textOf(const std::string& path) {
-    std::ifstream in(path, std::ios::binary);
-    return {std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>()};
-  }
-
-  const fs::path folder_ = fs::path(testing::TempDir()) / ("axvelto-commands-" + std::to_string(getpid()));
-};
+class Commands : public ProgramTest {};
 
 constexpr const char* oneButton = R"({
   "format": "axvelto-scene/1", "title": "Deck",

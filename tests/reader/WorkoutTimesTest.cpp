@@ -1,0 +1,153 @@
+#include <gtest/gtest.h>
+
+#include <random>
+
+#include "host/core/HostApp.h"
+#include "reader/importers/WorkoutFileReader.h"
+#include "reader/importers/WorkoutScene.h"
+#include "reader/scene/SceneRun.h"
+#include "reader/transcript/Transcript.h"
+#include "tests/reader/ScreenPieces.h"
+#include "tests/tour/Samples.h"
+
+namespace ax::reader::testing {
+namespace {
+
+using Json = nlohmann::ordered_json;
+
+WorkoutFile fileOf(const std::string& text) {
+  WorkoutFileResult result = readWorkoutFile(text, "test");
+  EXPECT_TRUE(std::holds_alternative<WorkoutFile>(result)) << text;
+  return std::get<WorkoutFile>(std::move(result));
+}
+
+std::string track(const std::string& points, const std::string& name = "") {
+  return "<trk><name>" + name + "</name><type>running</type><trkseg>" + points + "</trkseg></trk>";
+}
+
+std::string point(const std::string& time, double latitude = 50) {
+  return "<trkpt lat='" + std::to_string(latitude) + "' lon='10'><time>" + time + "</time></trkpt>";
+}
+
+std::string gpx(const std::string& tracks) {
+  return "<gpx>" + tracks + "</gpx>";
+}
+
+// The members of every object of a class, in the order of the scene.
+void collect(const Json& json, const std::string& className, std::vector<Json>& found) {
+  if (json.is_object() && json.contains("class") && json["class"] == className) found.push_back(json["set"]);
+  if (!json.is_structured()) return;
+  for (const Json& item : json) collect(item, className, found);
+}
+
+std::vector<Json> all(const Json& scene, const std::string& className) {
+  std::vector<Json> found;
+  collect(scene["screen"], className, found);
+  return found;
+}
+
+std::string spoken(const Json& json) {
+  host::linkHost();
+  const Scene scene = readScene(json.dump(), "test");
+  const SceneRun run(scene, {.modulePath = tour::modulePath()});
+  std::string text;
+  for (const std::string& line : transcript(takeSnapshot(run.screen()), run.title())) text += line + "\n";
+  return text;
+}
+
+// Twenty minutes from each start, told by the clocks of New York.
+TEST(WorkoutTimes, FollowTheClocksOfTheZone) {
+  const std::tuple<std::string, std::string, std::string, std::string> workouts[] = {
+      {"2026-03-08T06:50:00Z", "2026-03-08T07:10:00Z", "2026-03-08T01:50:00-05:00",
+       "2026-03-08T03:10:00-04:00"},
+      {"2026-11-01T05:50:00Z", "2026-11-01T06:10:00Z", "2026-11-01T01:50:00-04:00",
+       "2026-11-01T01:10:00-05:00"},
+      {"2027-01-01T04:50:00Z", "2027-01-01T05:10:00Z", "2026-12-31T23:50:00-05:00",
+       "2027-01-01T00:10:00-05:00"},
+      {"2026-06-01T09:20:00+05:30", "2026-05-31T23:40:00.000-0430", "2026-05-31T23:50:00-04:00",
+       "2026-06-01T00:10:00-04:00"},
+  };
+  for (const auto& [from, to, start, end] : workouts) {
+    const Json scene = workoutScene(fileOf(gpx(track(point(from) + point(to)))),
+                                    {.locale = "en_US", .timeZone = "America/New_York"});
+    const Json workout = all(scene, "Workout").at(0);
+    EXPECT_EQ(workout["startDate"]["date"], start);
+    EXPECT_EQ(workout["endDate"]["date"], end);
+    EXPECT_EQ(workout["duration"], 1200.0) << start;
+    EXPECT_EQ(scene["environment"]["now"], end);
+    EXPECT_NE(spoken(scene).find("20 minutes"), std::string::npos) << spoken(scene);
+  }
+}
+
+// One over midnight, at the end of a month, belongs to the month in which it begins.
+TEST(WorkoutTimes, OverMidnightCountWhereTheyBegin) {
+  const std::string night = track(point("2026-03-31T23:50:00Z") + point("2026-04-01T00:10:00Z"));
+  const std::string morning = track(point("2026-04-01T07:00:00Z") + point("2026-04-01T07:10:00Z"));
+  const Json scene = workoutListScene({fileOf(gpx(night)), fileOf(gpx(morning))}, {.timeZone = "UTC"});
+  const std::vector<Json> months = all(scene, "CHWorkoutListTableHeaderView");
+  ASSERT_EQ(months.size(), 2u);
+  EXPECT_EQ(months[0]["month"]["date"], "2026-04-01T07:00:00+00:00");
+  EXPECT_EQ(months[1]["month"]["date"], "2026-03-31T23:50:00+00:00");
+  const std::string text = spoken(scene);
+  EXPECT_LT(text.find("April"), text.find("March")) << text;
+  EXPECT_NE(text.find("March"), std::string::npos) << text;
+}
+
+TEST(WorkoutTimes, TracksOfOneFileAreWorkoutsOfTheirOwn) {
+  const std::string first = track(point("2026-03-08T07:00:00Z") + point("2026-03-08T07:10:00Z"), "First");
+  const std::string second = track(point("2026-03-09T07:00:00Z") + point("2026-03-09T07:30:00Z"), "Second");
+  const Json scene = workoutScene(fileOf(gpx(first + second)));
+  EXPECT_EQ(scene["title"], "First");
+  EXPECT_EQ(all(scene, "CHWorkoutsListTableViewCell").size(), 1u);
+  EXPECT_EQ(all(scene, "Workout").front()["duration"], 600.0);
+  EXPECT_TRUE(all(scene, "CHWorkoutDetailSplitTableViewCell").empty());
+  const std::string text = spoken(scene);
+  EXPECT_NE(text.find("10 minutes"), std::string::npos) << text;
+  EXPECT_NE(text.find("30 minutes"), std::string::npos) << text;
+}
+
+TEST(WorkoutTimes, UnknownHeartRatesCountNeitherAsBeatsNorAsNothing) {
+  std::mt19937 random(11);
+  for (int run = 0; run < 20; ++run) {
+    std::string points;
+    double sum = 0, highest = 0;
+    std::size_t count = 0;
+    for (int i = 0; i < 30; ++i) {
+      const int rate = 60 + int(random() % 120);
+      const bool isKnown = random() % 3 != 0;
+      if (isKnown) {
+        sum += rate;
+        highest = std::max<double>(highest, rate);
+        ++count;
+      }
+      points += "<Trackpoint><Time>2026-03-08T07:00:" + std::to_string(10 + i) + "Z</Time>" +
+                (isKnown ? "<HeartRateBpm><Value>" + std::to_string(rate) + "</Value></HeartRateBpm>" : "") +
+                "</Trackpoint>";
+    }
+    const Json scene = workoutScene(
+        fileOf("<TrainingCenterDatabase><Activities><Activity Sport='Running'><Lap "
+               "StartTime='2026-03-08T07:00:10Z'><TotalTimeSeconds>30</TotalTimeSeconds><DistanceMeters>100"
+               "</DistanceMeters><Track>" +
+               points + "</Track></Lap></Activity></Activities></TrainingCenterDatabase>"));
+    EXPECT_EQ(all(scene, "HeartRateSummaryReading").size(), count);
+    const Json figures = all(scene, "CHWorkoutDetailTwoValueTableViewCell").at(1);
+    EXPECT_NEAR(figures["value1"]["quantity"][0].get<double>(), sum / double(count), 1e-4);
+    EXPECT_EQ(figures["value2"]["quantity"][0], highest);
+    EXPECT_TRUE(all(scene, "_CHWorkoutDetailMapView").empty()) << "no place, no map";
+  }
+}
+
+// A degree of latitude is some 111 kilometres, and the words are those of the region.
+TEST(WorkoutTimes, DistancesAreSpokenInTheUnitsOfTheRegion) {
+  const WorkoutFile file =
+      fileOf(gpx(track(point("2026-03-08T07:00:00Z", 50) + point("2026-03-08T08:00:00Z", 50.1))));
+  const std::pair<const char*, const char*> regions[] = {
+      {"en_US", "6.91 miles"}, {"en_CA", "11.12 kilometers"}, {"de_DE", "11,12 Kilometer"}};
+  for (const auto& [locale, words] : regions) {
+    const std::string text = spoken(workoutScene(file, {.locale = locale}));
+    EXPECT_NE(text.find(words), std::string::npos) << text;
+  }
+}
+
+}  // namespace
+}  // namespace ax::reader::testing
