@@ -72,6 +72,13 @@ std::vector<Class*> Class::all() {
 }
 
 const Method& Class::lookUpSlowly(Selector selector) const {
+  const Method* known = methodCache_.find(selector);
+  const Method& result = known != nullptr ? *known : findMethod(selector);
+  recentMethods_.remember(&result, methodCache_);
+  return result;
+}
+
+const Method& Class::findMethod(Selector selector) const {
   const std::lock_guard lock(runtimeMutex());
   const Method* result = selector.record()->missing;
   for (const Class* c = this; c != nullptr; c = c->superclass_) {
@@ -100,6 +107,13 @@ const InstanceVariable* Class::instanceVariableEvenIfHidden(Selector selector) c
 }
 
 const KeyReader& Class::readerForKeySlowly(Key key) const {
+  const KeyReader* known = keyCache_.find(key);
+  const KeyReader& result = known != nullptr ? *known : findReader(key);
+  recentReaders_.remember(&result, keyCache_);
+  return result;
+}
+
+const KeyReader& Class::findReader(Key key) const {
   const std::lock_guard lock(runtimeMutex());
   KeyReader& reader = ownedReaders_.emplace_back();
   reader.selector = key;
@@ -146,8 +160,14 @@ void Class::addInstanceVariable(InstanceVariable variable) {
 }
 
 void Class::forgetCaches() {
-  if (methodCache_.size() != 0) methodCache_.clear();
-  if (keyCache_.size() != 0) keyCache_.clear();
+  if (methodCache_.size() != 0) {
+    methodCache_.clear();
+    recentMethods_.clear();
+  }
+  if (keyCache_.size() != 0) {
+    keyCache_.clear();
+    recentReaders_.clear();
+  }
   for (Class* subclass : subclasses_) subclass->forgetCaches();
 }
 

@@ -7,6 +7,7 @@
 
 #include "platform/runtime/Method.h"
 #include "platform/runtime/Object.h"
+#include "platform/runtime/RecentTable.h"
 #include "platform/runtime/SelectorTable.h"
 
 namespace ax {
@@ -61,8 +62,8 @@ class Class final : public Object {
 
   // The entry that answers a message; one without a function when the class lacks it. Never fails.
   const Method& lookUp(Selector selector) const {
-    const Method* method = methodCache_.find(selector);
-    return method != nullptr ? *method : lookUpSlowly(selector);
+    const Method& method = recentMethods_.find(selector);
+    return method.selector == selector ? method : lookUpSlowly(selector);
   }
   // What the superclass answers at this moment.
   const Method& lookUpInSuperclass(Selector selector) const {
@@ -73,8 +74,8 @@ class Class final : public Object {
   const InstanceVariable* instanceVariable(Selector selector) const;
   const InstanceVariable* instanceVariableEvenIfHidden(Selector selector) const;
   const KeyReader& readerForKey(Key key) const {
-    const KeyReader* reader = keyCache_.find(key);
-    return reader != nullptr ? *reader : readerForKeySlowly(key);
+    const KeyReader& reader = recentReaders_.find(key);
+    return reader.selector == key ? reader : readerForKeySlowly(key);
   }
   bool conformsTo(std::string_view protocol) const;
   void forEachOwnMethod(const std::function<void(const Method&)>& visit) const;
@@ -96,7 +97,9 @@ class Class final : public Object {
  private:
   Class(std::string name, Class* superclass, Ref<Object> (*factory)());
   const Method& lookUpSlowly(Selector selector) const;
+  const Method& findMethod(Selector selector) const;
   const KeyReader& readerForKeySlowly(Key key) const;
+  const KeyReader& findReader(Key key) const;
   void forgetCaches();
 
   std::string name_;
@@ -113,6 +116,8 @@ class Class final : public Object {
   SelectorTable<InstanceVariable> hiddenVariables_;
   SelectorTable<Method> hiddenMethods_;
   std::vector<std::string> protocols_;
+  mutable RecentTable<Method, 32> recentMethods_;
+  mutable RecentTable<KeyReader, 16> recentReaders_;
   mutable SelectorTable<Method> methodCache_;
   mutable SelectorTable<KeyReader> keyCache_;
   std::deque<Method> ownedMethods_;

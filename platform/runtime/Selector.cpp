@@ -1,10 +1,13 @@
 #include "platform/runtime/Selector.h"
 
+#include <array>
 #include <atomic>
 #include <cstring>
 #include <deque>
+#include <memory>
 #include <mutex>
 #include <string>
+#include <tuple>
 #include <vector>
 
 #include "platform/runtime/Method.h"
@@ -73,8 +76,8 @@ class NameTable {
   const SelectorRecord* intern(std::string_view name, std::uint64_t hash) {
     const std::lock_guard lock(mutex_);
     if (const SelectorRecord* known = find(name, hash)) return known;
-    if ((arena_.size() + 1) * 2 > generations_.back()->mask) grow();
-    SelectorRecord& record = arena_.emplace_back();
+    if ((missing_.size() + 1) * 2 > generations_.back()->mask) grow();
+    SelectorRecord& record = nextRecord();
     record.name = names_.emplace_back(name);
     record.textHash = hash;
     missing_.push_back({.selector = Selector(&record)});
@@ -86,6 +89,15 @@ class NameTable {
  private:
   using Slots = PointerSlots<const SelectorRecord>;
 
+  // Records that are made one after the other stand so, and take different places in small caches.
+  using Block = std::array<SelectorRecord, 512>;
+
+  SelectorRecord& nextRecord() {
+    const std::size_t index = missing_.size() % std::tuple_size_v<Block>;
+    if (index == 0) blocks_.push_back(std::make_unique<Block>());
+    return (*blocks_.back())[index];
+  }
+
   static void place(Slots& slots, const SelectorRecord* record) {
     std::size_t i = record->textHash & slots.mask;
     while (slots.at(i).load(std::memory_order_relaxed) != nullptr) i = (i + 1) & slots.mask;
@@ -94,13 +106,13 @@ class NameTable {
 
   void grow() {
     auto larger = Slots::make((generations_.back()->mask + 1) * 2);
-    for (const SelectorRecord& record : arena_) place(*larger, &record);
+    for (const Method& missing : missing_) place(*larger, missing.selector.record());
     slots_.store(larger.get(), std::memory_order_release);
     generations_.push_back(std::move(larger));
   }
 
   std::mutex mutex_;
-  std::deque<SelectorRecord> arena_;
+  std::vector<std::unique_ptr<Block>> blocks_;
   std::deque<std::string> names_;
   std::deque<Method> missing_;
   std::vector<Slots::Owner> generations_ = initialGenerations();

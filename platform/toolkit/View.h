@@ -40,7 +40,7 @@ class View : public Responder {
 
   virtual void layoutSubviews() {}
 
-  Rect screenRect(Rect own) const override;
+  Rect screenRect(Rect own) const final;
 
  protected:
   Rect defaultFrame() override { return screenRect(bounds()); }

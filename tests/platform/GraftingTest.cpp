@@ -117,8 +117,10 @@ TEST(Grafting, resolvesSuperWhenTheSubclassComesFirst) {
   Class& derived = Derived<2>::staticClass();
   const Ref<Derived<2>> asked = make<Derived<2>>();
   EXPECT_EQ(word(asked)->text(), "base>derived");
+  EXPECT_EQ(asked->safeValueForKey(word.selector())->description(), "base>derived");
   graftCategory(category<onDerived>(2, derived.name()), derived);
   EXPECT_EQ(inherited(asked)->text(), "base+D");
+  EXPECT_EQ(asked->safeValueForKey(word.selector())->description(), "base>derived+D");
   EXPECT_EQ(classWord(derived)->text(), "Base+D");
   EXPECT_EQ(classWord(base)->text(), "Base");
   graftCategory(category<onBase>(2, base.name()), base);
