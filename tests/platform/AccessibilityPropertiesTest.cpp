@@ -170,6 +170,7 @@ TEST(PageControl, staysWithinItsPages) {
   EXPECT_EQ(pages->currentPage(), 0);
   for (int i = 0; i < 5; ++i) accessibilityIncrement(pages);
   EXPECT_EQ(pages->currentPage(), 2);
+  ASSERT_NE(accessibilityValue(pages), nullptr);
   EXPECT_NE(accessibilityValue(pages)->text().find('3'), std::string::npos);
   EXPECT_EQ(accessibilityTraits(pages), TraitAdjustable);
   pages->setNumberOfPages(-1);

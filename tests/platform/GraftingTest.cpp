@@ -2,6 +2,9 @@
 
 #include <gtest/gtest.h>
 
+#include <atomic>
+#include <thread>
+
 #include "platform/accessibility/CategoryRegistration.h"
 #include "platform/foundation/String.h"
 #include "platform/runtime/ClassBuilder.h"
@@ -150,6 +153,25 @@ TEST(Grafting, leavesTheCategorysOwnMethodsBehind) {
   EXPECT_EQ(cast<Class>(category.safeValueForKey("safeCategoryBaseClass")).get(),
             Class::named("SafeCategory"));
   EXPECT_EQ(category.superclass()->name(), "__GraftingTest+B4_super");
+}
+
+TEST(Grafting, letsOtherThreadsSendMeanwhile) {
+  Class& base = Base<6>::staticClass();
+  std::atomic<bool> ends = false;
+  std::atomic<int> missed = 0;
+  std::thread sender([&] {
+    while (!ends) {
+      if (base.metaclass().lookUp(classWord.selector()).function == nullptr) ++missed;
+      if (base.lookUp(word.selector()).function == nullptr) ++missed;
+    }
+  });
+  graftCategory(category<onBase>(6, base.name()), base);
+  graftCategory(category<second>(6, base.name()), base);
+  ends = true;
+  sender.join();
+  EXPECT_EQ(missed, 0);
+  EXPECT_EQ(classWord(base)->text(), "Base+B+2") << "nobody keeps what was looked up before";
+  EXPECT_EQ(word(make<Base<6>>())->text(), "base+B+2");
 }
 
 class Viewed : public SafeCategory<Viewed> {
