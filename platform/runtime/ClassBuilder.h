@@ -77,13 +77,16 @@ std::ptrdiff_t offsetIn(T Owner::*) {
 template <auto Member, class Owner, class T>
 requires std::is_base_of_v<Object, Owner> && std::is_base_of_v<Object, T> std::ptrdiff_t offsetIn(
     Ref<T> Owner::*) {
-  static_assert(sizeof(Ref<T>) == sizeof(Object*) && sizeof(Member) == sizeof(std::ptrdiff_t));
+  static_assert(sizeof(Ref<T>) == sizeof(std::uintptr_t));
   const auto atSameAddress = []<class U>(U* object) {
     return static_cast<void*>(static_cast<Object*>(object)) == static_cast<void*>(object);
   };
   const auto somewhere = std::uintptr_t(1) << 16;
-  const bool begins =
-      atSameAddress(reinterpret_cast<Owner*>(somewhere)) && atSameAddress(reinterpret_cast<T*>(somewhere));
+  // NOLINTBEGIN(performance-no-int-to-ptr): the pointers are compared, never followed
+  auto* const owner = reinterpret_cast<Owner*>(somewhere);
+  auto* const member = reinterpret_cast<T*>(somewhere);
+  // NOLINTEND(performance-no-int-to-ptr)
+  const bool begins = atSameAddress(owner) && atSameAddress(member);
   return begins ? std::bit_cast<std::ptrdiff_t>(Member) : -1;
 }
 template <auto Member>
