@@ -155,7 +155,7 @@ const Method& Class::addMethod(Method method) {
 
 void Class::addInstanceVariable(InstanceVariable variable) {
   const std::lock_guard lock(runtimeMutex());
-  variables_.insert(&ownedVariables_.emplace_back(std::move(variable)));
+  variables_.insert(&ownedVariables_.emplace_back(variable));
   forgetCaches();
 }
 

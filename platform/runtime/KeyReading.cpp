@@ -29,7 +29,7 @@ Ref<Object> Object::safeValueForKey(Key key) const {
   const KeyReader& reader = isa_->readerForKey(key);
   if (reader.objectOffset < 0) return readGuarded(*this, reader);
   Object* value;
-  std::memcpy(&value, reinterpret_cast<const char*>(this) + reader.objectOffset, sizeof value);
+  std::memcpy(&value, reinterpret_cast<const char*>(this) + reader.objectOffset, sizeof(std::uintptr_t));
   return Ref<Object>(value);
 }
 

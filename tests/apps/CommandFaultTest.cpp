@@ -123,7 +123,8 @@ TEST_F(CommandFaults, EverySampleIsSoundJsonInEveryForm) {
 
 // The screens at risk are those of the failed checks, and the text tells the same as the JSON.
 TEST_F(CommandFaults, AReportOfTheContractAddsUp) {
-  const std::string without = "check --without LoadingView --without CHFriendDetailGoalCell --without "
+  const std::string without =
+      "check --without LoadingView --without CHFriendDetailGoalCell --without "
       "ActivitySummaryCache.activitySummaryForCacheIndex:";
   const Outcome outcome = run(without + " --json");
   EXPECT_EQ(outcome.code, 1);
