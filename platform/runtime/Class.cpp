@@ -74,7 +74,7 @@ std::vector<Class*> Class::all() {
 const Method& Class::lookUpSlowly(Selector selector) const {
   const Method* known = methodCache_.find(selector);
   const Method& result = known != nullptr ? *known : findMethod(selector);
-  recentMethods_.remember(&result, methodCache_);
+  firstMethods_.remember(&result, methodCache_);
   return result;
 }
 
@@ -109,7 +109,7 @@ const InstanceVariable* Class::instanceVariableEvenIfHidden(Selector selector) c
 const KeyReader& Class::readerForKeySlowly(Key key) const {
   const KeyReader* known = keyCache_.find(key);
   const KeyReader& result = known != nullptr ? *known : findReader(key);
-  recentReaders_.remember(&result, keyCache_);
+  firstReaders_.remember(&result, keyCache_);
   return result;
 }
 
@@ -162,11 +162,11 @@ void Class::addInstanceVariable(InstanceVariable variable) {
 void Class::forgetCaches() {
   if (methodCache_.size() != 0) {
     methodCache_.clear();
-    recentMethods_.clear();
+    firstMethods_.clear();
   }
   if (keyCache_.size() != 0) {
     keyCache_.clear();
-    recentReaders_.clear();
+    firstReaders_.clear();
   }
   for (Class* subclass : subclasses_) subclass->forgetCaches();
 }

@@ -5,9 +5,9 @@
 #include <string>
 #include <vector>
 
+#include "platform/runtime/FirstTable.h"
 #include "platform/runtime/Method.h"
 #include "platform/runtime/Object.h"
-#include "platform/runtime/RecentTable.h"
 #include "platform/runtime/SelectorTable.h"
 
 namespace ax {
@@ -62,7 +62,7 @@ class Class final : public Object {
 
   // The entry that answers a message; one without a function when the class lacks it. Never fails.
   const Method& lookUp(Selector selector) const {
-    const Method& method = recentMethods_.find(selector);
+    const Method& method = firstMethods_.find(selector);
     return method.selector == selector ? method : lookUpSlowly(selector);
   }
   // What the superclass answers at this moment.
@@ -74,7 +74,7 @@ class Class final : public Object {
   const InstanceVariable* instanceVariable(Selector selector) const;
   const InstanceVariable* instanceVariableEvenIfHidden(Selector selector) const;
   const KeyReader& readerForKey(Key key) const {
-    const KeyReader& reader = recentReaders_.find(key);
+    const KeyReader& reader = firstReaders_.find(key);
     return reader.selector == key ? reader : readerForKeySlowly(key);
   }
   bool conformsTo(std::string_view protocol) const;
@@ -116,8 +116,8 @@ class Class final : public Object {
   SelectorTable<InstanceVariable> hiddenVariables_;
   SelectorTable<Method> hiddenMethods_;
   std::vector<std::string> protocols_;
-  mutable RecentTable<Method, 32> recentMethods_;
-  mutable RecentTable<KeyReader, 16> recentReaders_;
+  mutable FirstTable<Method, 32> firstMethods_;
+  mutable FirstTable<KeyReader, 32> firstReaders_;
   mutable SelectorTable<Method> methodCache_;
   mutable SelectorTable<KeyReader> keyCache_;
   std::deque<Method> ownedMethods_;

@@ -8,10 +8,11 @@
 
 namespace ax {
 
-// A few records by selector, each in the one place that its selector has: what was asked for last. It stands
-// before a whole table and is right only as long as that table holds the same record; any thread may use it.
+// A few records by selector, each in the one place that its selector has: what was asked for first, since two
+// that take turns in one place would cost more than one that stays. It stands before a whole table and is
+// right only as long as that table holds the same record; any thread may use it.
 template <class Record, std::size_t Size>
-class RecentTable {
+class FirstTable {
  public:
   // A record of the selector, or one of another.
   const Record& find(Selector selector) const {
@@ -23,7 +24,8 @@ class RecentTable {
   template <class Table>
   void remember(const Record* record, const Table& behind) {
     std::atomic<const Record*>& place = places_[record->selector.hash() % Size];
-    place.exchange(record, std::memory_order_acq_rel);
+    const Record* expected = &none;
+    if (!place.compare_exchange_strong(expected, record, std::memory_order_acq_rel)) return;
     if (behind.find(record->selector) != record) place.store(&none, std::memory_order_release);
   }
 
