@@ -46,9 +46,9 @@ class Message<R(A...)> {
     return call(*object, object->isa().lookUp(selector_), std::move(arguments)...);
   }
 
-  // Calls one entry directly, as a call to super does.
+  // Calls one entry directly, as a call to super does. An entry without a function has no signature either.
   R call(Object& object, const Method& method, A... arguments) const {
-    if (method.function == nullptr || method.signature != signature_) return R();
+    if (method.signature != signature_) return R();
     using Function = CanonicalType<R> (*)(Object&, const Method&, CanonicalType<A>...);
     const auto function = reinterpret_cast<Function>(method.function);
     if constexpr (std::is_same_v<R, CanonicalType<R>>) {

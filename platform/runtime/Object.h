@@ -58,6 +58,7 @@ class Object {
   std::int64_t safeIntForKey(Key key) const;
   double safeDoubleForKey(Key key) const;
 
+  bool hasAttachments() const { return attachments_ != nullptr; }
   // The attached value under a key's address, not retained; nil when there is none.
   Object* attached(const void* key) const {
     for (const Attachment* a = attachments_; a != nullptr; a = a->next) {
@@ -81,8 +82,8 @@ class Object {
   void end() const;
 
   const Class* isa_ = nullptr;
-  mutable std::uint32_t count_ = 1;
   Attachment* attachments_ = nullptr;
+  mutable std::uint32_t count_ = 1;
 };
 
 // The class of a C++ type, asked for once.

@@ -40,6 +40,15 @@ AccessibilityProperties& AccessibilityProperties::of(Object& object) {
   return *static_cast<AccessibilityProperties*>(properties);
 }
 
+Ref<String> labelThatWasSet(Object& object) {
+  const auto* properties = AccessibilityProperties::find(object);
+  return properties == nullptr ? nullptr : properties->label;
+}
+
+void setLabel(Object& object, Ref<String> label) {
+  AccessibilityProperties::of(object).label = std::move(label);
+}
+
 void _accessibilityAddTrait(Receiver receiver, Traits bits) {
   messages::setAccessibilityTraits(receiver, messages::accessibilityTraits(receiver) | bits);
 }

@@ -52,6 +52,10 @@ class AccessibilityProperties final : public Object {
   static const char key;
 };
 
+// The label that was set on an object; nil when none was.
+Ref<String> labelThatWasSet(Object& object);
+void setLabel(Object& object, Ref<String> label);
+
 // Ors bits into the receiver's traits, overrides included.
 void _accessibilityAddTrait(Receiver receiver, Traits bits);
 // From now on the receiver's property is the block's result, computed at each query. The block must hold

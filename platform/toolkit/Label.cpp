@@ -6,6 +6,8 @@ namespace ax {
 
 Class& Label::staticClass() {
   static Class& result = ClassBuilder<Label>("Label", View::staticClass())
+                             .method<&Label::accessibilityLabel>("accessibilityLabel")
+                             .method<&Label::accessibilityTraits>("accessibilityTraits")
                              .property<&Label::text, &Label::setText>("text")
                              .property<&Label::attributedText, &Label::setAttributedText>("attributedText")
                              .build();

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/foundation/AttributedString.h"
+#include "platform/toolkit/TextLabels.h"
 #include "platform/toolkit/View.h"
 
 namespace ax {
@@ -14,13 +15,20 @@ class Label : public View {
   void setText(Ref<String> text);
   const Ref<AttributedString>& attributedText() const { return attributedText_; }
   void setAttributedText(Ref<AttributedString> text);
+  // Straight to the text where nothing was set: most of what a screen reader asks is plain labels.
+  Ref<String> accessibilityLabel() { return isPlain() ? text_ : Responder::accessibilityLabel(); }
+  Traits accessibilityTraits() {
+    return hasAttachments() ? Responder::accessibilityTraits() : Label::defaultTraits();
+  }
 
  protected:
   bool defaultIsElement() override { return !isEmpty(text_); }
-  Ref<String> defaultLabel() override;
-  Traits defaultTraits() override { return TraitStaticText; }
+  Ref<String> defaultLabel() final;
+  Traits defaultTraits() final { return TraitStaticText; }
 
  private:
+  bool isPlain() const { return !hasAttachments() && !attributedText_ && text_ && speaksItself(*text_); }
+
   Ref<String> text_;
   Ref<AttributedString> attributedText_;
 };

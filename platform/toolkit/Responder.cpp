@@ -1,6 +1,5 @@
 #include "platform/toolkit/Responder.h"
 
-#include "platform/foundation/AttributedString.h"
 #include "platform/runtime/ClassBuilder.h"
 
 namespace ax {
@@ -17,9 +16,6 @@ Block blockIn(const Properties* properties, Block Properties::Blocks::*block) {
 
 void setIsElement(Object& self, bool isElement) {
   Properties::of(self).isElement = isElement;
-}
-void setLabel(Object& self, Ref<String> label) {
-  Properties::of(self).label = std::move(label);
 }
 void setValue(Object& self, Ref<String> value) {
   Properties::of(self).value = std::move(value);
@@ -45,11 +41,6 @@ void setActivationPoint(Object& self, Point point) {
   Properties::of(self).activationPoint = point;
 }
 
-Ref<String> labelThatWasSet(Object& self) {
-  const Properties* properties = Properties::find(self);
-  return properties == nullptr ? nullptr : properties->label;
-}
-
 std::int64_t noContainerType(Object&) {
   return 0;
 }
@@ -63,22 +54,6 @@ void doNothing(Object&) {}
 std::int64_t noExpandedStatus(Object&) {
   return 0;
 }
-
-// Texts carry spoken forms, and nothing else of what responders do.
-template <class T>
-void registerLabelsOf(Class& texts) {
-  ClassBuilder<T>(texts)
-      .template method<&labelThatWasSet>("accessibilityLabel")
-      .template method<&setLabel>("setAccessibilityLabel:")
-      .template method<&labelThatWasSet>("accessibilityUserDefinedLabel");
-}
-
-struct TextLabels {
-  TextLabels() {
-    registerLabelsOf<String>(String::staticClass());
-    registerLabelsOf<AttributedString>(AttributedString::staticClass());
-  }
-};
 
 }  // namespace
 
@@ -187,6 +162,5 @@ bool Responder::accessibilityActivate() {
 }
 
 static const RegisteredClass<Responder> registered;
-static const TextLabels textLabels;
 
 }  // namespace ax

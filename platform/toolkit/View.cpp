@@ -22,6 +22,7 @@ Ref<Object> hitTest(View& view, Point point, Ref<Object>) {
 Class& View::staticClass() {
   static Class& result = ClassBuilder<View>("View", Responder::staticClass())
                              .property<&View::frame, &View::setFrame>("frame")
+                             .method<&View::accessibilityFrame>("accessibilityFrame")
                              .method<&View::bounds>("bounds")
                              .method<&View::center>("center")
                              .property<&View::isHidden, &View::setHidden>("hidden")
@@ -37,7 +38,7 @@ Class& View::staticClass() {
 
 View::~View() {
   for (const Ref<View>& view : subviews_) view->superview_ = nullptr;
-  if (layer_) layer_->setOwner(nullptr);
+  if (uncommon_ && uncommon_->layer) uncommon_->layer->setOwner(nullptr);
 }
 
 Ref<Array> View::subviewArray() const {
@@ -68,19 +69,29 @@ bool View::isDescendantOf(const View& other) const {
 }
 
 const Ref<Layer>& View::layer() {
-  if (!layer_) {
-    layer_ = make<Layer>();
-    layer_->setOwner(this);
+  Ref<Layer>& layer = uncommon().layer;
+  if (!layer) {
+    layer = make<Layer>();
+    layer->setOwner(this);
   }
-  return layer_;
+  return layer;
+}
+
+View::Uncommon& View::uncommon() {
+  if (!uncommon_) uncommon_ = std::make_unique<Uncommon>();
+  return *uncommon_;
 }
 
 Rect View::screenRect(Rect own) const {
+  Point at = {own.x, own.y};
   for (const View* view = this; view != nullptr; view = view->superview_) {
-    const Point origin = view->boundsOrigin();
-    own = own.movedBy({view->frame_.x - origin.x, view->frame_.y - origin.y});
+    at.x += view->frame_.x;
+    at.y += view->frame_.y;
+    if (!view->uncommon_) continue;
+    at.x -= view->uncommon_->boundsOrigin.x;
+    at.y -= view->uncommon_->boundsOrigin.y;
   }
-  return own;
+  return {at.x, at.y, own.width, own.height};
 }
 
 Ref<View> safeUIViewForKey(Receiver receiver, Key key) {

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <memory>
 #include <vector>
 
 #include "platform/toolkit/Layer.h"
@@ -17,15 +18,15 @@ class View : public Responder {
   Rect frame() const { return frame_; }
   void setFrame(Rect frame) { frame_ = frame; }
   // Where the view's own space begins: other than zero where the view shows a part of it.
-  Point boundsOrigin() const { return boundsOrigin_; }
-  void setBoundsOrigin(Point origin) { boundsOrigin_ = origin; }
+  Point boundsOrigin() const { return uncommon_ ? uncommon_->boundsOrigin : Point(); }
+  void setBoundsOrigin(Point origin) { uncommon().boundsOrigin = origin; }
   Rect bounds() const { return {boundsOrigin().x, boundsOrigin().y, frame_.width, frame_.height}; }
   Point center() const { return frame_.center(); }
 
   bool isHidden() const { return isHidden_; }
   void setHidden(bool hidden) { isHidden_ = hidden; }
-  double alpha() const { return alpha_; }
-  void setAlpha(double alpha) { alpha_ = alpha; }
+  double alpha() const { return uncommon_ ? uncommon_->alpha : 1; }
+  void setAlpha(double alpha) { uncommon().alpha = alpha; }
 
   View* superview() const { return superview_; }
   const std::vector<Ref<View>>& subviews() const { return subviews_; }
@@ -36,24 +37,34 @@ class View : public Responder {
 
   // The view's own layer, made at first use. Its sublayers are drawn in the view's space.
   const Ref<Layer>& layer();
-  const Layer* layerIfAny() const { return layer_.get(); }
+  const Layer* layerIfAny() const { return uncommon_ ? uncommon_->layer.get() : nullptr; }
 
   virtual void layoutSubviews() {}
 
   Rect screenRect(Rect own) const final;
+  // Straight to the default where nothing was set: this is asked of every view there is.
+  Rect accessibilityFrame() {
+    return hasAttachments() ? Responder::accessibilityFrame() : View::defaultFrame();
+  }
 
  protected:
-  Rect defaultFrame() override { return screenRect(bounds()); }
+  Rect defaultFrame() final { return superview_ == nullptr ? frame_ : superview_->screenRect(frame_); }
   Ref<Object> defaultContainer() override { return Ref<Object>(superview_); }
 
  private:
+  // What few views have something of; the others stay small without it.
+  struct Uncommon {
+    Point boundsOrigin;
+    double alpha = 1;
+    Ref<Layer> layer;
+  };
+  Uncommon& uncommon();
+
+  bool isHidden_ = false;
   Rect frame_;
-  Point boundsOrigin_;
   View* superview_ = nullptr;
   std::vector<Ref<View>> subviews_;
-  Ref<Layer> layer_;
-  double alpha_ = 1;
-  bool isHidden_ = false;
+  std::unique_ptr<Uncommon> uncommon_;
 };
 
 }  // namespace ax

@@ -38,6 +38,17 @@ const CategoryRegistration<B> registration{
     {overrides<&B::accessibilityLabel>(messages::accessibilityLabel),
      overrides<&B::accessibilityTraits>(messages::accessibilityTraits)}};
 
+class TextAccessibility : public SafeCategory<TextAccessibility> {
+ public:
+  using SafeCategory::SafeCategory;
+  static void _accessibilityPerformValidations(ValidationManager&) {}
+  Ref<String> accessibilityLabel() { return string("override"); }
+};
+const CategoryRegistration<TextAccessibility> textRegistration{
+    "PropertiesTestTextAccessibility",
+    "String",
+    {overrides<&TextAccessibility::accessibilityLabel>(messages::accessibilityLabel)}};
+
 TEST(AccessibilityProperties, answerInTheirOrderOfPrecedence) {
   const Ref<Badge> badge = make<Badge>();
   badge->setText(string("default"));
@@ -100,6 +111,10 @@ TEST(AccessibilityProperties, speakTheSpokenFormOfATextFirst) {
   EXPECT_EQ(accessibilityLabel(label)->text(), "6 kilometers");
   label->setAttributedText(nullptr);
   EXPECT_EQ(accessibilityLabel(label), nullptr);
+  label->setText(string("plain"));
+  EXPECT_EQ(accessibilityLabel(label), label->text());
+  graftCategory(*textRegistration.category, String::staticClass());
+  EXPECT_EQ(accessibilityLabel(label)->text(), "override") << "also of a text that carries nothing";
 }
 
 TEST(AccessibilityProperties, letABlockReplaceItselfWhileItRuns) {
