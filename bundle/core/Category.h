@@ -6,6 +6,7 @@
 #include "platform/foundation/String.h"
 #include "platform/runtime/KeyReading.h"
 #include "platform/runtime/SafeCategory.h"
+#include "platform/toolkit/AccessibilityElement.h"
 #include "platform/toolkit/AccessibilityMessages.h"
 #include "platform/toolkit/AccessibilityProperties.h"
 #include "platform/toolkit/ElementTree.h"
@@ -14,8 +15,5 @@
 namespace ax {
 
 using Manager = ValidationManager;
-
-// Under this name a view keeps the elements that a category built for it.
-inline const Key StorageKeyChildren = Selector::intern("StorageKeyChildren");
 
 }  // namespace ax

@@ -1,5 +1,7 @@
 #include "platform/toolkit/Layer.h"
 
+#include <algorithm>
+
 #include "platform/runtime/ClassBuilder.h"
 #include "platform/toolkit/View.h"
 
@@ -25,12 +27,22 @@ Ref<Array> Layer::sublayerArray() const {
 }
 
 void Layer::addSublayer(const Ref<Layer>& layer) {
-  if (!layer || layer->superlayer_ != nullptr) return;
+  if (!layer) return;
   for (const Layer* above = this; above != nullptr; above = above->superlayer_) {
     if (above == layer.get()) return;
   }
-  layer->superlayer_ = this;
-  sublayers_.push_back(layer);
+  const Ref<Layer> kept(layer.get());  // `layer` may stand in the list that it is taken from
+  kept->removeFromSuperlayer();
+  kept->superlayer_ = this;
+  sublayers_.push_back(kept);
+}
+
+void Layer::removeFromSuperlayer() {
+  if (superlayer_ == nullptr) return;
+  const Ref<Layer> kept(this);
+  auto& siblings = superlayer_->sublayers_;
+  siblings.erase(std::find(siblings.begin(), siblings.end(), kept));
+  superlayer_ = nullptr;
 }
 
 Rect Layer::screenRect(Rect own) const {

@@ -23,8 +23,9 @@ class Layer : public Responder {
   void setHidden(bool hidden) { isHidden_ = hidden; }
 
   const std::vector<Ref<Layer>>& sublayers() const { return sublayers_; }
-  // Nothing happens to a layer that has a superlayer, or that this one lies in.
+  // Takes the layer out of another one first. Nothing happens to a layer that this one lies in.
   void addSublayer(const Ref<Layer>& layer);
+  void removeFromSuperlayer();
   Layer* superlayer() const { return superlayer_; }
   // The view whose own layer this is, or nil.
   View* owner() const { return owner_; }

@@ -225,6 +225,17 @@ TEST(View, hasOneSuperviewAndNoCircle) {
   EXPECT_FALSE(weak);
 }
 
+TEST(Layer, hasOneSuperlayerAndNoCircle) {
+  const Ref<Layer> first = make<Layer>();
+  const Ref<Layer> second = make<Layer>();
+  first->addSublayer(make<Layer>());
+  second->addSublayer(first->sublayers().front());
+  EXPECT_TRUE(first->sublayers().empty());
+  ASSERT_EQ(second->sublayers().size(), 1U);
+  second->sublayers().front()->addSublayer(second);
+  EXPECT_EQ(second->superlayer(), nullptr);
+}
+
 TEST(NavigationItem, countsFromTheRight) {
   const Ref<NavigationItem> item = make<ViewController>()->navigationItem();
   EXPECT_EQ(item->rightBarButtonItem(), nullptr);
