@@ -14,6 +14,7 @@ enum ExitCode : int { exitDone = 0, exitFallsShort = 1, exitBadUse = 2 };
 struct Arguments {
   std::vector<std::string> files;    // paths, or "-" for standard input
   std::string locale;                // empty: the scene's
+  std::string timeZone;              // of imported workouts; empty: UTC
   std::vector<std::string> without;  // classes and members that the host does without
   bool asJson = false;
   std::string chart;  // the id of one object whose charts are wanted

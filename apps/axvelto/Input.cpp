@@ -50,6 +50,11 @@ void checkLocale(const std::string& locale) {
   throw Fault{"--locale", "", "\"" + locale + "\" is no known locale", "one such as en_US"};
 }
 
+void checkTimeZone(const std::string& timeZone) {
+  if (timeZone.empty() || formatting::isKnownTimeZone(timeZone)) return;
+  throw Fault{"--time-zone", "", "\"" + timeZone + "\" is no known time zone", "one such as Europe/Berlin"};
+}
+
 void checkOmissions(const std::vector<std::string>& names) {
   for (const std::string& name : names) reader::checkOmission({"", name}, "--without");
 }
@@ -58,7 +63,7 @@ reader::Scene sceneFor(const Arguments& arguments) {
   const std::string& file = arguments.files.front();
   checkLocale(arguments.locale);
   std::string text = readInput(file);
-  if (isWorkoutFile(text)) text = importWorkouts({{file, std::move(text)}}, arguments.locale).dump();
+  if (isWorkoutFile(text)) text = importWorkouts({{file, std::move(text)}}, arguments).dump();
   reader::Scene scene = reader::readScene(text, file);
   if (!arguments.locale.empty()) speakFor(scene, arguments.locale);
   checkOmissions(arguments.without);

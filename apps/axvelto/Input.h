@@ -20,16 +20,18 @@ struct InputFile {
   std::string bytes;
 };
 
-// The scene of one workout file in detail, or of several as a list, for the locale ("" is the default one).
-// Throws a Fault.
-nlohmann::ordered_json importWorkouts(const std::vector<InputFile>& files, const std::string& locale);
+// The scene of one workout file in detail, or of several as a list, for the locale and the time zone that the
+// command line names. Throws a Fault.
+nlohmann::ordered_json importWorkouts(const std::vector<InputFile>& files, const Arguments& arguments);
 
 // The scene that the command line names, imported where it is a workout file, with its locale and the
 // omissions checked. Throws a Fault.
 reader::Scene sceneFor(const Arguments& arguments);
 
-// Throw a Fault for a locale that is not known, and for a class or member that the host does not have.
+// Throw a Fault for a locale or time zone that is not known, and for a class or member that the host does not
+// have.
 void checkLocale(const std::string& locale);
+void checkTimeZone(const std::string& timeZone);
 void checkOmissions(const std::vector<std::string>& names);
 
 }  // namespace ax::app

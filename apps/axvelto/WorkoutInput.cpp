@@ -18,9 +18,10 @@ WorkoutFile readWorkout(const InputFile& file) {
 
 }  // namespace
 
-nlohmann::ordered_json importWorkouts(const std::vector<InputFile>& files, const std::string& locale) {
+nlohmann::ordered_json importWorkouts(const std::vector<InputFile>& files, const Arguments& arguments) {
   WorkoutSceneOptions options;
-  if (!locale.empty()) options.locale = locale;
+  if (!arguments.locale.empty()) options.locale = arguments.locale;
+  if (!arguments.timeZone.empty()) options.timeZone = arguments.timeZone;
   std::vector<WorkoutFile> workouts;
   for (const InputFile& file : files) workouts.push_back(readWorkout(file));
   return workouts.size() == 1 ? workoutScene(workouts.front(), options) : workoutListScene(workouts, options);

@@ -15,7 +15,7 @@ TrackPoint readPoint(pugi::xml_node node, double time) {
   point.longitude = parseNumber(node.attribute("lon").value(), longitudes);
   // Writers nest it differently: directly, or in an extension element of their own.
   const pugi::xml_node heartRate = descendantNamed(childNamed(node, "extensions"), "hr");
-  point.heartRate = parseNumber(textOf(heartRate), positive);
+  point.heartRate = parseNumber(textOf(heartRate), heartRates);
   dropFalsePosition(point);
   return point;
 }

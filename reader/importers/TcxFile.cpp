@@ -18,7 +18,7 @@ constexpr PointField pointFields[] = {
     {"Position/LatitudeDegrees", &TrackPoint::latitude, latitudes},
     {"Position/LongitudeDegrees", &TrackPoint::longitude, longitudes},
     {"DistanceMeters", &TrackPoint::distance, notNegative},
-    {"HeartRateBpm/Value", &TrackPoint::heartRate, positive},
+    {"HeartRateBpm/Value", &TrackPoint::heartRate, heartRates},
 };
 
 std::optional<double> amountIn(pugi::xml_node node, std::string_view path) {

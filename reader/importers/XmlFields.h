@@ -1,6 +1,5 @@
 #pragma once
 
-#include <limits>
 #include <optional>
 #include <pugixml.hpp>
 #include <string>
@@ -35,7 +34,7 @@ struct NumberLimits {
 };
 constexpr double beyondAnyRecord = 1e12;
 constexpr NumberLimits notNegative{0, beyondAnyRecord};
-constexpr NumberLimits positive{std::numeric_limits<double>::min(), beyondAnyRecord};
+constexpr NumberLimits heartRates{1, 255};  // beats a minute, what both formats have room for
 constexpr NumberLimits latitudes{-90, 90};
 constexpr NumberLimits longitudes{-180, 180};
 

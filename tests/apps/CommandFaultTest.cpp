@@ -40,6 +40,8 @@ TEST_F(CommandFaults, TellWhatIsWrongWhereAndWhatWasExpected) {
   expectRefusal("import -", oneNote, "-: there is no element, at line 1, column 1, expected an XML document");
   expectRefusal("import - --locale xx_YY", "",
                 "--locale: \"xx_YY\" is no known locale, expected one such as en_US");
+  expectRefusal("import - --time-zone Mars/Olympus", "",
+                "--time-zone: \"Mars/Olympus\" is no known time zone, expected one such as Europe/Berlin");
   expectRefusal("speak no/such.json", "", "no/such.json: cannot be read, expected a scene or a workout file");
   expectRefusal("check --without Label.Ring", "",
                 "--without: unknown member \"Ring\", expected a member, method, class method or protocol of "

@@ -119,6 +119,9 @@ TEST_F(Commands, ImportGivesTheSceneThatSpeakSpeaks) {
   const std::string spoken = run("speak -", list.out).out;
   EXPECT_NE(spoken.find("Cycling"), std::string::npos);
   EXPECT_NE(spoken.find("Running"), std::string::npos);
+
+  const Outcome elsewhere = run("import " + run1 + " --time-zone Asia/Tokyo");
+  EXPECT_EQ(Json::parse(elsewhere.out)["environment"]["timeZone"], "Asia/Tokyo");
 }
 
 }  // namespace

@@ -114,7 +114,7 @@ TEST(TcxFile, ReadsLapsPausesAndPrefixedElements) {
 }
 
 TEST(TcxFile, LeavesOutValuesThatCannotBe) {
-  for (const char* rate : {"0", "-3", "nan", "inf", "1e999", "12,5", "12 bpm", ""}) {
+  for (const char* rate : {"0", "-3", "nan", "inf", "1e999", "12,5", "12 bpm", "256", ""}) {
     const auto beats = "<HeartRateBpm><Value>" + std::string(rate) + "</Value></HeartRateBpm>";
     const auto run = readOne(inLap("<Track>" + tcxPoint(0, beats + position("60", "+10")) + "</Track>"));
     EXPECT_EQ(run.points.at(0).heartRate, std::nullopt) << rate;
