@@ -15,9 +15,8 @@ set(CMAKE_BUILD_RPATH_USE_ORIGIN ON)
 
 add_library(axvelto-settings INTERFACE)
 target_include_directories(axvelto-settings INTERFACE ${CMAKE_SOURCE_DIR})
-# g++ 12 takes `"text" + std::string` for an overlapping copy once it is optimized, hence no -Wrestrict.
 target_compile_options(axvelto-settings INTERFACE -Wall -Wextra -Wpedantic -Werror -Wshadow -Wnon-virtual-dtor
-                                                  -Wcast-align -Woverloaded-virtual -Wno-restrict -fno-plt)
+                                                  -Wcast-align -Woverloaded-virtual -fno-plt)
 
 set(AXVELTO_SANITIZE "" CACHE STRING "Sanitizers to build with, as -fsanitize takes them")
 if(AXVELTO_SANITIZE)
