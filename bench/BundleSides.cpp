@@ -10,14 +10,14 @@ namespace bench {
 
 namespace {
 
-void compareChart(const std::string& name, const std::string& title, std::optional<double> bound,
+void compareChart(const std::string& name, const std::string& title, const std::vector<Bound>& bounds,
                   std::vector<Row>& rows) {
-  compare({name, title + ", per element", bound}, rows);
+  compare({name, title + ", per element", bounds}, rows);
   compare({name + " cold", title + ", per element, cold"}, rows);
 }
 
 void compareCharts(std::vector<Row>& rows) {
-  compareChart("move chart 8", "move chart of 8", 1.5, rows);
+  compareChart("move chart 8", "move chart of 8", {{"floor", 1.5}}, rows);
   for (int hours : standSizes)
     compareChart(sized("stand chart ", hours), sized("stand chart of ", hours), {}, rows);
   for (int bars : trendSizes) compareChart(sized("trend ", bars), sized("trend of ", bars), {}, rows);

@@ -13,6 +13,13 @@ double timingOf(const std::string& operation, const char* side) {
   return 0;
 }
 
+std::optional<double> boundTo(const std::string& side, const Operation& operation) {
+  for (const Bound& bound : operation.bounds) {
+    if (bound.side == side) return bound.ratio;
+  }
+  return std::nullopt;
+}
+
 double growthOf(const Growth& growth, const char* side) {
   return timingOf(growth.large, side) / timingOf(growth.small, side);
 }
@@ -23,9 +30,8 @@ void compare(const Operation& operation, std::vector<Row>& rows) {
   const double ours = timingOf(operation.name, "ours");
   for (const Timing& timing : timingsOf(operation.name)) {
     if (timing.name == "ours") continue;
-    const bool isFloor = timing.name == "floor";
-    rows.push_back({operation.title, "ns", ours, timing.name, timing.nanoseconds,
-                    isFloor ? operation.boundToFloor : operation.boundToPeers});
+    rows.push_back(
+        {operation.title, "ns", ours, timing.name, timing.nanoseconds, boundTo(timing.name, operation)});
   }
 }
 

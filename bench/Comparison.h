@@ -9,12 +9,17 @@
 // Rows made of the timings that have been taken. Costs are per item of an operation.
 namespace bench {
 
-// What is compared, and how large the ratios may be: to the floor, and to every peer.
+// How large the ratio to one side may be.
+struct Bound {
+  std::string side;
+  double ratio = 1;
+};
+
+// What is compared, and the bounds that there are.
 struct Operation {
   std::string name;
   std::string title;
-  std::optional<double> boundToFloor = {};
-  std::optional<double> boundToPeers = {};
+  std::vector<Bound> bounds = {};
 };
 void compare(const Operation& operation, std::vector<Row>& rows);
 

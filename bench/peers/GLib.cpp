@@ -3,18 +3,10 @@
 #include <memory>
 
 #include "bench/Sides.h"
+#include "bench/peers/PropertyNames.h"
 
 // Properties by name and object data of a GObject.
 namespace {
-
-constexpr const char* names[] = {"title-label",
-                                 "value-label",
-                                 "distance-label",
-                                 "duration-label",
-                                 "active-energy-label",
-                                 "pace-label",
-                                 "weather-condition-image-view",
-                                 "number-of-workouts-label"};
 
 struct Host {
   GObject parent;
@@ -29,7 +21,7 @@ void initializeClass(gpointer type, gpointer) {
   auto* objects = static_cast<GObjectClass*>(type);
   objects->get_property = getProperty;
   guint id = 0;
-  for (const char* name : names) {
+  for (const char* name : bench::propertyNames) {
     const auto flags = GParamFlags(G_PARAM_READABLE | G_PARAM_STATIC_STRINGS);
     g_object_class_install_property(objects, ++id,
                                     g_param_spec_object(name, name, name, G_TYPE_OBJECT, flags));
@@ -59,7 +51,7 @@ auto readByName() {
   return [object = host()] {
     for (int i = 0; i < bench::batch; ++i) {
       GObject* label = nullptr;
-      g_object_get(object.get(), names[i & 7], &label, nullptr);
+      g_object_get(object.get(), bench::propertyNames[i & 7], &label, nullptr);
       benchmark::DoNotOptimize(label);
       g_object_unref(label);
     }

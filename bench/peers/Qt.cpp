@@ -4,6 +4,7 @@
 #include <memory>
 
 #include "bench/Sides.h"
+#include "bench/peers/PropertyNames.h"
 
 // Properties by name and dynamic properties of a QObject.
 namespace {
@@ -25,19 +26,10 @@ class Host : public QObject {
   QObject* label;
 };
 
-constexpr const char* names[] = {"titleLabel",
-                                 "valueLabel",
-                                 "distanceLabel",
-                                 "durationLabel",
-                                 "activeEnergyLabel",
-                                 "paceLabel",
-                                 "weatherConditionImageView",
-                                 "numberOfWorkoutsLabel"};
-
 auto readByName() {
   return [host = std::make_shared<Host>()] {
     for (int i = 0; i < bench::batch; ++i) {
-      benchmark::DoNotOptimize(qvariant_cast<QObject*>(host->property(names[i & 7])));
+      benchmark::DoNotOptimize(qvariant_cast<QObject*>(host->property(bench::propertyNames[i & 7])));
     }
   };
 }
