@@ -31,12 +31,12 @@ Ref<View> screen(int nodes) {
   return root;
 }
 
-void visit(const Ref<View>& view, Sums& sums) {
+void visit(View& view, Sums& sums) {
   const Ref<String> label = messages::accessibilityLabel(view);
   if (label) sums.bytes += label->text().size();
   sums.traits |= messages::accessibilityTraits(view);
   sums.right += messages::accessibilityFrame(view).maxX();
-  for (const Ref<View>& child : view->subviews()) visit(child, sums);
+  for (const Ref<View>& child : view.subviews()) visit(*child, sums);
 }
 
 // The same tree and the same answers as virtual functions.
@@ -107,7 +107,7 @@ struct WalkSides {
           [nodes] {
             return [root = screen(nodes)] {
               Sums sums;
-              visit(root, sums);
+              visit(*root, sums);
               benchmark::DoNotOptimize(sums);
             };
           },
