@@ -8,20 +8,12 @@
 #include "host/core/HostApp.h"
 #include "platform/formatting/Region.h"
 #include "platform/toolkit/DataSeriesMessages.h"
-#include "reader/importers/WorkoutFileReader.h"
 #include "reader/scene/SceneRun.h"
+#include "tests/reader/WorkoutPieces.h"
 #include "tests/tour/Samples.h"
 
-namespace ax::reader {
+namespace ax::reader::testing {
 namespace {
-
-using Json = nlohmann::ordered_json;
-
-WorkoutFile fileOf(const std::string& text) {
-  WorkoutFileResult result = readWorkoutFile(text, "test");
-  EXPECT_TRUE(std::holds_alternative<WorkoutFile>(result)) << text;
-  return std::get<WorkoutFile>(std::move(result));
-}
 
 std::string point(const std::string& time, int metres, const std::string& more = "") {
   return "<Trackpoint><Time>" + time + "</Time><DistanceMeters>" + std::to_string(metres) +
@@ -61,19 +53,6 @@ std::string run() {
 
 std::string bareActivity(const std::string& sport, const std::string& time) {
   return activity(sport, lap(time, 60, 0, "<Trackpoint><Time>" + time + "</Time></Trackpoint>"));
-}
-
-// Every object of a class below some JSON, in order.
-void collect(const Json& json, const std::string& className, std::vector<Json>& found) {
-  if (json.is_object() && json.contains("class") && json["class"] == className) found.push_back(json["set"]);
-  if (!json.is_structured()) return;
-  for (const Json& item : json) collect(item, className, found);
-}
-
-std::vector<Json> all(const Json& scene, const std::string& className) {
-  std::vector<Json> found;
-  collect(scene["screen"], className, found);
-  return found;
 }
 
 std::vector<std::string> rowsOf(const Json& scene) {
@@ -232,4 +211,4 @@ TEST(WorkoutScene, LeavesTheRegionOfTheProcessAlone) {
 }
 
 }  // namespace
-}  // namespace ax::reader
+}  // namespace ax::reader::testing

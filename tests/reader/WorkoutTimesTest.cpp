@@ -3,23 +3,15 @@
 #include <random>
 
 #include "host/core/HostApp.h"
-#include "reader/importers/WorkoutFileReader.h"
 #include "reader/importers/WorkoutScene.h"
 #include "reader/scene/SceneRun.h"
 #include "reader/transcript/Transcript.h"
 #include "tests/reader/ScreenPieces.h"
+#include "tests/reader/WorkoutPieces.h"
 #include "tests/tour/Samples.h"
 
 namespace ax::reader::testing {
 namespace {
-
-using Json = nlohmann::ordered_json;
-
-WorkoutFile fileOf(const std::string& text) {
-  WorkoutFileResult result = readWorkoutFile(text, "test");
-  EXPECT_TRUE(std::holds_alternative<WorkoutFile>(result)) << text;
-  return std::get<WorkoutFile>(std::move(result));
-}
 
 std::string track(const std::string& points, const std::string& name = "") {
   return "<trk><name>" + name + "</name><type>running</type><trkseg>" + points + "</trkseg></trk>";
@@ -31,19 +23,6 @@ std::string point(const std::string& time, double latitude = 50) {
 
 std::string gpx(const std::string& tracks) {
   return "<gpx>" + tracks + "</gpx>";
-}
-
-// The members of every object of a class, in the order of the scene.
-void collect(const Json& json, const std::string& className, std::vector<Json>& found) {
-  if (json.is_object() && json.contains("class") && json["class"] == className) found.push_back(json["set"]);
-  if (!json.is_structured()) return;
-  for (const Json& item : json) collect(item, className, found);
-}
-
-std::vector<Json> all(const Json& scene, const std::string& className) {
-  std::vector<Json> found;
-  collect(scene["screen"], className, found);
-  return found;
 }
 
 std::string spoken(const Json& json) {
