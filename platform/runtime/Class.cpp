@@ -73,9 +73,7 @@ std::vector<Class*> Class::all() {
 
 const Method& Class::lookUpSlowly(Selector selector) const {
   const Method* known = methodCache_.find(selector);
-  const Method& result = known != nullptr ? *known : findMethod(selector);
-  firstMethods_.remember(&result, methodCache_);
-  return result;
+  return known != nullptr ? *known : findMethod(selector);
 }
 
 const Method& Class::findMethod(Selector selector) const {
@@ -88,6 +86,7 @@ const Method& Class::findMethod(Selector selector) const {
     }
   }
   methodCache_.insert(result);
+  firstMethods_.remember(*result);
   return *result;
 }
 
@@ -108,9 +107,7 @@ const InstanceVariable* Class::instanceVariableEvenIfHidden(Selector selector) c
 
 const KeyReader& Class::readerForKeySlowly(Key key) const {
   const KeyReader* known = keyCache_.find(key);
-  const KeyReader& result = known != nullptr ? *known : findReader(key);
-  firstReaders_.remember(&result, keyCache_);
-  return result;
+  return known != nullptr ? *known : findReader(key);
 }
 
 const KeyReader& Class::findReader(Key key) const {
@@ -127,6 +124,7 @@ const KeyReader& Class::findReader(Key key) const {
     if (isReadable) reader.method = &method;
   }
   keyCache_.insert(&reader);
+  firstReaders_.remember(reader);
   return reader;
 }
 
