@@ -137,7 +137,7 @@ std::optional<double> parseDate(std::string_view text, std::string_view pattern)
   const icu::UnicodeString source = unicode(text);
   icu::ParsePosition position(0);
   reader->calendar->clear();
-  reader->calendar->set(2000, UCAL_JANUARY, 1, 0, 0, 0);
+  reader->calendar->set(2000, UCAL_JANUARY, 1, 12, 0, 0);  // noon: some midnights do not exist
   reader->format->parse(source, *reader->calendar, position);
   if (position.getIndex() != source.length()) return std::nullopt;
   UErrorCode status = U_ZERO_ERROR;

@@ -19,7 +19,7 @@ std::string dateString(double time, std::string_view pattern);
 std::string dateStyleString(double time, DateStyle style);
 
 // Reads the whole of `text` by `pattern` as it stands ("MM" reads "3", "03" and "12"), in ASCII digits
-// or the region's. Fields that are not given come from local midnight of 2000-01-01, and years of
+// or the region's. Fields that are not given come from local noon of 2000-01-01, and years of
 // two digits lie between 1950 and 2049. Nothing when the text does not fit or is no date.
 std::optional<double> parseDate(std::string_view text, std::string_view pattern);
 

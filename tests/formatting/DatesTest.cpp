@@ -63,21 +63,27 @@ TEST(Dates, withoutATimeAreEmpty) {
 TEST(Dates, readMonthNumbersAndNothingElse) {
   for (const char* locale : {"en_US", "ar_EG", "ja_JP"}) {
     const RegionScope scope(locale, "America/New_York");
-    EXPECT_EQ(parseDate("3", "MM"), timeFromIso("2000-03-01")) << locale;
-    EXPECT_EQ(parseDate("03", "MM"), timeFromIso("2000-03-01")) << locale;
-    EXPECT_EQ(parseDate("٣", "MM"), timeFromIso("2000-03-01")) << locale;
-    EXPECT_EQ(parseDate("12", "MM"), timeFromIso("2000-12-01")) << locale;
+    EXPECT_EQ(parseDate("3", "MM"), timeFromIso("2000-03-01T12:00:00")) << locale;
+    EXPECT_EQ(parseDate("03", "MM"), timeFromIso("2000-03-01T12:00:00")) << locale;
+    EXPECT_EQ(parseDate("٣", "MM"), timeFromIso("2000-03-01T12:00:00")) << locale;
+    EXPECT_EQ(parseDate("12", "MM"), timeFromIso("2000-12-01T12:00:00")) << locale;
     for (const char* text : {"", "0", "13", "-3", "3x", "x"})
       EXPECT_EQ(parseDate(text, "MM"), std::nullopt) << text;
   }
 }
 
+TEST(Dates, readMonthsWhoseFirstMidnightWasSkipped) {
+  const RegionScope scope("en_US", "Asia/Damascus");
+  ASSERT_TRUE(parseDate("04", "MM"));
+  EXPECT_EQ(dateString(*parseDate("04", "MM"), "MMMM"), "April");
+}
+
 TEST(Dates, readWholeDates) {
   const RegionScope scope("en_US", "Europe/Berlin");
-  EXPECT_EQ(parseDate("2026-03-29", "yyyy-MM-dd"), timeFromIso("2026-03-29"));
+  EXPECT_EQ(parseDate("2026-03-29", "yyyy-MM-dd"), timeFromIso("2026-03-29T12:00:00"));
   EXPECT_EQ(parseDate("2026-02-30", "yyyy-MM-dd"), std::nullopt);
-  EXPECT_EQ(parseDate("March 49", "MMMM yy"), timeFromIso("2049-03-01"));
-  EXPECT_EQ(parseDate("March 50", "MMMM yy"), timeFromIso("1950-03-01"));
+  EXPECT_EQ(parseDate("March 49", "MMMM yy"), timeFromIso("2049-03-01T12:00:00"));
+  EXPECT_EQ(parseDate("March 50", "MMMM yy"), timeFromIso("1950-03-01T12:00:00"));
 }
 
 TEST(Dates, nameTheWeekdays) {
