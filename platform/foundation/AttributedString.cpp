@@ -27,6 +27,12 @@ Ref<AccessibilityAttributedString> AccessibilityAttributedString::initWithString
   return make<AccessibilityAttributedString>(string ? string->text() : "");
 }
 
+Ref<Object> AccessibilityAttributedString::copy() {
+  Ref<AccessibilityAttributedString> result = make<AccessibilityAttributedString>(text());
+  result->attributes_ = attributes_;
+  return result;
+}
+
 void AccessibilityAttributedString::setAttributeForKey(Ref<Object> value, Key key) {
   setAttributeForKeyWithRange(std::move(value), key, {0, text().size()});
 }

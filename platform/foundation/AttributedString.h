@@ -30,6 +30,7 @@ class AttributedString : public Object {
   const Ref<String>& string() const { return string_; }
   void setString(Ref<String> string) { string_ = std::move(string); }
   std::string description() const override { return string_ ? string_->text() : ""; }
+  Ref<Object> copy() override { return make<AttributedString>(string_); }
 
  private:
   Ref<String> string_;
@@ -47,6 +48,7 @@ class AccessibilityAttributedString : public String {
   // Ranges that do not lie inside the text are cut to it; empty ones are dropped.
   void setAttributeForKeyWithRange(Ref<Object> value, Key key, TextRange range);
   const std::vector<TextAttribute>& attributes() const { return attributes_; }
+  Ref<Object> copy() override;
 
  private:
   std::vector<TextAttribute> attributes_;

@@ -12,7 +12,7 @@ namespace {
 struct SimpleUnit {
   std::string_view text;
   double factor;
-  char dimension;  // energy, time, length, mass, volume, temperature; a blank for a plain number
+  char dimension;  // energy, time, length, mass, volume; a blank for a plain number
 };
 
 constexpr std::array simpleUnits = {

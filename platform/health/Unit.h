@@ -27,6 +27,7 @@ class Unit final : public Object {
   static Ref<Unit> hourUnit() { return unitFromString("hr"); }
   static Ref<Unit> countUnit() { return unitFromString("count"); }
   static Ref<Unit> meterUnit() { return unitFromString("m"); }
+  // Nil for a prefix and unit that unitFromString does not know together.
   static Ref<Unit> literUnitWithMetricPrefix(MetricPrefix prefix);
   static Ref<Unit> gramUnitWithMetricPrefix(MetricPrefix prefix);
   static Ref<Unit> meterUnitWithMetricPrefix(MetricPrefix prefix);
