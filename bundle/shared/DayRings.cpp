@@ -50,7 +50,9 @@ Ref<String> accessibilityVeltoStringForDate(const Ref<Date>& date, bool arePerce
   if (!isProgress(moveFraction(summary))) return nullptr;
   if (!isProgress(exerciseFraction(summary))) return nullptr;
   if (!isProgress(standFraction(summary))) return nullptr;
-  return messages::_veltoUIAccessibilityDescriptionForPercentages(
-      summary, moveFraction(summary), exerciseFraction(summary), standFraction(summary),
-      arePercentagesCapped);
+  const double move = moveFraction(summary);
+  const double exercise = exerciseFraction(summary);
+  const double stand = standFraction(summary);
+  return messages::_veltoUIAccessibilityDescriptionForPercentages(summary, move, exercise, stand,
+                                                                  arePercentagesCapped);
 }

@@ -6,6 +6,8 @@
 #include "platform/foundation/Date.h"
 #include "platform/foundation/String.h"
 
+// Days and their rings. Main thread only.
+
 // The index of the day that holds a date, under which the host caches that day's activity.
 AX_EXPORT std::int64_t CHCacheIndexForDate(const ax::Ref<ax::Date>& date);
 

@@ -8,7 +8,8 @@
 // The bundle's own words. Main thread only.
 
 // The text of a key in the reader's language, the same object at every call; the empty text for a key that
-// the string table lacks, nil when the bundle's resources cannot be found.
+// the string table lacks and for every key when the resource files are missing; nil when the bundle itself is
+// not there.
 AX_EXPORT ax::Ref<ax::String> accessibilityLocalizedString(const ax::Ref<ax::String>& key);
 
 // The spoken title of an achievement; nil for an object that is none.

@@ -10,12 +10,17 @@
 
 using namespace ax;
 
+bool ax::marksMissingData(const String& text) {
+  return text.contains("--") || text.contains("\u2013\u2013");
+}
+
 namespace {
 
 const std::regex& pacePattern() {
   // The pattern reads bytes: it knows the spaces of other alphabets only when they are spelled out.
-  static const auto& pattern =
-      *new std::regex("(\\d+)'(?:\\s|\u00a0|\u2009|\u202f|\u3000)?([0-5]?[0-9])(?:''|\")");
+  static const auto& pattern = *new std::regex(
+      "(\\d+)'(?:\\s|\u00a0|\u1680|\u2000|\u2001|\u2002|\u2003|\u2004|\u2005"
+      "|\u2006|\u2007|\u2008|\u2009|\u200a|\u2028|\u2029|\u202f|\u205f|\u3000)?([0-5]?[0-9])(?:''|\")");
   return pattern;
 }
 
@@ -36,10 +41,6 @@ std::int64_t secondsOf(const std::string& minutes, const std::string& seconds) {
   const bool overflows = read.ec != std::errc() || __builtin_mul_overflow(wholeMinutes, 60, &total) ||
                          __builtin_add_overflow(total, rest, &total);
   return overflows ? std::numeric_limits<std::int64_t>::max() : total;
-}
-
-bool marksMissingData(const String& text) {
-  return text.contains("--") || text.contains("\u2013\u2013");
 }
 
 Ref<AccessibilityAttributedString> withSpokenPace(const std::smatch& pace, const NumberFormatter& formatter) {

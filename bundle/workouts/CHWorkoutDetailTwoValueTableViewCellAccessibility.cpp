@@ -1,6 +1,7 @@
 #include "bundle/core/Category.h"
 #include "bundle/shared/AXGroupedTitleValueView.h"
 #include "bundle/shared/LocalizedString.h"
+#include "bundle/shared/Pace.h"
 
 namespace ax {
 
@@ -57,9 +58,8 @@ class CHWorkoutDetailTwoValueTableViewCellAccessibility
 
   Ref<String> _axStringForValue(Ref<Object> value) {
     const Ref<String> shown = safeStringForKey(value, "string"_key);
-    const bool isMissing = shown && (shown->contains("--") || shown->contains("\u2013\u2013"));
-    return isMissing ? accessibilityLocalizedString("no.data")
-                     : messages::accessibilityUserDefinedLabel(value);
+    return shown && marksMissingData(*shown) ? accessibilityLocalizedString("no.data")
+                                             : messages::accessibilityUserDefinedLabel(value);
   }
 
   Ref<Array> _axElements() { return cast<Array>(getAssociatedObject(self, &elementsKey)); }

@@ -38,7 +38,7 @@ class PaceTest : public testing::Test {
 TEST_F(PaceTest, IsMarkedAsADurationInSeconds) {
   EXPECT_EQ(spokenPace("5'30\""), (Spoken{"330", "330"}));
   EXPECT_EQ(spokenPace("12' 05''"), (Spoken{"725", "725"}));
-  for (const std::string space : {"\t", "\u00a0", "\u2009", "\u202f", "\u3000"}) {
+  for (const std::string space : {"\t", "\u00a0", "\u1680", "\u2007", "\u200a", "\u202f", "\u3000"}) {
     EXPECT_EQ(spokenPace("5'" + space + "30\""), (Spoken{"330", "330"})) << '"' << space << '"';
   }
   EXPECT_EQ(spokenPace("0'0\""), (Spoken{"0", "0"}));
