@@ -1,6 +1,7 @@
 #include "host/charts/CHWorkoutDetailHeartRateChartTableViewCell.h"
 
 #include "host/core/HostStrings.h"
+#include "host/core/Layout.h"
 #include "platform/runtime/ClassBuilder.h"
 #include "platform/toolkit/Label.h"
 
@@ -9,12 +10,6 @@ namespace ax::host {
 namespace {
 
 const Message<void()> createAndConstraintNoDataOverlay{"_createAndConstraintNoDataOverlay"};
-
-void putInto(View& parent, const Ref<View>& part, Rect frame) {
-  if (!part) return;
-  if (part->superview() == nullptr) parent.addSubview(part);
-  if (part->frame() == Rect()) part->setFrame(frame);
-}
 
 }  // namespace
 
@@ -36,10 +31,10 @@ Class& CHWorkoutDetailHeartRateChartTableViewCell::staticClass() {
 void CHWorkoutDetailHeartRateChartTableViewCell::layoutSubviews() {
   View& content = *contentView();
   if (content.frame() == Rect()) content.setFrame(bounds());
-  putInto(content, scrollView_, content.bounds());
-  putInto(scrollView_ ? *scrollView_ : content, chartView_, content.bounds());
+  showIn(content, scrollView_, content.bounds());
+  showIn(scrollView_ ? *scrollView_ : content, chartView_, content.bounds());
   const double height = content.frame().height;
-  putInto(content, pageControl_, {0, height - 20, content.frame().width, 20});
+  showIn(content, pageControl_, {0, height - 20, content.frame().width, 20});
   if (!chartView_) return;
   chartView_->showReadings();
   const bool isShown = chartView_->hasAdequateDataForDisplay();
@@ -61,7 +56,7 @@ void CHWorkoutDetailHeartRateChartTableViewCell::_createAndConstraintNoDataOverl
     noDataOverlayView_->addSubview(title);
     noDataOverlayView_->addSubview(button);
   }
-  putInto(*contentView(), noDataOverlayView_, bounds());
+  showIn(*contentView(), noDataOverlayView_, bounds());
 }
 
 void CHWorkoutDetailHeartRateChartTableViewCell::overlayButtonTapped(Ref<Object>) {

@@ -1,6 +1,6 @@
 #include "host/charts/DayViewActivityRingsTableViewCell.h"
 
-#include "host/charts/Stacking.h"
+#include "host/core/Layout.h"
 #include "platform/runtime/ClassBuilder.h"
 
 namespace ax::host {

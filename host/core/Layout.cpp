@@ -1,5 +1,7 @@
 #include "host/core/Layout.h"
 
+#include <algorithm>
+
 #include "platform/formatting/Region.h"
 
 namespace ax::host {
@@ -12,8 +14,27 @@ void addUnplaced(View& parent, std::initializer_list<Ref<View>> parts) {
 
 void addUnplaced(View& parent, const Ref<View>& part, Rect frame) {
   if (!part || part->superview() != nullptr) return;
-  if (part->frame() == Rect()) part->setFrame(frame);
+  if (part->frame().isEmpty()) part->setFrame(frame);
   parent.addSubview(part);
+}
+
+void showIn(View& parent, const Ref<View>& part, Rect frame) {
+  if (!part) return;
+  if (part->frame().isEmpty()) part->setFrame(frame);
+  if (part->superview() == nullptr) parent.addSubview(part);
+}
+
+void stackIn(View& parent, Size size, std::initializer_list<Ref<View>> parts) {
+  const double height = size.height / static_cast<double>(std::max<std::size_t>(parts.size(), 1));
+  double top = 0;
+  for (const Ref<View>& part : parts) {
+    showIn(parent, part, {0, top, size.width, height});
+    top += height;
+  }
+}
+
+void stackIn(View& parent, std::initializer_list<Ref<View>> parts) {
+  stackIn(parent, {parent.frame().width, parent.frame().height}, parts);
 }
 
 Rect inDirection(const View& view, Rect frame) {

@@ -13,6 +13,15 @@ void addUnplaced(View& parent, std::initializer_list<Ref<View>> parts);
 // The same for one part, which gets the frame unless it has one of its own.
 void addUnplaced(View& parent, const Ref<View>& part, Rect frame);
 
+// Puts a part of a view in its place, unless it has a superview or a frame with an area of its own. Nil parts
+// are left out.
+void showIn(View& parent, const Ref<View>& part, Rect frame);
+
+// The same for several, one below the other in equal shares of a size.
+void stackIn(View& parent, Size size, std::initializer_list<Ref<View>> parts);
+// In shares of the parent's own size.
+void stackIn(View& parent, std::initializer_list<Ref<View>> parts);
+
 // A frame in a view as the language has it: it is meant for one that is written from the left, and is turned
 // around for one that is written from the right.
 Rect inDirection(const View& view, Rect frame);

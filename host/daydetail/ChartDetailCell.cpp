@@ -72,6 +72,8 @@ Class& MoveChartDetailCell::staticClass() {
 
 void MoveChartDetailCell::setActiveEnergyGoalEnergyPercent(Ref<Quantity> activeEnergy,
                                                            Ref<Quantity> goalEnergy, double percent) {
+  activeEnergy_ = activeEnergy;
+  goalEnergy_ = goalEnergy;
   const Ref<Unit> unit = VLUIUnitManager::sharedManager()->userActiveEnergyBurnedUnit();
   showFigure(amountIn(unit, activeEnergy), amountIn(unit, goalEnergy),
              unit->text() == "kJ" ? "unit.kj" : "unit.kcal", percent);
@@ -93,6 +95,8 @@ Class& ExerciseChartDetailCell::staticClass() {
 
 void ExerciseChartDetailCell::setBriskMinutesGoalPercent(Ref<Quantity> briskMinutes, Ref<Quantity> goal,
                                                          double percent) {
+  briskMinutes_ = briskMinutes;
+  goal_ = goal;
   const Ref<Unit> minutes = Unit::minuteUnit();
   showFigure(amountIn(minutes, briskMinutes), amountIn(minutes, goal), "unit.min", percent);
 }

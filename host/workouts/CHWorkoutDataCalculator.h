@@ -11,7 +11,7 @@ class CHWorkoutDataCalculator : public Object {
 
   // Seconds per kilometer or mile; 0 without a distance.
   double paceForWorkout(Ref<Workout> workout);
-  // Nil without a duration.
+  // Nil without a distance or a duration.
   Ref<Quantity> speedForWorkout(Ref<Workout> workout);
 
   // The same for any stretch.

@@ -25,7 +25,7 @@ class CHWorkoutDetailSplitTableViewCell : public CHWorkoutDetailPaceTableViewCel
   static Class& staticClass();
 
   const Ref<CHWorkoutSplit>& split() const { return split_; }
-  // Shows the split at once.
+  // Shows the split at once; nil leaves the row as it is.
   void setSplit(Ref<CHWorkoutSplit> split);
   void layoutSubviews() override;
 

@@ -33,13 +33,11 @@ void CHWorkoutSummaryTableViewCell::setWorkouts(Ref<Array> workouts) {
 
 void CHWorkoutSummaryTableViewCell::_updateUI() {
   const Ref<Workout> first = cast<Workout>(workouts_ ? workouts_->firstObject() : nullptr);
-  if (first) {
-    const WorkoutTotals totals(workouts_);
-    ensure(titleLabel_).setText(titleOf(*first));
-    showDuration(ensure(durationLabel_), totals.seconds, totals.count);
-    showFigure(ensure(distanceLabel_), "figure.distance", totals.distance);
-    showFigure(ensure(activeEnergyLabel_), "figure.active.calories", totals.energy);
-  }
+  const WorkoutTotals totals(workouts_);
+  ensure(titleLabel_).setText(first ? titleOf(*first) : nullptr);
+  showDuration(ensure(durationLabel_), totals.seconds, totals.count);
+  showFigure(ensure(distanceLabel_), "figure.distance", totals.distance);
+  showFigure(ensure(activeEnergyLabel_), "figure.active.calories", totals.energy);
   layoutSubviews();
 }
 

@@ -4,7 +4,6 @@
 
 #include "host/charts/CHWorkoutDetailHeartRateChartView.h"
 #include "host/charts/HeartRateUnits.h"
-#include "host/charts/Stacking.h"
 #include "host/charts/TrendStops.h"
 #include "host/core/Layout.h"
 #include "tests/bundle/Answers.h"
