@@ -6,13 +6,12 @@
 
 #include "reader/snapshot/Snapshot.h"
 
-// The charts of a snapshot, described. Main thread only.
+// The charts of a snapshot, described. The nodes belong to the snapshot; a chart is one that has a series.
+// Main thread only.
 namespace ax::reader {
 
 // The nodes that are charts, in reading order.
 std::vector<const Node*> charts(const Snapshot& snapshot);
-// The same in the part of the tree that begins at a node, itself included.
-std::vector<const Node*> charts(const Snapshot& snapshot, const Node& top);
 
 // The elements inside a chart, in reading order: its bars, and what it shows beside them.
 std::vector<const Node*> elementsOfChart(const Snapshot& snapshot, const Node& chart);

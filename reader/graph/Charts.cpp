@@ -4,20 +4,12 @@ namespace ax::reader {
 
 namespace {
 
-void collect(const Snapshot& snapshot, const Node& node, bool (*wanted)(const Node&),
-             std::vector<const Node*>& found) {
-  if (wanted(node)) found.push_back(&node);
-  for (const NodeId child : node.children) collect(snapshot, *snapshot.node(child), wanted, found);
+void collectElements(const Snapshot& snapshot, const Node& node, std::vector<const Node*>& found) {
+  if (node.isElement) found.push_back(&node);
+  for (const NodeId child : node.children) collectElements(snapshot, *snapshot.node(child), found);
 }
 
 }  // namespace
-
-std::vector<const Node*> charts(const Snapshot& snapshot, const Node& top) {
-  std::vector<const Node*> found;
-  collect(
-      snapshot, top, [](const Node& node) { return node.series.has_value(); }, found);
-  return found;
-}
 
 std::vector<const Node*> charts(const Snapshot& snapshot) {
   std::vector<const Node*> found;
@@ -29,10 +21,7 @@ std::vector<const Node*> charts(const Snapshot& snapshot) {
 
 std::vector<const Node*> elementsOfChart(const Snapshot& snapshot, const Node& chart) {
   std::vector<const Node*> found;
-  for (const NodeId child : chart.children) {
-    collect(
-        snapshot, *snapshot.node(child), [](const Node& node) { return node.isElement; }, found);
-  }
+  for (const NodeId child : chart.children) collectElements(snapshot, *snapshot.node(child), found);
   return found;
 }
 
