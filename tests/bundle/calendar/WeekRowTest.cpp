@@ -72,7 +72,8 @@ TEST_F(WeekRowTest, OrdersAnewWhenThingsMove) {
 
 TEST_F(WeekRowTest, MakesItsDaysItsOwnWhenItListsThem) {
   const auto layer = dayAt(now);
-  messages::setAccessibilityContainer(layer, make<View>());
+  const auto other = make<View>();
+  messages::setAccessibilityContainer(layer, other);
   week_->layer()->addSublayer(layer);
   EXPECT_EQ(labelOf(layer), "Today, Tuesday") << "no row has listed it yet";
   messages::accessibilityElements(week_);

@@ -4,6 +4,7 @@
 #include "host/charts/ActivityStandChartView.h"
 #include "platform/foundation/Value.h"
 #include "platform/runtime/ScriptedAnswers.h"
+#include "tests/bundle/Answers.h"
 #include "tests/bundle/StartedBundle.h"
 
 // What a scene cannot show of the day's charts: how often they ask the host, what a query in the middle of a
@@ -16,15 +17,6 @@ Ref<Array> points(std::size_t count, double y) {
   Array::Items items;
   for (std::size_t i = 0; i < count; ++i) items.push_back(point(static_cast<double>(i), y));
   return array(std::move(items));
-}
-
-std::string labelOf(const Ref<Object>& element) {
-  const Ref<String> label = messages::accessibilityLabel(element);
-  return label ? label->text() : "(none)";
-}
-std::string valueOf(const Ref<Object>& element) {
-  const Ref<String> value = messages::accessibilityValue(element);
-  return value ? value->text() : "(none)";
 }
 
 class DayChartTest : public testing::Test {

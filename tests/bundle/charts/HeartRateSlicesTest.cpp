@@ -6,6 +6,7 @@
 #include "host/charts/CHWorkoutDetailHeartRateChartView.h"
 #include "platform/foundation/Formatters.h"
 #include "platform/toolkit/DataSeriesMessages.h"
+#include "tests/bundle/Members.h"
 #include "tests/bundle/StartedBundle.h"
 
 // The summary of a workout's heart rate in slices, against readings counted by other means: whole seconds and
@@ -22,12 +23,6 @@ struct Reading {
   int second;  // since the start of the workout
   int tenths;  // of a beat per minute
 };
-
-void setMember(Object& object, std::string_view name, const Ref<Object>& value) {
-  const InstanceVariable* variable = object.isa().instanceVariable(Selector::intern(name));
-  ASSERT_NE(variable, nullptr) << name;
-  ASSERT_TRUE(variable->write(object, value)) << name;
-}
 
 Ref<Object> reading(double seconds, double rate) {
   static const Ref<Unit>& unit = *new Ref<Unit>(Unit::unitFromString("count/min"));

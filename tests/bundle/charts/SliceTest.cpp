@@ -5,6 +5,7 @@
 #include "host/charts/VLUIChartPointNumeric.h"
 #include "platform/runtime/ClassBuilder.h"
 #include "platform/toolkit/DataSeriesMessages.h"
+#include "tests/bundle/Members.h"
 #include "tests/bundle/StartedBundle.h"
 
 // The slices of the day's charts where a scene cannot reach: charts that are cut otherwise, and precision.
@@ -32,12 +33,6 @@ class OtherwiseCutChart : public host::ActivityActiveHoursChart {
   }
 };
 
-void setVariable(Object& object, const char* name, Ref<Object> value) {
-  const InstanceVariable* variable = object.isa().instanceVariable(Selector::intern(name));
-  ASSERT_NE(variable, nullptr);
-  ASSERT_TRUE(variable->write(object, value));
-}
-
 Ref<Object> chartPoint(Ref<Object> x, double y) {
   const auto made = make<host::VLUIChartPointNumeric>();
   made->setXValue(std::move(x));
@@ -57,9 +52,9 @@ class SliceTest : public testing::Test {
 
   void show(Object& chart, Array::Items points) {
     const auto series = make<host::VLUIChartUniformBarSeries>();
-    setVariable(*series, "_minDate", date(noon - 5000));
-    setVariable(chart, "_barSeries", series);
-    setVariable(chart, "_dataPoints", array(std::move(points)));
+    setMember(*series, "_minDate", date(noon - 5000));
+    setMember(chart, "_barSeries", series);
+    setMember(chart, "_dataPoints", array(std::move(points)));
   }
 
   const EnvironmentScope environment_{Environment{.locale = "en_US", .timeZone = "UTC", .now = noon}};
@@ -98,7 +93,7 @@ TEST_F(SliceTest, SumsInDoublePrecisionAndCountsHoursInSingle) {
   const auto energy = make<host::ActivityQuantityChart>();
   Array::Items points;
   for (int i = 0; i < 24; ++i) points.push_back(chartPoint(nullptr, i == 0 ? 16777216 : 0.5));
-  setVariable(*energy, "_dataPoints", array(std::move(points)));
+  setMember(*energy, "_dataPoints", array(std::move(points)));
   EXPECT_EQ(slice(energy, 0), "16,777,217 calories");
   EXPECT_EQ(slice(energy, 1), "2 calories");
 }

@@ -65,7 +65,7 @@ TEST_F(FriendRowTest, KeepsTheMarksOfItsLines) {
   EXPECT_EQ(label->attributes()[0].range, (TextRange{5, 3}));
 }
 
-TEST_F(FriendRowTest, LeavesTheRowAloneWhenTheHostRaises) {
+TEST_F(FriendRowTest, ShowsNobodyWhenGivenSomethingElse) {
   row_->setTextLabel(labelled("Mia"));
   load(row_);
   row_->textLabel()->setText(string("Noor"));
