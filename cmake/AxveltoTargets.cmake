@@ -17,12 +17,18 @@ add_library(axvelto-settings INTERFACE)
 target_include_directories(axvelto-settings INTERFACE ${CMAKE_SOURCE_DIR})
 target_compile_options(axvelto-settings INTERFACE -Wall -Wextra -Wpedantic -Werror -Wshadow -Wnon-virtual-dtor
                                                   -Wcast-align -Woverloaded-virtual -fno-plt)
+# The module's exported functions return handles, which C does not know and the module's callers do.
+target_compile_options(axvelto-settings INTERFACE $<$<CXX_COMPILER_ID:Clang>:-Wno-return-type-c-linkage>)
 
 set(AXVELTO_SANITIZE "" CACHE STRING "Sanitizers to build with, as -fsanitize takes them")
 if(AXVELTO_SANITIZE)
   target_compile_options(axvelto-settings INTERFACE -fsanitize=${AXVELTO_SANITIZE} -fno-omit-frame-pointer
                                                     -fno-sanitize-recover=all)
   target_link_options(axvelto-settings INTERFACE -fsanitize=${AXVELTO_SANITIZE})
+endif()
+if(AXVELTO_FUZZ)
+  # Clang compares types by address, which differ between this house's libraries.
+  target_compile_options(axvelto-settings INTERFACE -fno-sanitize=function,vptr)
 endif()
 
 # All sources below this folder, without those of folders that are targets of their own.
