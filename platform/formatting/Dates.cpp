@@ -8,7 +8,9 @@
 #include <memory>
 
 #include "platform/formatting/FormatterCache.h"
+#include "platform/formatting/FormatterZone.h"
 #include "platform/formatting/Region.h"
+#include "platform/formatting/Templates.h"
 #include "platform/formatting/Text.h"
 
 namespace ax::formatting {
@@ -22,6 +24,7 @@ struct PatternSource final : CachedFormatter {
 
 struct DateWriter final : CachedFormatter {
   std::unique_ptr<icu::DateFormat> format;
+  bool tellsTime = false;
 };
 
 struct DateReader final : CachedFormatter {
@@ -37,10 +40,6 @@ icu::Locale gregorianLocale() {
   return icu::Locale(gregorianLocaleName().c_str());
 }
 
-std::unique_ptr<icu::TimeZone> currentZone() {
-  return std::unique_ptr<icu::TimeZone>(icu::TimeZone::createTimeZone(unicode(currentRegion().timeZone)));
-}
-
 icu::UnicodeString bestPattern(std::string_view pattern, UErrorCode& status) {
   const PatternSource* source =
       formatterCache().get<PatternSource>(FormatterKind::patternGenerator, 0, {}, [&] {
@@ -51,7 +50,9 @@ icu::UnicodeString bestPattern(std::string_view pattern, UErrorCode& status) {
   if (source == nullptr) return {};
   const icu::UnicodeString skeleton =
       icu::DateTimePatternGenerator::staticGetSkeleton(unicode(pattern), status);
-  return source->generator->getBestPattern(skeleton, status);
+  std::string letters;
+  skeleton.toUTF8String(letters);
+  return source->generator->getBestPattern(unicode(spokenSkeleton(letters)), status);
 }
 
 std::unique_ptr<DateWriter> makeWriter(std::string_view pattern) {
@@ -60,19 +61,20 @@ std::unique_ptr<DateWriter> makeWriter(std::string_view pattern) {
   auto writer = std::make_unique<DateWriter>();
   writer->format = std::make_unique<icu::SimpleDateFormat>(localized, gregorianLocale(), status);
   if (U_FAILURE(status)) return nullptr;
-  writer->format->adoptTimeZone(currentZone().release());
+  writer->format->adoptTimeZone(newFormatterZone<icu::TimeZone>());
+  writer->tellsTime = tellsTime(pattern);
   return writer;
 }
 
 std::unique_ptr<DateWriter> makeStyleWriter(DateStyle style) {
-  constexpr icu::DateFormat::EStyle kStyles[] = {icu::DateFormat::kShort, icu::DateFormat::kMedium,
+  constexpr icu::DateFormat::EStyle kStyles[] = {icu::DateFormat::kShort, icu::DateFormat::kLong,
                                                  icu::DateFormat::kLong, icu::DateFormat::kFull};
   const int index = static_cast<int>(style) - 1;
   if (index < 0 || index > 3) return nullptr;
   auto writer = std::make_unique<DateWriter>();
   writer->format.reset(icu::DateFormat::createDateInstance(kStyles[index], gregorianLocale()));
   if (!writer->format) return nullptr;
-  writer->format->adoptTimeZone(currentZone().release());
+  writer->format->adoptTimeZone(newFormatterZone<icu::TimeZone>());
   return writer;
 }
 
@@ -81,7 +83,7 @@ std::unique_ptr<DateReader> makeReader(std::string_view pattern) {
   auto reader = std::make_unique<DateReader>();
   reader->format = std::make_unique<icu::SimpleDateFormat>(unicode(pattern), gregorianLocale(), status);
   reader->calendar =
-      std::make_unique<icu::GregorianCalendar>(currentZone().release(), gregorianLocale(), status);
+      std::make_unique<icu::GregorianCalendar>(newFormatterZone<icu::TimeZone>(), gregorianLocale(), status);
   if (U_FAILURE(status)) return nullptr;
   reader->format->setLenient(false);
   reader->format->set2DigitYearStart(kTwoDigitYearStart, status);
@@ -93,7 +95,8 @@ std::string written(const DateWriter* writer, double time) {
   if (writer == nullptr || !isFormattableTime(time)) return {};
   icu::UnicodeString text;
   writer->format->format(time * 1000.0, text);
-  return utf8From({text.getBuffer(), static_cast<std::size_t>(text.length())});
+  std::string date = utf8From({text.getBuffer(), static_cast<std::size_t>(text.length())});
+  return asSpoken(writer->tellsTime ? withoutLeadingZeros(std::move(date)) : std::move(date));
 }
 
 struct WeekdayNames {

@@ -13,9 +13,11 @@ namespace ax::formatting {
 enum class DateStyle { shortStyle = 1, mediumStyle = 2, longStyle = 3, fullStyle = 4 };
 
 // `pattern` names the fields and their widths, such as "EEEE", "dMMMM" or "EEEE, MMM d, yyyy"; their
-// order and what stands between them are the region's: "dMMMM" gives "September 9" in English.
+// order and what stands between them are the region's: "dMMMM" gives "September 9" in English. Names are
+// written in full and hours by the region's clock, since everything is spoken.
 std::string dateString(double time, std::string_view pattern);
 
+// All but the short style name the month in full; what the medium one would abbreviate, is spoken too.
 std::string dateStyleString(double time, DateStyle style);
 
 // Reads the whole of `text` by `pattern` as it stands ("MM" reads "3", "03" and "12"), in ASCII digits

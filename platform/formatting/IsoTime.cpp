@@ -115,12 +115,12 @@ std::optional<double> timeFromIso(std::string_view text) {
   bool exists = false;
   double local = readDate(reader, exists);
   if (!exists) return std::nullopt;
-  if (reader.atEnd()) return instantOfLocal(local, RepeatedTime::first);
+  if (reader.atEnd()) return currentZoneRanges()->instantOfLocal(local, RepeatedTime::first);
   reader.expect('T');
   local += readClock(reader);
   const std::optional<double> offset = readOffset(reader);
   if (!reader.good() || !reader.atEnd()) return std::nullopt;
-  return offset ? local - *offset : instantOfLocal(local, RepeatedTime::last);
+  return offset ? local - *offset : currentZoneRanges()->instantOfLocal(local, RepeatedTime::last);
 }
 
 std::string isoFromTime(double time) {

@@ -1,116 +1,148 @@
 #include "platform/formatting/MessagePattern.h"
 
-#include <unicode/msgfmt.h>
-
-#include <memory>
+#include <algorithm>
 #include <vector>
 
 #include "platform/formatting/FormatterCache.h"
-#include "platform/formatting/Numbers.h"
-#include "platform/formatting/Region.h"
-#include "platform/formatting/Text.h"
+#include "platform/formatting/MessageTree.h"
+#include "platform/formatting/PlatformWords.h"
 
 namespace ax::formatting {
 namespace {
 
-// A literal piece, followed by an argument unless that is -1.
-struct Piece {
-  std::string literal;
-  int argument = -1;
-};
-
-// A pattern with nothing but places such as {0} is filled in directly; `format` serves all others.
 struct CompiledMessage final : CachedFormatter {
-  std::vector<Piece> pieces;
-  std::unique_ptr<icu::MessageFormat> format;
+  std::shared_ptr<const Message> message;
 };
 
-// The number of a place whose opening brace stands before `rest`, as "0}..."; -1 when it is more.
-int plainPlace(std::string_view rest) {
-  if (rest.size() < 2 || rest[1] != '}' || rest[0] < '0' || rest[0] > '9') return -1;
-  return rest[0] - '0';
+std::shared_ptr<const Message> compiled(std::string_view pattern) {
+  const CompiledMessage* found = formatterCache().get<CompiledMessage>(
+      FormatterKind::message, 0, pattern, [&]() -> std::unique_ptr<CompiledMessage> {
+        auto made = std::make_unique<CompiledMessage>();
+        made->message = parsedMessage(pattern);
+        return made->message ? std::move(made) : nullptr;
+      });
+  return found == nullptr ? nullptr : found->message;
 }
 
-bool splitPlain(std::string_view pattern, std::vector<Piece>& pieces) {
-  if (pattern.find('\'') != std::string_view::npos) return false;
-  while (!pattern.empty()) {
-    const std::size_t brace = pattern.find_first_of("{}");
-    pieces.push_back({std::string(pattern.substr(0, brace)), -1});
-    if (brace == std::string_view::npos) return true;
-    if (pattern[brace] == '}') return false;
-    const int place = plainPlace(pattern.substr(brace + 1));
-    if (place < 0) return false;
-    pieces.back().argument = place;
-    pattern.remove_prefix(brace + 3);
+// A text has no number to agree with; it is not alone, lest a plural took it for one.
+NumberText asNumber(const MessageArgument& argument) {
+  struct Visitor {
+    NumberText operator()(const std::string& text) const { return {text, nullptr, false}; }
+    NumberText operator()(std::int64_t value) const { return integerNumber(value); }
+    NumberText operator()(double value) const { return decimalNumber(value, 3); }
+    NumberText operator()(const NumberText& number) const { return number; }
+    NumberText operator()(const CountedNoun& noun) const { return {noun.name, nullptr, false}; }
+  };
+  return std::visit(Visitor(), argument);
+}
+
+bool isText(const NumberText& number) {
+  return !number.operands && !number.isNoValue && !number.text.empty();
+}
+
+const MessageForm& formOf(const std::vector<MessageForm>& forms, PluralForm wanted) {
+  const auto found = std::ranges::find(forms, wanted, &MessageForm::form);
+  return found != forms.end() ? *found : *std::ranges::find(forms, PluralForm::other, &MessageForm::form);
+}
+
+class Filling {
+ public:
+  explicit Filling(std::span<const MessageArgument> arguments) : arguments_(arguments) {}
+
+  void add(const Message& message, const NumberText* counted = nullptr) {
+    for (const MessagePiece& piece : message) add(piece, counted);
   }
-  return true;
-}
 
-std::unique_ptr<CompiledMessage> compile(std::string_view pattern) {
-  auto message = std::make_unique<CompiledMessage>();
-  if (splitPlain(pattern, message->pieces)) return message;
-  const std::u16string wide = utf16From(pattern);
-  const icu::UnicodeString text(wide.data(), static_cast<int32_t>(wide.size()));
-  UErrorCode status = U_ZERO_ERROR;
-  UParseError where;
-  message->format =
-      std::make_unique<icu::MessageFormat>(text, icu::Locale(gregorianLocaleName().c_str()), where, status);
-  if (U_FAILURE(status) || message->format->usesNamedArguments()) return nullptr;
-  return message;
-}
-
-void append(std::string& result, const MessageArgument& argument) {
-  if (const auto* text = std::get_if<std::string>(&argument)) {
-    result += *text;
-  } else if (const auto* whole = std::get_if<std::int64_t>(&argument)) {
-    result += integerString(*whole);
-  } else {
-    result += decimalString(std::get<double>(argument), 3);
+  NumberText result() && {
+    if (noValue_.isNoValue && !hasText_) return std::move(noValue_);
+    return std::move(filled_);
   }
-}
 
-std::string filled(const std::vector<Piece>& pieces, std::span<const MessageArgument> arguments) {
-  std::string result;
-  for (const Piece& piece : pieces) {
-    result += piece.literal;
-    if (piece.argument < 0) continue;
-    if (static_cast<std::size_t>(piece.argument) < arguments.size()) {
-      append(result, arguments[piece.argument]);
-    } else {
-      result += {'{', static_cast<char>('0' + piece.argument), '}'};
+ private:
+  using Kind = MessagePiece::Kind;
+
+  void add(const MessagePiece& piece, const NumberText* counted) {
+    if (piece.kind == Kind::literal) return add(piece.text);
+    if (piece.kind == Kind::countedNumber) return counted != nullptr ? add(*counted) : add("#");
+    for (const int needed : {piece.argument, piece.unit}) {
+      if (needed >= std::ssize(arguments_))
+        return add(std::string("{").append(std::to_string(needed)).append("}"));
     }
+    const MessageArgument& argument = arguments_[piece.argument];
+    if (piece.kind == Kind::argument) return add(asNumber(argument));
+    if (piece.kind == Kind::percent) return addPercent(argument);
+    if (piece.kind == Kind::plural) return addAgreeing(piece.forms, argument);
+    addInUnit(argument, arguments_[piece.unit]);
   }
-  return result;
-}
 
-icu::Formattable formattable(const MessageArgument& argument) {
-  if (const auto* text = std::get_if<std::string>(&argument)) {
-    const std::u16string wide = utf16From(*text);
-    return icu::UnicodeString(wide.data(), static_cast<int32_t>(wide.size()));
+  void add(std::string_view text) {
+    if (text.empty()) return;
+    filled_.text += text;
+    filled_.operands = nullptr;
+    filled_.isAlone = false;
   }
-  if (const auto* whole = std::get_if<std::int64_t>(&argument)) return icu::Formattable(int64_t{*whole});
-  return icu::Formattable(std::get<double>(argument));
-}
 
-std::string formatted(const icu::MessageFormat& format, std::span<const MessageArgument> arguments) {
-  std::vector<icu::Formattable> values;
-  values.reserve(arguments.size());
-  for (const MessageArgument& argument : arguments) values.push_back(formattable(argument));
-  icu::UnicodeString text;
-  icu::FieldPosition ignored(icu::FieldPosition::DONT_CARE);
-  UErrorCode status = U_ZERO_ERROR;
-  format.format(values.data(), static_cast<int32_t>(values.size()), text, ignored, status);
-  if (U_FAILURE(status)) return {};
-  return utf8From({text.getBuffer(), static_cast<std::size_t>(text.length())});
-}
+  void add(const NumberText& number) {
+    if (number.text.empty()) return;
+    note(number);
+    filled_.isAlone = filled_.text.empty() && number.isAlone;
+    filled_.text += number.text;
+    filled_.operands = number.operands;
+  }
+
+  void note(const NumberText& number) {
+    hasText_ = hasText_ || isText(number);
+    if (number.isNoValue) noValue_ = number;
+  }
+
+  void addPercent(const MessageArgument& argument) {
+    const auto* whole = std::get_if<std::int64_t>(&argument);
+    const auto* fraction = std::get_if<double>(&argument);
+    if (whole != nullptr) return add(percentNumber(static_cast<double>(*whole)));
+    add(fraction != nullptr ? percentNumber(*fraction) : asNumber(argument));
+  }
+
+  void addAgreeing(const std::vector<MessageForm>& forms, const MessageArgument& argument) {
+    const NumberText number = asNumber(argument);
+    if (number.text.empty() || number.isNoValue) return add(number);
+    const MessageForm& form = formOf(forms, pluralForm(number));
+    if (form.writesNumber) return add(form.body, &number);
+    // What comes before the number, "2 of " or a minus, must not be lost with it.
+    if (!number.isAlone) return add(formOf(forms, PluralForm::other).body, &number);
+    if (!isNegative(number)) return add(form.body, &number);
+    Filling positive(arguments_);
+    positive.add(form.body, &number);
+    add(formatMessage(platformWord("number.negative"), {std::move(positive).result().text}));
+  }
+
+  void addInUnit(const MessageArgument& argument, const MessageArgument& unit) {
+    const CountedNoun* noun = std::get_if<CountedNoun>(&unit);
+    if (noun != nullptr && !noun->pattern.empty()) return add(filledMessage(noun->pattern, {&argument, 1}));
+    const NumberText number = asNumber(argument);
+    const std::string name = asNumber(unit).text;
+    if (name.empty() || number.text.empty() || number.isNoValue) return add(number);
+    note(number);
+    add(formatMessage(platformWord("number.unit"), {number.text, name}));
+  }
+
+  std::span<const MessageArgument> arguments_;
+  NumberText filled_;
+  NumberText noValue_;
+  bool hasText_ = false;
+};
 
 }  // namespace
 
+NumberText filledMessage(std::string_view pattern, std::span<const MessageArgument> arguments) {
+  const std::shared_ptr<const Message> message = compiled(pattern);
+  if (!message) return {};
+  Filling filling(arguments);
+  filling.add(*message);
+  return std::move(filling).result();
+}
+
 std::string formatMessage(std::string_view pattern, std::span<const MessageArgument> arguments) {
-  const CompiledMessage* message = formatterCache().get<CompiledMessage>(FormatterKind::message, 0, pattern,
-                                                                         [&] { return compile(pattern); });
-  if (message == nullptr) return {};
-  return message->format ? formatted(*message->format, arguments) : filled(message->pieces, arguments);
+  return filledMessage(pattern, arguments).text;
 }
 
 std::string formatMessage(std::string_view pattern, std::initializer_list<MessageArgument> arguments) {

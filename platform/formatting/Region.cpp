@@ -1,13 +1,12 @@
 #include "platform/formatting/Region.h"
 
 #include <unicode/locid.h>
-#include <unicode/timezone.h>
 #include <unicode/uloc.h>
 
-#include <memory>
 #include <unordered_set>
 
 #include "platform/formatting/FormatterCache.h"
+#include "platform/formatting/ZoneRules.h"
 
 namespace ax::formatting {
 namespace {
@@ -72,6 +71,13 @@ bool isRightToLeft(const std::string& locale) {
   return icu::Locale(locale.c_str()).isRightToLeft();
 }
 
+std::string likelyLocale(const std::string& language) {
+  UErrorCode status = U_ZERO_ERROR;
+  icu::Locale locale(language == "root" ? "en" : language.c_str());
+  locale.addLikelySubtags(status);
+  return U_FAILURE(status) ? language : std::string(locale.getLanguage()) + "_" + locale.getCountry();
+}
+
 bool isKnownLocale(std::string_view locale) {
   if (locale.empty() || locale.find('\0') != std::string_view::npos) return false;
   const icu::Locale parsed(std::string(locale).c_str());
@@ -79,10 +85,7 @@ bool isKnownLocale(std::string_view locale) {
 }
 
 bool isKnownTimeZone(std::string_view timeZone) {
-  if (timeZone.empty()) return false;
-  const auto id = icu::UnicodeString::fromUTF8({timeZone.data(), static_cast<int32_t>(timeZone.size())});
-  const std::unique_ptr<icu::TimeZone> zone(icu::TimeZone::createTimeZone(id));
-  return zone && *zone != icu::TimeZone::getUnknown();
+  return timeZone == currentRegion().timeZone || zoneRules(std::string(timeZone)) != nullptr;
 }
 
 }  // namespace ax::formatting

@@ -30,6 +30,9 @@ std::string currentLanguage();
 bool currentLanguageIsRightToLeft();
 bool isRightToLeft(const std::string& locale);
 
+// The locale of the region where a language is spoken most: "de_DE" for "de", "en_US" for "root".
+std::string likelyLocale(const std::string& language);
+
 // For checking input before it becomes current. A locale is known when its language is.
 bool isKnownLocale(std::string_view locale);
 bool isKnownTimeZone(std::string_view timeZone);

@@ -40,6 +40,16 @@ std::vector<std::string> sortedKeys(const auto& texts) {
 
 }  // namespace
 
+std::vector<std::string> tableLanguages(const std::string& folder) {
+  std::vector<std::string> languages;
+  std::error_code none;
+  for (const auto& file : std::filesystem::directory_iterator(folder, none)) {
+    if (file.path().extension() == ".res") languages.push_back(file.path().stem().string());
+  }
+  std::ranges::sort(languages);
+  return languages;
+}
+
 StringTable::StringTable(std::string folder) : folder_(std::move(folder)) {}
 
 const std::string* StringTable::find(std::string_view key) const {

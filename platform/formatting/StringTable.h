@@ -50,6 +50,9 @@ class StringTable {
   mutable std::uint64_t generation_ = 0;  // of the region that current_ belongs to
 };
 
+// The languages that a folder has tables of, "root" included, in order.
+std::vector<std::string> tableLanguages(const std::string& folder);
+
 // The folder at `relative` ("../share/x") from the one that holds the program or shared library in
 // which `addressInModule` lies; "" when the address is in none.
 std::string resourceFolderBeside(const void* addressInModule, std::string_view relative);

@@ -8,14 +8,14 @@
 
 namespace ax {
 
-// An ordered list of objects; it holds no nil.
+// An ordered list of objects. It holds no nil: what it is made of loses its nil items.
 class Array : public Object {
  public:
   using Items = std::vector<Ref<Object>>;
   static Class& staticClass();
 
   Array() = default;
-  explicit Array(Items items) : items_(std::move(items)) {}
+  explicit Array(Items items) : items_(std::move(items)) { std::erase(items_, nullptr); }
 
   const Items& items() const { return items_; }
   std::size_t count() const { return items_.size(); }

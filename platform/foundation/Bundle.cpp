@@ -4,6 +4,8 @@
 
 #include "platform/formatting/StringTable.h"
 #include "platform/runtime/ClassBuilder.h"
+#include "platform/runtime/MainThread.h"
+#include "platform/runtime/Precondition.h"
 
 namespace ax {
 
@@ -31,6 +33,7 @@ Ref<Bundle> Bundle::bundleForClass(const Class* owner) {
 
 Ref<String> Bundle::localizedStringForKey(std::string_view key, const Ref<String>& fallback,
                                           std::string_view table) {
+  precondition(isMainThread(), "localized texts are shared objects of the main thread: ask for them there");
   auto found = tables_.find(table);
   if (found == tables_.end()) {
     const std::string name(table);

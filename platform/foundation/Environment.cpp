@@ -3,6 +3,8 @@
 #include <atomic>
 
 #include "platform/formatting/Region.h"
+#include "platform/runtime/MainThread.h"
+#include "platform/runtime/Precondition.h"
 
 namespace ax {
 
@@ -23,6 +25,7 @@ const Environment& environment() {
 }
 
 void setEnvironment(Environment next) {
+  precondition(isMainThread(), "the environment belongs to the main thread: set it there");
   const formatting::Region region{next.locale, next.timeZone};
   if (formatting::currentRegion() != region) formatting::setCurrentRegion(region);
   screenReader = next.screenReader;

@@ -1,10 +1,15 @@
 #include "platform/foundation/Formatters.h"
 
+#include <cmath>
+
 #include "platform/formatting/DateIntervals.h"
 #include "platform/formatting/Dates.h"
 #include "platform/formatting/Durations.h"
 #include "platform/formatting/MessagePattern.h"
 #include "platform/formatting/Numbers.h"
+#include "platform/foundation/NumberString.h"
+#include "platform/foundation/PercentTexts.h"
+#include "platform/foundation/UnitName.h"
 #include "platform/runtime/ClassBuilder.h"
 
 namespace ax {
@@ -17,10 +22,7 @@ Ref<Array> strings(const std::vector<std::string>& texts) {
   return array(std::move(items));
 }
 
-formatting::MessageArgument messageArgument(const Ref<Object>& object) {
-  if (!object) return std::string();
-  const Number* number = cast<Number>(object.get());
-  if (number == nullptr) return object->description();
+formatting::MessageArgument numberArgument(const Number& number) {
   return std::visit(
       [](auto value) -> formatting::MessageArgument {
         if constexpr (std::is_floating_point_v<decltype(value)>) {
@@ -29,7 +31,26 @@ formatting::MessageArgument messageArgument(const Ref<Object>& object) {
           return static_cast<std::int64_t>(value);
         }
       },
-      number->content());
+      number.content());
+}
+
+formatting::MessageArgument messageArgument(const Ref<Object>& object) {
+  if (!object) return std::string();
+  if (const auto* number = cast<Number>(object.get())) return numberArgument(*number);
+  if (const auto* written = cast<NumberString>(object.get())) return written->number();
+  if (const Ref<String> pattern = messages::countedPattern(object)) {
+    return formatting::CountedNoun{object->description(), pattern->text()};
+  }
+  return object->description();
+}
+
+Ref<String> numberString(formatting::NumberText number) {
+  return make<NumberString>(std::move(number));
+}
+
+// The text that says a value, or no value where there is none.
+Ref<String> unlessNone(double value, std::string text) {
+  return std::isfinite(value) ? string(std::move(text)) : numberString(formatting::decimalNumber(value, 0));
 }
 
 }  // namespace
@@ -74,7 +95,8 @@ Class& NumberFormatter::staticClass() {
 }
 
 Ref<String> NumberFormatter::stringFromNumber(const Ref<Number>& number) const {
-  return number ? string(formatting::plainIntegerString(number->int64Value())) : nullptr;
+  if (!number) return nullptr;
+  return unlessNone(number->doubleValue(), formatting::plainIntegerString(number->int64Value()));
 }
 
 Ref<Number> NumberFormatter::numberFromString(const Ref<String>& text) const {
@@ -84,23 +106,30 @@ Ref<Number> NumberFormatter::numberFromString(const Ref<String>& text) const {
 }
 
 Ref<String> formatFloat(int option, float value) {
-  return string(formatting::decimalString(value, option == 0 ? 0 : 2));
+  return numberString(formatting::decimalNumber(value, option == 0 ? 0 : 2));
 }
 
 Ref<String> formatInteger(std::int64_t value) {
-  return string(formatting::integerString(value));
+  return numberString(formatting::integerNumber(value));
+}
+
+Ref<String> formatWhole(double value) {
+  return std::isfinite(value) ? formatInteger(number(value)->int64Value())
+                              : formatFloat(0, static_cast<float>(value));
 }
 
 Ref<String> formatFloatWithPercentage(float fraction, int) {
-  return string(formatting::percentString(fraction));
+  static auto& texts = *new PercentTexts;
+  return texts.text(fraction,
+                    [](double written) { return numberString(formatting::percentNumber(written)); });
 }
 
 Ref<String> durationStringForDuration(TimeInterval seconds) {
-  return string(formatting::spokenDuration(seconds));
+  return unlessNone(seconds, formatting::spokenDuration(seconds));
 }
 
 Ref<String> timeStringForType(int type, double value) {
-  return string(type == 3 ? formatting::spokenHours(value) : formatting::spokenDuration(value));
+  return unlessNone(value, type == 3 ? formatting::spokenHours(value) : formatting::spokenDuration(value));
 }
 
 Ref<String> dateStringForFormat(const Ref<Date>& date, std::string_view pattern) {
@@ -117,7 +146,8 @@ Ref<String> stringWithFormat(const Ref<String>& pattern, std::span<const Ref<Obj
   if (!pattern) return nullptr;
   std::vector<formatting::MessageArgument> filled;
   for (const Ref<Object>& argument : arguments) filled.push_back(messageArgument(argument));
-  return string(formatting::formatMessage(pattern->text(), filled));
+  formatting::NumberText text = formatting::filledMessage(pattern->text(), filled);
+  return text.operands || text.isNoValue ? numberString(std::move(text)) : string(std::move(text.text));
 }
 
 static const RegisteredClass<DateFormatter> registeredDate;

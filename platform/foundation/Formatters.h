@@ -52,9 +52,12 @@ class NumberFormatter final : public Object {
   Ref<Number> numberFromString(const Ref<String>& text) const;
 };
 
-// option 0: rounded half away from zero to a whole number; option 1: at most two decimals.
+// The next four make a NumberString; what is no number, or has no end, becomes the platform's word for no
+// value. option 0: rounded half away from zero to a whole number; option 1: at most two decimals.
 Ref<String> formatFloat(int option, float value);
 Ref<String> formatInteger(std::int64_t value);
+// Without its fraction; a figure that no integer holds is the nearest that there is.
+Ref<String> formatWhole(double value);
 // 1.0 is one hundred percent; option 0 is whole percent.
 Ref<String> formatFloatWithPercentage(float fraction, int option);
 // Hours, minutes and seconds in full words.
@@ -65,8 +68,9 @@ Ref<String> timeStringForType(int type, double value);
 Ref<String> dateStringForFormat(const Ref<Date>& date, std::string_view pattern);
 Ref<Date> dateFromStringWithFormat(const Ref<String>& text, std::string_view pattern);
 
-// A localized pattern filled with arguments: Strings go in as text, Numbers as numbers (so that they choose
-// plural forms), other objects by their text form, nil as nothing. Nil for no pattern.
+// A localized pattern filled with arguments: Numbers and what the functions above wrote choose plural forms,
+// units agree with their number, other objects go in by their text form, nil as nothing. A result that ends
+// with a number is a NumberString itself. Nil for no pattern.
 Ref<String> stringWithFormat(const Ref<String>& pattern, std::span<const Ref<Object>> arguments);
 inline Ref<String> stringWithFormat(const Ref<String>& pattern,
                                     std::initializer_list<Ref<Object>> arguments) {

@@ -46,11 +46,13 @@ std::vector<Ref<String>> componentsSeparatedByNewlines(const String& text) {
 
 Ref<String> stringByRemoving(const Ref<String>& text, std::string_view part) {
   if (!text || !text->contains(part)) return text;
-  std::string kept = text->text();
-  for (std::size_t at = kept.find(part); at != std::string::npos; at = kept.find(part, at)) {
-    kept.erase(at, part.size());
+  std::string_view rest = text->text();
+  std::string kept;
+  for (std::size_t at = rest.find(part); at != std::string_view::npos; at = rest.find(part)) {
+    kept += rest.substr(0, at);
+    rest.remove_prefix(at + part.size());
   }
-  return string(std::move(kept));
+  return string(kept.append(rest));
 }
 
 Ref<String> safeStringForKey(Receiver receiver, Key key) {

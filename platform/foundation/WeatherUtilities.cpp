@@ -25,13 +25,6 @@ Ref<String> WeatherUtilities::descriptionForWeatherWXQConditionCode(std::int64_t
   return known ? known : platformString("weather.unknown");
 }
 
-std::int64_t conditionCodeFromLegacyWeatherConditionCode(std::int64_t legacyCode) {
-  constexpr std::int64_t firstLegacyCode = 1;
-  constexpr std::int64_t conditions = 48;
-  const std::int64_t code = legacyCode - firstLegacyCode;
-  return code >= 0 && code < conditions ? code : -1;
-}
-
 static const RegisteredClass<WeatherUtilities> registered;
 
 }  // namespace ax

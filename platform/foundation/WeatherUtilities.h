@@ -15,6 +15,11 @@ class WeatherUtilities final : public Object {
 };
 
 // The library's code for one of the host's older integer codes; -1 for one that it never used.
-std::int64_t conditionCodeFromLegacyWeatherConditionCode(std::int64_t legacyCode);
+constexpr std::int64_t conditionCodeFromLegacyWeatherConditionCode(std::int64_t legacyCode) {
+  constexpr std::int64_t firstLegacyCode = 1;
+  constexpr std::int64_t conditions = 48;
+  const bool isKnown = legacyCode >= firstLegacyCode && legacyCode - firstLegacyCode < conditions;
+  return isKnown ? legacyCode - firstLegacyCode : -1;
+}
 
 }  // namespace ax
