@@ -1,12 +1,14 @@
 #pragma once
 
+#include <cstddef>
+#include <deque>
 #include <string>
-#include <vector>
 
 #include "platform/foundation/String.h"
 #include "platform/runtime/KeyReading.h"
 
-// What the bundle tells the screen reader and its developers. Main thread only.
+// What the bundle tells the screen reader and its developers. Main thread only: debug builds end the process
+// on another.
 namespace ax {
 
 enum class Notification { LayoutChangedNotification };
@@ -32,9 +34,13 @@ std::string_view notificationName(Notification notification);
 void assertion(bool condition, std::string_view message, std::string_view source, int line,
                std::string_view function);
 
-// What has been posted and reported since the last call of forgetReports(), oldest first.
-const std::vector<PostedNotification>& postedNotifications();
-const std::vector<FailedAssertion>& failedAssertions();
+// What has been posted and reported since the last call of forgetReports(), oldest first. Of each no more is
+// kept than the last `keptReports`; the counts are of all.
+inline constexpr std::size_t keptReports = 256;
+const std::deque<PostedNotification>& postedNotifications();
+const std::deque<FailedAssertion>& failedAssertions();
+std::size_t postedNotificationCount();
+std::size_t failedAssertionCount();
 void forgetReports();
 
 }  // namespace ax

@@ -23,6 +23,11 @@ std::string joined(const Codes& codes) {
   return text;
 }
 
+bool isClassThatIsGone(std::string_view typeName) {
+  const Class* type = Class::namedEvenIfHidden(typeName);
+  return type != nullptr && type->isHidden();
+}
+
 constexpr std::string_view noSuchClass = "no such class";
 constexpr std::string_view noSuchMember = "no such member";
 
@@ -40,6 +45,10 @@ std::string_view kindName(CheckKind kind) {
       return "has class method";
     case CheckKind::protocol:
       return "conforms to protocol";
+    case CheckKind::overriddenMethod:
+      return "takes override of instance method";
+    case CheckKind::overriddenClassMethod:
+      return "takes override of class method";
   }
   return "";
 }
@@ -121,9 +130,11 @@ bool ValidationManager::validateClassHasInstanceVariableWithType(std::string_vie
   const Class* checked = Class::named(className);
   const InstanceVariable* found =
       checked == nullptr ? nullptr : checked->instanceVariable(Selector::find(variable));
-  const std::string is = found != nullptr ? found->type() : std::string(checked ? noSuchMember : noSuchClass);
+  std::string is = found != nullptr ? found->type() : std::string(checked ? noSuchMember : noSuchClass);
+  if (found != nullptr && isClassThatIsGone(is)) is.insert(0, "no class ");
+  const bool passed = found != nullptr && is == type;
   return record({CheckKind::instanceVariable, "", std::string(className), std::string(variable),
-                 std::string(type), is, found != nullptr && is == type});
+                 std::string(type), std::move(is), passed});
 }
 
 bool ValidationManager::checkMethod(CheckKind kind, std::string_view className, std::string_view method,
@@ -178,7 +189,19 @@ bool ValidationManager::installCategory(std::string_view name) {
     performCategoryValidations(*category, Ref<ValidationManager>(this));
     currentCategory_.clear();
   }
-  return graftCategory(*category, *target);
+  graftCategory(*category, *target);
+  recordLeftToHost(*graftOf(*category));
+  return true;
+}
+
+void ValidationManager::recordLeftToHost(const CategoryGraft& graft) {
+  for (const LeftToHost& left : graft.leftToHost) {
+    checks_.push_back({left.isClassMethod ? CheckKind::overriddenClassMethod : CheckKind::overriddenMethod,
+                       graft.category->name(), graft.target->name(),
+                       std::string(left.override->selector.name()),
+                       joined(left.override->signature->encodings),
+                       joined(left.hostMethod->signature->encodings) + ", left to the host", false});
+  }
 }
 
 std::vector<ContractCheck> ValidationManager::failedChecks() const {

@@ -11,7 +11,19 @@
 
 namespace ax {
 
-enum class CheckKind { classExists, kindOfClass, instanceVariable, instanceMethod, classMethod, protocol };
+struct CategoryGraft;
+
+enum class CheckKind {
+  classExists,
+  kindOfClass,
+  instanceVariable,
+  instanceMethod,
+  classMethod,
+  protocol,
+  // What installation found: a category's override was left out, since the host's method is of another type.
+  overriddenMethod,
+  overriddenClassMethod
+};
 
 // One check of the host contract and what came of it.
 struct ContractCheck {
@@ -35,7 +47,9 @@ struct InstallationRequest {
 
 // Checks host contracts and installs safe categories. There is one for the process; it is used on the thread
 // that runs start-up and may be read once that is over. A check that fails is recorded and never stops
-// anything; a category whose checks failed is installed all the same, and says less.
+// anything; a category whose checks failed is installed all the same, and says less. An override that the
+// host answers with another type is left to the host and recorded as a failed check, whether checks run or
+// not.
 class ValidationManager final : public Object {
  public:
   using BoolHandler = std::function<bool(ValidationManager&)>;
@@ -83,6 +97,7 @@ class ValidationManager final : public Object {
   bool checkMethod(CheckKind kind, std::string_view className, std::string_view method,
                    FullSignature signature);
   bool installCategory(std::string_view name);
+  void recordLeftToHost(const CategoryGraft& graft);
 
   std::string targetName_;
   std::string processName_;

@@ -1,5 +1,6 @@
 #include "platform/health/Quantity.h"
 
+#include "platform/foundation/Formatters.h"
 #include "platform/runtime/ClassBuilder.h"
 
 namespace ax {
@@ -17,8 +18,8 @@ bool Quantity::isCompatibleWithUnit(const Ref<Unit>& unit) const {
 }
 
 double Quantity::doubleValueForUnit(const Ref<Unit>& unit) const {
-  if (!isCompatibleWithUnit(unit)) return 0;
-  return unit->isEqual(*unit_) ? value_ : value_ * unit_->factor() / unit->factor();
+  if (unit && unit_ && unit->hasTextOf(*unit_)) return value_;
+  return isCompatibleWithUnit(unit) ? value_ * unit_->factor() / unit->factor() : 0;
 }
 
 bool Quantity::isEqual(const Object& other) const {
@@ -28,7 +29,8 @@ bool Quantity::isEqual(const Object& other) const {
 }
 
 std::string Quantity::description() const {
-  return std::to_string(value_) + (unit_ ? " " + unit_->text() : "");
+  return stringWithFormat(string("{0, unit, 1}"), {formatFloat(1, static_cast<float>(value_)), unit_})
+      ->text();
 }
 
 static const RegisteredClass<Quantity> registered;

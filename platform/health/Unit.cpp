@@ -1,6 +1,8 @@
 #include "platform/health/Unit.h"
 
 #include <array>
+#include <mutex>
+#include <set>
 
 #include "platform/foundation/Bundle.h"
 #include "platform/runtime/ClassBuilder.h"
@@ -12,7 +14,7 @@ namespace {
 struct SimpleUnit {
   std::string_view text;
   double factor;
-  char dimension;  // energy, time, length, mass, volume; a blank for a plain number
+  char dimension;  // energy, time, length, mass, volume, power; a blank for a plain number
 };
 
 constexpr std::array simpleUnits = {
@@ -22,6 +24,8 @@ constexpr std::array simpleUnits = {
     SimpleUnit{"ft", 0.3048, 'L'}, SimpleUnit{"yd", 0.9144, 'L'},     SimpleUnit{"g", 0.001, 'M'},
     SimpleUnit{"kg", 1, 'M'},      SimpleUnit{"lb", 0.45359237, 'M'}, SimpleUnit{"ml", 0.001, 'V'},
     SimpleUnit{"L", 1, 'V'},       SimpleUnit{"count", 1, ' '},       SimpleUnit{"%", 0.01, ' '},
+    SimpleUnit{"W", 1, 'P'},       SimpleUnit{"rev", 1, ' '},         SimpleUnit{"step", 1, ' '},
+    SimpleUnit{"stroke", 1, ' '},
 };
 
 std::string_view prefixText(MetricPrefix prefix) {
@@ -51,6 +55,7 @@ Ref<Unit> simpleUnit(std::string_view text) {
 Class& Unit::staticClass() {
   static Class& result = ClassBuilder<Unit>("Unit", Object::staticClass())
                              .method<&Unit::unitString>("unitString")
+                             .method<&Unit::countedPattern>("countedPattern")
                              .classMethod<&Unit::minuteUnit>("minuteUnit")
                              .build();
   return result;
@@ -65,6 +70,13 @@ Ref<Unit> Unit::unitFromString(std::string_view text) {
     unit = divisor ? unit->unitDividedByUnit(*divisor) : nullptr;
   }
   return unit;
+}
+
+const std::string& Unit::sharedText(std::string text) {
+  static auto& mutex = *new std::mutex;
+  static auto& texts = *new std::set<std::string>;
+  const std::lock_guard lock(mutex);
+  return *texts.insert(std::move(text)).first;
 }
 
 Ref<Unit> Unit::literUnitWithMetricPrefix(MetricPrefix prefix) {
@@ -82,17 +94,26 @@ Ref<Unit> Unit::unitDividedByUnit(const Unit& divisor) const {
   for (const auto& [quantity, power] : divisor.dimension_) {
     if ((dimension[quantity] -= power) == 0) dimension.erase(quantity);
   }
-  return make<Unit>(unitString_ + "/" + divisor.unitString_, factor_ / divisor.factor_, std::move(dimension));
+  return make<Unit>(text() + "/" + divisor.text(), factor_ / divisor.factor_, std::move(dimension));
 }
 
 bool Unit::isEqual(const Object& other) const {
   const Unit* unit = cast<Unit>(const_cast<Object*>(&other));
-  return unit != nullptr && unit->unitString_ == unitString_;
+  return unit != nullptr && unit->hasTextOf(*this);
+}
+
+Ref<UnitName> Unit::spokenName() const {
+  return make<UnitName>(description(), countedPattern());
+}
+
+Ref<String> Unit::countedPattern() const {
+  return platformString("quantity." + text());
 }
 
 std::string Unit::description() const {
-  const Ref<String> spoken = platformString("unit." + unitString_);
-  return spoken ? spoken->text() : unitString_;
+  if (text() == "count") return "";
+  const Ref<String> spoken = platformString("unit." + text());
+  return spoken ? spoken->text() : text();
 }
 
 static const RegisteredClass<Unit> registered;

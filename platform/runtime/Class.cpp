@@ -6,6 +6,7 @@
 #include <mutex>
 
 #include "platform/runtime/ClassBuilder.h"
+#include "platform/runtime/Precondition.h"
 
 namespace ax {
 
@@ -43,12 +44,14 @@ Class::Class(std::string name, Class* superclass, Ref<Object> (*factory)())
 
 Class& Class::add(std::string name, Class* superclass, Ref<Object> (*factory)()) {
   const std::lock_guard lock(runtimeMutex());
+  precondition(!classesByName().contains(name), "a class of this name is registered: choose another name");
   auto* added = new Class(name, superclass, factory);
   auto* meta = new Class(name, superclass == nullptr ? added : superclass->metaclass_, nullptr);
   meta->isMetaclass_ = true;
   added->metaclass_ = meta;
   added->isa_ = meta;
   meta->isa_ = meta;
+  Selector::intern(name).record()->namedClass.store(added, std::memory_order_release);
   classesByName().emplace(std::move(name), added);
   return *added;
 }
@@ -57,11 +60,6 @@ Class* Class::namedEvenIfHidden(std::string_view name) {
   const std::lock_guard lock(runtimeMutex());
   const auto found = classesByName().find(name);
   return found == classesByName().end() ? nullptr : found->second;
-}
-
-Class* Class::named(std::string_view name) {
-  Class* found = namedEvenIfHidden(name);
-  return found == nullptr || found->isHidden_ ? nullptr : found;
 }
 
 std::vector<Class*> Class::all() {
@@ -143,16 +141,30 @@ void Class::forEachOwnInstanceVariable(const std::function<void(const InstanceVa
 }
 
 const Method& Class::addMethod(Method method) {
+  const Method* const added = &keepMethod(method);
+  publishMethods({&added, 1});
+  return *added;
+}
+
+const Method& Class::keepMethod(Method method) {
   const std::lock_guard lock(runtimeMutex());
   method.owner = this;
-  const Method& added = ownedMethods_.emplace_back(method);
-  methods_.insert(&added);
+  return ownedMethods_.emplace_back(method);
+}
+
+void Class::publishMethods(std::span<const Method* const> kept) {
+  const std::lock_guard lock(runtimeMutex());
+  for (const Method* method : kept) {
+    precondition(method->owner == this, "an entry is published by the class that keeps it");
+    methods_.insert(method);
+  }
   forgetCaches();
-  return added;
 }
 
 void Class::addInstanceVariable(InstanceVariable variable) {
   const std::lock_guard lock(runtimeMutex());
+  precondition(variables_.find(variable.selector) == nullptr,
+               "the class has an instance variable of this name: register it once");
   variables_.insert(&ownedVariables_.emplace_back(variable));
   forgetCaches();
 }
@@ -172,6 +184,7 @@ void Class::forgetCaches() {
 void Class::hide() {
   const std::lock_guard lock(runtimeMutex());
   isHidden_ = true;
+  Selector::intern(name_).record()->namedClass.store(nullptr, std::memory_order_release);
 }
 
 bool Class::hideMember(std::string_view name) {

@@ -1,7 +1,9 @@
 #pragma once
 
+#include <atomic>
 #include <deque>
 #include <functional>
+#include <span>
 #include <string>
 #include <vector>
 
@@ -29,6 +31,8 @@ struct KeyReader {
   std::ptrdiff_t objectOffset = -1;
   const InstanceVariable* variable = nullptr;
   const Method* method = nullptr;
+
+  bool isReadable() const { return variable != nullptr || method != nullptr; }
 };
 
 // A class of the process, known by its name. Class objects live as long as the process. A class is itself an
@@ -41,8 +45,12 @@ class Class final : public Object {
  public:
   static Class& staticClass();
 
-  // The class registered under a name, or nil; hidden classes are not found by name.
-  static Class* named(std::string_view name);
+  // The class registered under a name, or nil; hidden classes are not found by name. A name that is written
+  // in the code is handed over as its selector, which is found once: named("MonthWeekView"_key).
+  static Class* named(Selector name) {
+    return name ? name.record()->namedClass.load(std::memory_order_acquire) : nullptr;
+  }
+  static Class* named(std::string_view name) { return named(Selector::find(name)); }
   static Class* namedEvenIfHidden(std::string_view name);
   static std::vector<Class*> all();
 
@@ -61,9 +69,18 @@ class Class final : public Object {
   Ref<Object> instantiate() const { return factory_ == nullptr ? nullptr : factory_(); }
 
   // The entry that answers a message; one without a function when the class lacks it. Never fails.
-  const Method& lookUp(Selector selector) const {
-    const Method& method = firstMethods_.find(selector);
-    return method.selector == selector ? method : lookUpSlowly(selector);
+  const Method& lookUp(Selector selector) const { return lookUp(selector, placeOf(selector)); }
+  // The same for a sender that keeps the selector's place.
+  const Method& lookUp(Selector selector, std::size_t place) const {
+    const Method& method = firstMethods_.at(place);
+    if (method.selector == selector) [[likely]]
+      return method;
+    return lookUpSlowly(selector);
+  }
+  static std::size_t placeOf(Selector selector) { return FirstMethods::placeOf(selector); }
+  // Whether it is known that this entry answers its message: false also before the first look-up.
+  bool isKnownToAnswerWith(const Method& method) const {
+    return &firstMethods_.find(method.selector) == &method;
   }
   // What the superclass answers at this moment.
   const Method& lookUpInSuperclass(Selector selector) const {
@@ -84,6 +101,11 @@ class Class final : public Object {
   // Puts an entry into the method table, in place of a former one with its selector. The caller's `owner` is
   // overwritten. Returns the entry as it stands.
   const Method& addMethod(Method method);
+  // The same in two steps, for entries that refer to one another: kept entries answer nothing until they are
+  // published, all of them before any is found.
+  const Method& keepMethod(Method method);
+  void publishMethods(std::span<const Method* const> kept);
+  // The name must be new to the class.
   void addInstanceVariable(InstanceVariable variable);
   void addProtocol(std::string name) { protocols_.push_back(std::move(name)); }
   // Takes a class or a member out of everything that works by name, as if the host had renamed it. Objects
@@ -92,9 +114,15 @@ class Class final : public Object {
   bool hideMember(std::string_view name);
   bool hasHiddenMember(Selector selector) const;  // here or in a class above
 
+  // What this class, as a category, brought to its target; null until all of it answers.
+  const CategoryGraft* graft() const { return graft_.load(std::memory_order_acquire); }
+  void setGraft(const CategoryGraft& graft) { graft_.store(&graft, std::memory_order_release); }
+
   std::string description() const override { return name_; }
 
  private:
+  using FirstMethods = FirstTable<Method, 32>;
+
   Class(std::string name, Class* superclass, Ref<Object> (*factory)());
   const Method& lookUpSlowly(Selector selector) const;
   const Method& findMethod(Selector selector) const;
@@ -116,10 +144,11 @@ class Class final : public Object {
   SelectorTable<InstanceVariable> hiddenVariables_;
   SelectorTable<Method> hiddenMethods_;
   std::vector<std::string> protocols_;
-  mutable FirstTable<Method, 32> firstMethods_;
+  mutable FirstMethods firstMethods_;
   mutable FirstTable<KeyReader, 32> firstReaders_;
   mutable SelectorTable<Method> methodCache_;
   mutable SelectorTable<KeyReader> keyCache_;
+  std::atomic<const CategoryGraft*> graft_ = nullptr;
   std::deque<Method> ownedMethods_;
   std::deque<InstanceVariable> ownedVariables_;
   mutable std::deque<KeyReader> ownedReaders_;
@@ -131,7 +160,10 @@ inline Class* cast<Class>(Object* object) {
   return object != nullptr && object->isa().isMetaclass() ? static_cast<Class*>(object) : nullptr;
 }
 
-// The class registered under a name, or nil.
+// The class registered under a name, or nil. A literal finds its name once: safeClassFromString("View"_key).
+inline Class* safeClassFromString(Selector name) {
+  return Class::named(name);
+}
 inline Class* safeClassFromString(std::string_view name) {
   return Class::named(name);
 }

@@ -77,7 +77,9 @@ std::ptrdiff_t offsetIn(T Owner::*) {
 template <auto Member, class Owner, class T>
 requires std::is_base_of_v<Object, Owner> && std::is_base_of_v<Object, T> std::ptrdiff_t offsetIn(
     Ref<T> Owner::*) {
-  static_assert(sizeof(Ref<T>) == sizeof(std::uintptr_t));
+  static_assert(sizeof(Ref<T>) == sizeof(std::uintptr_t), "the handle is nothing but an address");
+  static_assert(sizeof(Ref<T> Owner::*) == sizeof(std::ptrdiff_t),
+                "in the Itanium C++ ABI a pointer to a data member is the member's offset");
   const auto atSameAddress = []<class U>(U* object) {
     return static_cast<void*>(static_cast<Object*>(object)) == static_cast<void*>(object);
   };

@@ -16,12 +16,12 @@ template <class Record, std::size_t Size>
 class FirstTable {
  public:
   // A record of the selector, or one of another.
-  const Record& find(Selector selector) const {
-    return *places_[selector.hash() % Size].load(std::memory_order_acquire);
-  }
+  const Record& find(Selector selector) const { return at(placeOf(selector)); }
+  const Record& at(std::size_t place) const { return *places_[place].load(std::memory_order_acquire); }
+  static std::size_t placeOf(Selector selector) { return selector.hash() % Size; }
 
   void remember(const Record& record) {
-    std::atomic<const Record*>& place = places_[record.selector.hash() % Size];
+    std::atomic<const Record*>& place = places_[placeOf(record.selector)];
     if (place.load(std::memory_order_relaxed) == &none) place.store(&record, std::memory_order_release);
   }
 

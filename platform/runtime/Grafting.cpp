@@ -2,7 +2,7 @@
 
 #include <algorithm>
 #include <array>
-#include <map>
+#include <deque>
 
 namespace ax {
 
@@ -15,18 +15,27 @@ bool describesCategory(Selector selector) {
   return std::find(anatomy.begin(), anatomy.end(), selector) != anatomy.end();
 }
 
-void graftTable(const Class& from, Class& onto, CategoryGraft& graft) {
+// Keeps the entries that one table of the target is to answer.
+std::vector<const Method*> keepEntries(const Class& from, Class& onto, CategoryGraft& graft) {
+  std::vector<const Method*> kept;
   from.forEachOwnMethod([&](const Method& method) {
     if (describesCategory(method.selector)) return;
-    Method grafted = method;
-    grafted.former = onto.ownMethod(method.selector);
-    grafted.graft = &graft;
-    graft.methods.push_back(&onto.addMethod(grafted));
+    const Method& answering = onto.lookUp(method.selector);
+    if (answering.function != nullptr && answering.signature != method.signature) {
+      graft.leftToHost.push_back({&method, &answering, onto.isMetaclass()});
+      return;
+    }
+    Method entry = method;
+    entry.former = onto.ownMethod(method.selector);
+    entry.graft = &graft;
+    kept.push_back(&onto.keepMethod(entry));
   });
+  graft.methods.insert(graft.methods.end(), kept.begin(), kept.end());
+  return kept;
 }
 
-std::map<const Class*, CategoryGraft>& grafts() {
-  static auto* const all = new std::map<const Class*, CategoryGraft>;
+std::deque<CategoryGraft>& grafts() {
+  static auto* const all = new std::deque<CategoryGraft>;
   return *all;
 }
 
@@ -37,21 +46,23 @@ const Method& replacedBy(const Method& grafted) {
 }  // namespace
 
 bool graftCategory(Class& category, Class& target) {
-  const auto [place, isNew] = grafts().try_emplace(&category);
-  if (!isNew) return false;
-  CategoryGraft& graft = place->second;
+  if (category.graft() != nullptr) return false;
+  CategoryGraft& graft = grafts().emplace_back();
   graft.category = &category;
   graft.target = &target;
   graft.entry.owner = &target;
   graft.entry.graft = &graft;
-  graftTable(category, target, graft);
-  graftTable(category.metaclass(), target.metaclass(), graft);
+  const std::vector<const Method*> methods = keepEntries(category, target, graft);
+  const std::vector<const Method*> classMethods =
+      keepEntries(category.metaclass(), target.metaclass(), graft);
+  target.publishMethods(methods);
+  target.metaclass().publishMethods(classMethods);
+  category.setGraft(graft);
   return true;
 }
 
 const CategoryGraft* graftOf(const Class& category) {
-  const auto found = grafts().find(&category);
-  return found == grafts().end() ? nullptr : &found->second;
+  return category.graft();
 }
 
 const Method& superMethod(const Method& current, Selector selector) {

@@ -7,18 +7,29 @@
 
 namespace ax {
 
-// What one category put onto its target's tables. Alive as long as the process.
+// An override that was not grafted, since the target answers its selector with a method of another type.
+struct LeftToHost {
+  const Method* override;
+  const Method* hostMethod;
+  bool isClassMethod;
+};
+
+// What one category put onto its target's tables. Complete before the first of its entries answers; then it
+// never changes, and lives as long as the process.
 struct CategoryGraft {
   const Class* category = nullptr;
   const Class* target = nullptr;
   Method entry = {};  // stands for the category as a whole where no method of its was called
   std::vector<const Method*> methods = {};  // the entries as they stand in the target
+  std::vector<LeftToHost> leftToHost = {};
 };
 
 // Puts every method of the category's own tables, class methods included, into the target's: from then on
 // the target's instances answer them, and a call to super inside one reaches what stood there before, or
-// what the target's superclass answers at that moment. The methods by which a category describes itself stay
-// behind. A category is grafted once: false when it has been before.
+// what the target's superclass answers at that moment. Other threads may send messages meanwhile. The methods
+// by which a category describes itself stay behind, and so does a method whose selector the target, or a
+// class above it, answers with a method of another type: the host's senders know that type alone. A category
+// is grafted once: false when it has been before.
 bool graftCategory(Class& category, Class& target);
 
 // The graft of a category; null when it was never grafted.

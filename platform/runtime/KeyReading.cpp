@@ -12,6 +12,13 @@ namespace ax {
 
 namespace {
 
+// The member of a path's piece: the one of the very name, else the one with an underscore before it.
+Key keyInPath(const Object& object, std::string_view name) {
+  const Key exact = Selector::find(name);
+  if (name.empty() || (exact && object.isa().readerForKey(exact).isReadable())) return exact;
+  return Selector::find(std::string("_").append(name));
+}
+
 Ref<Object> readGuarded(const Object& object, const KeyReader& reader) {
   try {
     if (reader.variable != nullptr) return reader.variable->read(object);
@@ -26,7 +33,7 @@ Ref<Object> readGuarded(const Object& object, const KeyReader& reader) {
 
 Ref<Object> Object::safeValueForKey(Key key) const {
   if (!key) return nullptr;
-  const KeyReader& reader = isa_->readerForKey(key);
+  const KeyReader& reader = isa().readerForKey(key);
   if (reader.objectOffset < 0) return readGuarded(*this, reader);
   Object* value;
   std::memcpy(&value, reinterpret_cast<const char*>(this) + reader.objectOffset, sizeof(std::uintptr_t));
@@ -37,7 +44,7 @@ Ref<Object> Object::safeValueForKeyPath(std::string_view dottedKeys) const {
   Ref<Object> value(const_cast<Object*>(this));
   while (value) {
     const std::size_t dot = dottedKeys.find('.');
-    value = value->safeValueForKey(dottedKeys.substr(0, dot));
+    value = value->safeValueForKey(keyInPath(*value, dottedKeys.substr(0, dot)));
     if (dot == std::string_view::npos) break;
     dottedKeys.remove_prefix(dot + 1);
   }
@@ -50,8 +57,17 @@ bool Object::safeBoolForKey(Key key) const {
 std::int64_t Object::safeIntForKey(Key key) const {
   return unboxInt(safeValueForKey(key));
 }
+// A method that answers a double is asked for it without a number in between.
 double Object::safeDoubleForKey(Key key) const {
-  return unboxDouble(safeValueForKey(key));
+  const Method* method = key ? isa().readerForKey(key).method : nullptr;
+  if (method == nullptr || method->signature != &signatureOf<double>())
+    return unboxDouble(safeValueForKey(key));
+  try {
+    return reinterpret_cast<double (*)(Object&, const Method&)>(method->function)(const_cast<Object&>(*this),
+                                                                                  *method);
+  } catch (...) {
+    return 0;
+  }
 }
 
 Ref<Object> safeValueForKey(Receiver receiver, Key key) {
@@ -64,7 +80,7 @@ std::int64_t safeIntForKey(Receiver receiver, Key key) {
   return unboxInt(safeValueForKey(receiver, key));
 }
 double safeDoubleForKey(Receiver receiver, Key key) {
-  return unboxDouble(safeValueForKey(receiver, key));
+  return receiver.get() == nullptr ? 0 : receiver.get()->safeDoubleForKey(key);
 }
 
 namespace {
@@ -91,11 +107,11 @@ std::size_t castMismatches() {
   return mismatches;
 }
 
-Ref<Object> safeClass(std::string_view className, Ref<Object> object, bool* mismatch, SourcePlace place) {
+Ref<Object> safeClass(Selector className, Ref<Object> object, bool* mismatch, SourcePlace place) {
   const bool isMismatch = object && !object->isKindOf(Class::named(className));
   if (mismatch != nullptr) *mismatch = isMismatch;
   if (!isMismatch) return object;
-  reportCastMismatch(*object, className, place);
+  reportCastMismatch(*object, className.name(), place);
   return nullptr;
 }
 

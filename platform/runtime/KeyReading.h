@@ -2,6 +2,7 @@
 
 #include "platform/runtime/Class.h"
 #include "platform/runtime/Message.h"
+#include "platform/runtime/SourcePlace.h"
 
 // The guarded reads. A key names an instance variable or a method without arguments, exactly; scalars come
 // boxed. What is missing, unreadable, or raises while it is read, is nil, NO or 0: a read never fails, and
@@ -22,22 +23,13 @@ Ref<Array> safeArrayForKey(Receiver receiver, Key key);
 Ref<String> safeStringForKey(Receiver receiver, Key key);
 Ref<View> safeUIViewForKey(Receiver receiver, Key key);
 
-// Where in the code something was asked.
-struct SourcePlace {
-  const char* file;
-  unsigned line;
-  static constexpr SourcePlace current(const char* file = __builtin_FILE(),
-                                       unsigned line = __builtin_LINE()) {
-    return {file, line};
-  }
-};
-
 // Casts whose mismatch means that the host broke its contract: nil, reported through the flag, and in debug
 // builds once per place to standard error.
 void reportCastMismatch(const Object& object, std::string_view expected, SourcePlace place);
 std::size_t castMismatches();  // in this process so far
 
-Ref<Object> safeClass(std::string_view className, Ref<Object> object, bool* mismatch = nullptr,
+// The class is one of a name that is written in the code: safeClass("VLUIChartView"_key, object).
+Ref<Object> safeClass(Selector className, Ref<Object> object, bool* mismatch = nullptr,
                       SourcePlace place = SourcePlace::current());
 
 template <class T, class U>

@@ -35,7 +35,8 @@ class Message<R(A...)> {
   explicit Message(std::string_view name)
       : selector_(Selector::intern(name)),
         signature_(&signatureOf<R, A...>()),
-        result_(identityOf<std::remove_cvref_t<R>>()) {}
+        result_(identityOf<std::remove_cvref_t<R>>()),
+        place_(Class::placeOf(selector_)) {}
 
   Selector selector() const { return selector_; }
   const Signature& signature() const { return *signature_; }
@@ -43,19 +44,21 @@ class Message<R(A...)> {
   R operator()(Receiver receiver, A... arguments) const {
     Object* object = receiver.get();
     if (object == nullptr) return R();
-    return call(*object, object->isa().lookUp(selector_), std::move(arguments)...);
+    return call(*object, object->isa().lookUp(selector_, place_), std::move(arguments)...);
   }
 
   // Calls one entry directly, as a call to super does. An entry without a function has no signature either.
   R call(Object& object, const Method& method, A... arguments) const {
-    if (method.signature != signature_) return R();
+    if (method.signature != signature_) [[unlikely]]
+      return R();
     using Function = CanonicalType<R> (*)(Object&, const Method&, CanonicalType<A>...);
     const auto function = reinterpret_cast<Function>(method.function);
     if constexpr (std::is_same_v<R, CanonicalType<R>>) {
       return function(object, method, std::move(arguments)...);
     } else {
       Ref<Object> result = function(object, method, std::move(arguments)...);
-      if (method.result != result_) return cast<typename R::Target>(std::move(result));
+      if (method.result != result_) [[unlikely]]
+        return cast<typename R::Target>(std::move(result));
       return R::adopt(static_cast<typename R::Target*>(result.leak()));
     }
   }
@@ -64,6 +67,7 @@ class Message<R(A...)> {
   Selector selector_;
   const Signature* signature_;
   const void* result_;  // methods that return the same C++ type are believed
+  std::size_t place_;   // the selector's, in the classes' tables
 };
 
 // Whether an object's class answers the message with the message's own type.

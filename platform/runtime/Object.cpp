@@ -8,8 +8,6 @@ namespace ax {
 namespace {
 
 const char weakLinkKey = 0;
-// Handles that a destructor makes of its own object come and go without ending it once more.
-constexpr std::uint32_t ending = 1u << 31;
 
 }  // namespace
 
@@ -19,20 +17,30 @@ Class& Object::staticClass() {
 }
 
 Object::~Object() {
-  for (Attachment* a = attachments_; a != nullptr;) {
-    Attachment* next = a->next;
-    const Ref<Object> released = Ref<Object>::adopt(a->value);
-    delete a;
-    a = next;
+  if (attachments_ != nullptr) {
+    // Destructors attached these; whoever asks the object now finds no more of it than this.
+    isa_ = &classOf<Object>();
+    endAttachments();
+  }
+  precondition(count_ == ending || count_ <= 1,
+               "an object ended before a handle to it: its destructor must leave none behind");
+}
+
+// Each is gone from the list before it ends, since its destructor may look here.
+void Object::endAttachments() {
+  while (attachments_ != nullptr) {
+    Attachment* const first = std::exchange(attachments_, attachments_->next);
+    const Ref<Object> released = Ref<Object>::adopt(first->value);
+    delete first;
   }
 }
 
 bool Object::isKindOf(const Class& other) const {
-  return isa_->isSubclassOf(other);
+  return isa().isSubclassOf(other);
 }
 
 std::string Object::description() const {
-  return "<" + isa_->name() + ">";
+  return "<" + isa().name() + ">";
 }
 
 void Object::attach(const void* key, Ref<Object> value) {
@@ -52,11 +60,12 @@ void Object::attach(const void* key, Ref<Object> value) {
   delete former;
 }
 
-void Object::end() const {
-  if (const Object* link = attached(&weakLinkKey)) {
-    const_cast<WeakLink*>(static_cast<const WeakLink*>(link))->target = nullptr;
-  }
+void Object::end() {
   count_ = ending;
+  if (attachments_ != nullptr) {
+    if (Object* link = attached(&weakLinkKey)) static_cast<WeakLink*>(link)->target = nullptr;
+    endAttachments();
+  }
   delete this;
 }
 
@@ -66,6 +75,7 @@ Class& WeakLink::staticClass() {
 }
 
 Ref<WeakLink> WeakLink::to(Object& target) {
+  if (target.isEnding()) return nullptr;
   if (Object* link = target.attached(&weakLinkKey)) return Ref<WeakLink>(static_cast<WeakLink*>(link));
   Ref<WeakLink> link = make<WeakLink>();
   link->target = &target;

@@ -4,6 +4,7 @@
 #include <cstdint>
 #include <string>
 
+#include "platform/runtime/Precondition.h"
 #include "platform/runtime/Ref.h"
 #include "platform/runtime/Selector.h"
 
@@ -31,7 +32,14 @@ class Object {
 
   static Class& staticClass();
 
-  const Class& isa() const { return *isa_; }
+  const Class& isa() const {
+    if (checksPreconditions && isa_ == nullptr) [[unlikely]] {
+      preconditionFailed(
+          "an object has its class once make<T>() returns: send nothing to it from its constructor",
+          SourcePlace::current());
+    }
+    return *isa_;
+  }
   bool isKindOf(const Class& other) const;
   // False for nil: nothing is kind of a class that does not exist.
   bool isKindOf(const Class* other) const { return other != nullptr && isKindOf(*other); }
@@ -69,9 +77,14 @@ class Object {
   Ref<Object> attachedValue(const void* key) const { return Ref<Object>(attached(key)); }
   void attach(const void* key, Ref<Object> value);
 
+  // Whether its last handle is gone. What is attached to it ends first, while the object itself is whole and
+  // answers; then its destructors run. Handles may be made meanwhile and must be gone when it is over; weak
+  // ones are nil.
+  bool isEnding() const { return count_ >= ending; }
+
   void retain() const { ++count_; }
   void release() const {
-    if (--count_ == 0) end();
+    if (--count_ == 0) const_cast<Object*>(this)->end();
   }
 
  private:
@@ -79,7 +92,11 @@ class Object {
   template <class T, class... Arguments>
   friend Ref<T> make(Arguments&&... arguments);
 
-  void end() const;
+  // Handles made of an object that ends come and go without ending it once more.
+  static constexpr std::uint32_t ending = 1u << 31;
+
+  void end();
+  void endAttachments();
 
   const Class* isa_ = nullptr;
   Attachment* attachments_ = nullptr;

@@ -12,6 +12,9 @@ template <class Record>
 class PointerSlots {
  public:
   using Slot = std::atomic<Record*>;
+  static_assert(Slot::is_always_lock_free, "finding a name takes no lock");
+  static_assert(sizeof(Slot) == sizeof(Record*) && alignof(Slot) <= alignof(std::size_t),
+                "the slots stand right behind their mask");
   struct Delete {
     void operator()(PointerSlots* slots) const { ::operator delete(slots); }
   };

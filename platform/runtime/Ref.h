@@ -4,6 +4,8 @@
 #include <type_traits>
 #include <utility>
 
+#include "platform/runtime/Precondition.h"
+
 namespace ax {
 
 // A strong handle to an Object, or nil. Copying it keeps the object alive; the count is not atomic, so a
@@ -43,8 +45,13 @@ class Ref {
   [[nodiscard]] T* leak() { return std::exchange(object_, nullptr); }
 
   T* get() const { return object_; }
-  T* operator->() const { return object_; }
-  T& operator*() const { return *object_; }
+  T* operator->() const { return &**this; }
+  T& operator*() const {
+    if (checksPreconditions && object_ == nullptr) [[unlikely]]
+      preconditionFailed("the handle is nil: test it, or send a message, which nil answers too",
+                         SourcePlace::current());
+    return *object_;
+  }
   explicit operator bool() const { return object_ != nullptr; }
 
   // Identity, not equality of content.

@@ -52,6 +52,10 @@ bool setScriptedAnswer(Object& object, Selector selector, ScriptedAnswer answer)
   return true;
 }
 
+void removeScriptedAnswers(Object& object) {
+  object.attach(&answersKey, nullptr);
+}
+
 std::pair<bool, Ref<Object>> scriptedAnswer(Object& receiver, const Method& method,
                                             std::span<const Ref<Object>> arguments) {
   const auto* answers = static_cast<const Answers*>(receiver.attached(&answersKey));

@@ -15,4 +15,7 @@ using ScriptedAnswer = std::function<Ref<Object>(std::span<const Ref<Object>>)>;
 // its line declares the method.
 bool setScriptedAnswer(Object& object, Selector selector, ScriptedAnswer answer);
 
+// The object answers by itself again, and what its replies held is let go.
+void removeScriptedAnswers(Object& object);
+
 }  // namespace ax

@@ -1,11 +1,13 @@
 #pragma once
 
+#include <atomic>
 #include <cstddef>
 #include <cstdint>
 #include <string_view>
 
 namespace ax {
 
+class Class;
 struct Method;
 
 // The one record of an interned name. Records stand in an arena, 64 bytes apart, and live as long as the
@@ -14,9 +16,12 @@ struct alignas(64) SelectorRecord {
   std::string_view name;
   std::uint64_t textHash;
   const Method* missing;  // what a class answers that lacks this message
+  // The class that is found by this name: null until there is one, and once it is hidden.
+  mutable std::atomic<Class*> namedClass = nullptr;
 };
+static_assert(sizeof(SelectorRecord) == 64, "Selector::hash() counts the records");
 
-// An interned name: of a method ("layoutSubviews"), a member ("_titleLabel") or a stored value. Two
+// An interned name: of a method ("layoutSubviews"), a member ("_titleLabel"), a stored value or a class. Two
 // selectors are equal exactly when their names are; comparing them compares pointers. Interning and finding
 // may be done on any thread.
 class Selector {

@@ -4,6 +4,7 @@
 #include <vector>
 
 #include "platform/runtime/PointerSlots.h"
+#include "platform/runtime/Precondition.h"
 #include "platform/runtime/Selector.h"
 
 namespace ax {
@@ -25,6 +26,7 @@ class SelectorTable {
 
   // Adds the record, or puts it in the place of the one with its selector.
   void insert(const Record* record) {
+    precondition(bool(record->selector), "a record stands under a name: intern it first");
     if (generations_.empty() || (count_ + 1) * 2 > generations_.back()->mask + 1) grow();
     Slots& slots = *generations_.back();
     std::atomic<const Record*>& slot = slotFor(slots, record->selector);

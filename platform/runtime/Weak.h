@@ -8,6 +8,7 @@ namespace ax {
 class WeakLink final : public Object {
  public:
   static Class& staticClass();
+  // Nil for an object that ends.
   static Ref<WeakLink> to(Object& target);
 
   Object* target = nullptr;  // nil once the object has ended

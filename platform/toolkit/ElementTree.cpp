@@ -1,18 +1,21 @@
 #include "platform/toolkit/ElementTree.h"
 
 #include <algorithm>
+#include <utility>
 
 #include "platform/formatting/Region.h"
+#include "platform/toolkit/TreeDepth.h"
 #include "platform/toolkit/View.h"
 
 namespace ax {
 
 namespace {
 
-void collectSubviews(View& view, const ElementTest& test, Array::Items& found) {
+void collectSubviews(View& view, const ElementTest& test, Array::Items& found, std::size_t level) {
   for (const Ref<View>& subview : view.subviews()) {
+    if (!isWithinDepth(level)) return;
     if (test(*subview)) found.push_back(subview);
-    collectSubviews(*subview, test, found);
+    collectSubviews(*subview, test, found, level + 1);
   }
 }
 
@@ -20,6 +23,7 @@ void collectSubviews(View& view, const ElementTest& test, Array::Items& found) {
 struct Path {
   Object& object;
   const Path* above;
+  std::size_t level = 0;
 
   bool holds(const Object& other) const {
     return &object == &other || (above != nullptr && above->holds(other));
@@ -29,7 +33,9 @@ struct Path {
 void visitBelow(const Path& path, const ElementTest& visit) {
   const Ref<Array> listed = messages::accessibilityElements(path.object);
   for (const Ref<Object>& child : listed ? listed->items() : drawnChildren(path.object)) {
-    if (!path.holds(*child) && visit(*child)) visitBelow({*child, &path}, visit);
+    if (path.holds(*child)) continue;
+    if (!isWithinDepth(path.level)) return;
+    if (visit(*child)) visitBelow({*child, &path, path.level + 1}, visit);
   }
 }
 
@@ -64,6 +70,7 @@ Ref<Object> _accessibilityFindAncestor(Receiver receiver, const ElementTest& tes
   if (!startWithSelf) object = messages::accessibilityContainer(object);
   Ref<Object> milestone = object;
   for (std::size_t steps = 0, lap = 1; object && !test(*object); ++steps) {
+    if (!isWithinDepth(steps)) return nullptr;
     if (steps == lap) {
       milestone = object;
       lap += steps + 1;
@@ -81,7 +88,7 @@ Ref<Object> _accessibilityAncestorIsKindOf(Receiver receiver, const Class* ances
 
 Ref<Array> _accessibilityFindSubviewDescendantsPassingTest(Receiver receiver, const ElementTest& test) {
   Array::Items found;
-  if (View* view = cast<View>(receiver.get())) collectSubviews(*view, test, found);
+  if (View* view = cast<View>(receiver.get())) collectSubviews(*view, test, found, 0);
   return array(std::move(found));
 }
 
@@ -122,9 +129,12 @@ std::vector<Ref<Object>> drawnChildren(Object& parent) {
 Rect frameForElements(const Ref<Array>& elements) {
   Rect all;
   if (!elements) return all;
-  for (std::size_t i = 0; i < elements->count(); ++i) {
-    const Rect frame = messages::accessibilityFrame(elements->at(i));
-    all = i == 0 ? frame : all.unionWith(frame);
+  bool isFirst = true;
+  for (const Ref<Object>& element : *elements) {
+    const PartQuestion question(messages::accessibilityFrame.selector(), element);
+    if (!question.mayBePut()) continue;
+    const Rect frame = messages::accessibilityFrame(element);
+    all = std::exchange(isFirst, false) ? frame : all.unionWith(frame);
   }
   return all;
 }

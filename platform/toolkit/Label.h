@@ -16,7 +16,11 @@ class Label : public View {
   const Ref<AttributedString>& attributedText() const { return attributedText_; }
   void setAttributedText(Ref<AttributedString> text);
   // Straight to the text where nothing was set: most of what a screen reader asks is plain labels.
-  Ref<String> accessibilityLabel() { return isPlain() ? text_ : Responder::accessibilityLabel(); }
+  Ref<String> accessibilityLabel() {
+    if (!isPlain()) [[unlikely]]
+      return richLabel();
+    return text_;
+  }
   Traits accessibilityTraits() {
     return hasAttachments() ? Responder::accessibilityTraits() : Label::defaultTraits();
   }
@@ -27,6 +31,8 @@ class Label : public View {
   Traits defaultTraits() final { return TraitStaticText; }
 
  private:
+  // Apart, so that plain labels pay nothing for it.
+  [[gnu::cold, gnu::noinline]] Ref<String> richLabel() { return Responder::accessibilityLabel(); }
   bool isPlain() const { return !hasAttachments() && !attributedText_ && text_ && speaksItself(*text_); }
 
   Ref<String> text_;

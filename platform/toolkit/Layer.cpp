@@ -46,9 +46,11 @@ void Layer::removeFromSuperlayer() {
 }
 
 Rect Layer::screenRect(Rect own) const {
-  if (owner_ != nullptr) return owner_->screenRect(own);
-  const Rect outer = own.movedBy({frame_.x, frame_.y});
-  return superlayer_ == nullptr ? outer : superlayer_->screenRect(outer);
+  for (const Layer* layer = this; layer != nullptr; layer = layer->superlayer_) {
+    if (layer->owner_ != nullptr) return layer->owner_->screenRect(own);
+    own = own.movedBy({layer->frame_.x, layer->frame_.y});
+  }
+  return own;
 }
 
 Rect Layer::defaultFrame() {

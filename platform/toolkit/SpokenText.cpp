@@ -3,7 +3,6 @@
 #include <algorithm>
 
 #include "platform/formatting/Lists.h"
-#include "platform/toolkit/AccessibilityMessages.h"
 #include "platform/toolkit/ElementTree.h"
 
 namespace ax {
@@ -48,14 +47,8 @@ class Composition {
 // Labels are composed of labels. What is being asked for its own adds nothing to it, or parts that hold one
 // another would never come to an end.
 Ref<String> labelOf(const Ref<Object>& element) {
-  thread_local std::vector<const Object*> asked;
-  if (std::find(asked.begin(), asked.end(), element.get()) != asked.end()) return nullptr;
-  struct Asking {
-    explicit Asking(const Object* object) { asked.push_back(object); }
-    ~Asking() { asked.pop_back(); }
-  };
-  const Asking asking(element.get());
-  return messages::accessibilityLabel(element);
+  const PartQuestion question(messages::accessibilityLabel.selector(), element);
+  return question.mayBePut() ? messages::accessibilityLabel(element) : nullptr;
 }
 
 Ref<String> spokenForm(const Ref<Object>& element) {
@@ -74,18 +67,19 @@ struct SubhierarchyText {
     return exclusions && std::find(exclusions->begin(), exclusions->end(), object) != exclusions->end();
   }
 
-  void addBelow(Object& parent) {
+  void addBelow(Object& parent, std::size_t level) {
     for (const Ref<Object>& child : drawnChildren(parent)) {
-      if (_accessibilityViewIsVisible(child) && !isExcluded(child)) add(child);
+      if (!isWithinDepth(level)) return;
+      if (_accessibilityViewIsVisible(child) && !isExcluded(child)) add(child, level);
     }
   }
 
-  void add(const Ref<Object>& child) {
+  void add(const Ref<Object>& child, std::size_t level) {
     const bool isHeader = (messages::accessibilityTraits(child) & TraitHeader) != 0;
     const bool isFocusable = !isHeader && messages::isAccessibilityElement(child);
     if ((isHeader && !headers) || (isFocusable && !focusableItems)) return;
     const Ref<String> label = labelOf(child);
-    if (isEmpty(label)) return addBelow(*child);
+    if (isEmpty(label)) return addBelow(*child, level + 1);
     composition.add(label);
   }
 };
@@ -140,7 +134,7 @@ Ref<String> _accessibilityStringForLabelKeyValues(Receiver receiver, std::string
 Ref<String> _accessibilityTextForSubhierarchyIncludingHeadersFocusableItemsExclusions(
     Receiver receiver, bool headers, bool focusableItems, const Ref<Array>& exclusions) {
   SubhierarchyText text{headers, focusableItems, exclusions, {}};
-  if (receiver.get() != nullptr) text.addBelow(*receiver.get());
+  if (receiver.get() != nullptr) text.addBelow(*receiver.get(), 0);
   return text.composition.result();
 }
 

@@ -3,6 +3,8 @@
 #include "platform/foundation/Array.h"
 #include "platform/foundation/AttributedString.h"
 #include "platform/runtime/KeyReading.h"
+#include "platform/toolkit/AccessibilityMessages.h"
+#include "platform/toolkit/TreeDepth.h"
 
 // Composing what is spoken. Parts are joined with the language's list separator; nil and empty ones drop out
 // with theirs. When a part is an AccessibilityAttributedString, so is the result, and every part keeps its
@@ -14,6 +16,11 @@ extern const Ref<String>& stringForVariablesSentinel;
 
 // The parts up to the sentinel, which must be the last.
 Ref<String> stringForVariables(std::initializer_list<Ref<String>> parts);
+
+// The label of a part of an object, for a label of the object's own.
+inline Ref<String> labelOfPart(Receiver whole, Receiver part) {
+  return answerOfPart(messages::accessibilityLabel, whole, part);
+}
 
 // The labels of the elements. A String among them speaks its accessibility label, or else itself.
 Ref<String> labelForElements(const Ref<Array>& elements);

@@ -40,11 +40,15 @@ class View : public Responder {
   const Layer* layerIfAny() const { return uncommon_ ? uncommon_->layer.get() : nullptr; }
 
   virtual void layoutSubviews() {}
+  // Whether the view and its parts change sides in a language that is written from the right.
+  virtual bool changesSides() const { return true; }
 
   Rect screenRect(Rect own) const final;
   // Straight to the default where nothing was set: this is asked of every view there is.
   Rect accessibilityFrame() {
-    return hasAttachments() ? Responder::accessibilityFrame() : View::defaultFrame();
+    if (hasAttachments()) [[unlikely]]
+      return Responder::accessibilityFrame();
+    return View::defaultFrame();
   }
 
  protected:

@@ -1,0 +1,47 @@
+#pragma once
+
+#include <cstddef>
+
+#include "platform/runtime/Message.h"
+
+// How far a host's objects are followed into one another. A host may answer with the object that it was asked
+// for, or make a new one at each question, and then there would be no end.
+namespace ax {
+
+inline constexpr std::size_t deepestLevel = 256;
+
+// Counts something that is left out because it lies too deep; false. Any thread.
+bool leaveOutTooDeep();
+// Whether a level, counted from 0, is still followed; one that is not is counted.
+inline bool isWithinDepth(std::size_t level) {
+  return level < deepestLevel || leaveOutTooDeep();
+}
+// How often something lay deeper, in this process so far.
+std::size_t timesTooDeep();
+
+// Stands while one object is asked for something that may be made of what others answer to the same message.
+// A question that is being asked already, or in too many others, is not to be put once more. Main thread
+// only.
+class PartQuestion {
+ public:
+  PartQuestion(Selector message, Receiver asked);
+  PartQuestion(const PartQuestion&) = delete;
+  PartQuestion& operator=(const PartQuestion&) = delete;
+  ~PartQuestion();
+
+  bool mayBePut() const { return mayBePut_; }
+
+ private:
+  bool mayBePut_;
+};
+
+// What a part of `whole` answers, for an answer of the whole's own to the same message; nil, NO or 0 when the
+// part is the whole itself, or is being asked already.
+template <class R>
+R answerOfPart(const Message<R()>& message, Receiver whole, Receiver part) {
+  const PartQuestion beingAsked(message.selector(), whole);
+  const PartQuestion question(message.selector(), part);
+  return question.mayBePut() ? message(part) : R();
+}
+
+}  // namespace ax
