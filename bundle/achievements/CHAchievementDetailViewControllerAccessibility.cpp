@@ -42,7 +42,7 @@ class CHAchievementDetailViewControllerAccessibility
     const Ref<String> title = achievementTitle();
     if (!isEmpty(title)) annotateBadgeContainer(title);
     const Ref<Label> label = castAsClass<Label>(self.safeValueForKey("label"_key));
-    const Ref<String> text = label ? label->text() : nullptr;
+    const Ref<String> text = messages::text(label);
     if (!isEmpty(text)) messages::setAccessibilityLabel(label, labelForLines(*text));
   }
 

@@ -21,13 +21,14 @@ class CHAchievementsCellContentViewAccessibility
 
   Ref<String> accessibilityLabel() {
     const Ref<Label> label = castAsClass<Label>(self.safeValueForKey("_label"_key));
-    const Ref<String> text = label ? label->text() : nullptr;
+    const Ref<String> text = messages::text(label);
     return isEmpty(text) ? super(messages::accessibilityLabel) : labelForLines(*text);
   }
 
   Ref<String> accessibilityValue() {
     const Ref<Object> badge = self.safeValueForKey("_badgeView"_key);
-    const Ref<String> value = messages::accessibilityValue(safeValueForKey(badge, "image"_key));
+    const Ref<String> value =
+        answerOfPart(messages::accessibilityValue, self, safeValueForKey(badge, "image"_key));
     return isEmpty(value) ? super(messages::accessibilityValue) : value;
   }
 

@@ -18,9 +18,7 @@ class ActivityThreeRingCellAccessibility : public SafeCategory<ActivityThreeRing
   }
 
   bool isAccessibilityElement() { return true; }
-  Ref<String> accessibilityLabel() {
-    return messages::accessibilityLabel(self.safeValueForKey("_dateLabel"_key));
-  }
+  Ref<String> accessibilityLabel() { return labelOfPart(self, self.safeValueForKey("_dateLabel"_key)); }
   Ref<String> accessibilityValue() {
     const Ref<Date> date = castAsClass<Date>(self.safeValueForKey("_date"_key));
     const Ref<String> rings = accessibilityVeltoStringForDate(date, false);

@@ -34,7 +34,7 @@ class MonthDayCellLayerAccessibility : public SafeCategory<MonthDayCellLayerAcce
 
   Ref<String> accessibilityLabel() {
     const Ref<Object> container = messages::accessibilityContainer(self);
-    const bool isInWeekRow = container && container->isKindOf(safeClassFromString("MonthWeekView"));
+    const bool isInWeekRow = container && container->isKindOf(safeClassFromString("MonthWeekView"_key));
     const bool isToday = self.safeBoolForKey("representsToday"_key);
     return stringForVariables({isToday ? accessibilityLocalizedString("today") : nullptr,
                                dateStringForFormat(date(), isInWeekRow ? "dMMMM" : "EEEE"),
@@ -54,7 +54,7 @@ class MonthDayCellLayerAccessibility : public SafeCategory<MonthDayCellLayerAcce
   Rect accessibilityFrame() {
     const Ref<Layer> layer = castAsClass<Layer>(self);
     if (!layer) return super(messages::accessibilityFrame);
-    const Rect drawn = layer->frame();
+    const Rect drawn = messages::frame(layer);
     const Rect area{drawn.x - besideDay, drawn.y, drawn.width + 2 * besideDay, drawn.height + belowDay};
     return convertFrameToScreenCoordinates(area, _accessibilityAncestorIsKindOf(self, &View::staticClass()));
   }

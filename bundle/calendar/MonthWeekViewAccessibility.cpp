@@ -35,9 +35,10 @@ class MonthWeekViewAccessibility : public SafeCategory<MonthWeekViewAccessibilit
   Array::Items takeDays() {
     Array::Items days;
     const Ref<View> row = castAsClass<View>(self);
-    if (!row || row->layerIfAny() == nullptr) return days;
-    const Class* dayClass = safeClassFromString("MonthDayCellLayer");
-    for (const Ref<Layer>& layer : row->layerIfAny()->sublayers()) {
+    const Ref<Array> layers = messages::sublayers(messages::layer(row));
+    if (!layers) return days;
+    const Class* dayClass = safeClassFromString("MonthDayCellLayer"_key);
+    for (const Ref<Object>& layer : *layers) {
       if (!layer->isKindOf(dayClass)) continue;
       messages::setAccessibilityContainer(layer, row);
       days.push_back(layer);
@@ -47,7 +48,7 @@ class MonthWeekViewAccessibility : public SafeCategory<MonthWeekViewAccessibilit
 
   bool isTopBorderVisible() {
     const Ref<Layer> border = castAsClass<Layer>(self.safeValueForKey("_topBorderLineOnDrag"_key));
-    return border && border->opacity() > 0;
+    return messages::opacity(border) > 0;
   }
 
   // The label under a key when there is something to say; nil, and no stop, when there is not.

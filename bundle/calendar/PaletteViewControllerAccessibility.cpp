@@ -26,7 +26,7 @@ class PaletteViewControllerAccessibility : public SafeCategory<PaletteViewContro
     const Ref<ViewController> controller = castAsClass<ViewController>(self);
     if (!controller) return;
     messages::setAccessibilityElements(
-        controller->view(),
+        messages::view(controller),
         axArrayByIgnoringNilElementsWithCount(1, {self.safeValueForKey("_paletteView"_key)}));
   }
 };

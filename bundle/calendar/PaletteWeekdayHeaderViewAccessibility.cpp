@@ -65,7 +65,7 @@ class PaletteWeekdayHeaderViewAccessibility : public SafeCategory<PaletteWeekday
   Ref<Object> _accessibilityHitTest(Point point, Ref<Object>) {
     const Ref<View> header = castAsClass<View>(self);
     const Ref<Array> elements = messages::accessibilityElements(self);
-    return header && elements ? elements->at(sliceAt(point.x, header->bounds().width)) : nullptr;
+    return header && elements ? elements->at(sliceAt(point.x, messages::bounds(header).width)) : nullptr;
   }
 
  private:
@@ -87,10 +87,11 @@ class PaletteWeekdayHeaderViewAccessibility : public SafeCategory<PaletteWeekday
   void widen(View& label) {
     const Ref<View> header = castAsClass<View>(self);
     if (!header) return;
-    const double width = header->bounds().width / daysOfWeek;
-    const double height = header->bounds().height;
+    const Rect bounds = messages::bounds(header);
+    const double width = bounds.width / daysOfWeek;
+    const double height = bounds.height;
     if (!(width > 0 && height > 0)) return;
-    const Rect seventh{label.center().x - width * 0.5, label.frame().y, width, height};
+    const Rect seventh{messages::center(label).x - width * 0.5, messages::frame(label).y, width, height};
     messages::setAccessibilityFrame(label, convertFrameToScreenCoordinates(seventh, header));
   }
 };

@@ -18,9 +18,9 @@ class VeltoMonthTitleLabelAccessibility : public SafeCategory<VeltoMonthTitleLab
   Traits accessibilityTraits() { return super(messages::accessibilityTraits) | TraitHeader; }
 
   Ref<String> accessibilityLabel() {
-    const Ref<Label> title = castAsClass<Label>(self);
-    if (!title || isEmpty(title->text())) return super(messages::accessibilityLabel);
-    return dateStringForFormat(dateFromStringWithFormat(title->text(), "MM"), "MMMM");
+    const Ref<String> month = messages::text(castAsClass<Label>(self));
+    if (isEmpty(month)) return super(messages::accessibilityLabel);
+    return dateStringForFormat(dateFromStringWithFormat(month, "MM"), "MMMM");
   }
 };
 

@@ -19,8 +19,7 @@ Ref<String> calories(float sum) {
   return stringWithFormat(accessibilityLocalizedString("calories.format"), {formatFloat(0, sum)});
 }
 Ref<String> wholeMinutes(float sum) {
-  return stringWithFormat(accessibilityLocalizedString("minutes.format"),
-                          {number(number(sum)->int64Value())});
+  return stringWithFormat(accessibilityLocalizedString("minutes.format"), {formatWhole(sum)});
 }
 Ref<String> nothing(float) {
   return nullptr;
@@ -107,8 +106,9 @@ class ActivityMoveAndExerciseChartViewAccessibility
     const Ref<View> view = castAsClass<View>(self);
     const Ref<Array> points = messages::_accessibilityGraphData(self);
     if (!view || !points) return;
-    const double width = std::floor(view->frame().width * 0.125);
-    const double height = std::floor(view->frame().height);
+    const Rect area = messages::frame(view);
+    const double width = std::floor(area.width * 0.125);
+    const double height = std::floor(area.height);
     for (std::size_t i = 0; i < spanCount; ++i) {
       const Ref<String> value = kind().value(sumOfSpan(*points, i));
       const Rect frame = {width * static_cast<double>(i), 0, width, height};

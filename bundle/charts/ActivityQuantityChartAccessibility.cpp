@@ -32,13 +32,13 @@ class ActivityQuantityChartAccessibility : public SafeCategory<ActivityQuantityC
   }
 
   Ref<String> _accessibilityQuantityForSliceAtIndex(std::uint64_t index) {
-    const std::int64_t quantity = number(std::round(sumOfSlice(index)))->int64Value();
+    const double quantity = std::round(sumOfSlice(index));
     const Ref<Object> unit = self.safeValueForKey("_preferredUnit"_key);
     if (unit && unit->isEqual(*Unit::minuteUnit())) {
-      return durationStringForDuration(static_cast<double>(quantity) * 60);
+      return durationStringForDuration(quantity * 60);
     }
     const std::string_view format = quantity == 0 ? "calories.format.zero" : "calories.format";
-    return stringWithFormat(accessibilityLocalizedString(format), {formatInteger(quantity)});
+    return stringWithFormat(accessibilityLocalizedString(format), {formatWhole(quantity)});
   }
 
  private:

@@ -64,8 +64,9 @@ class ActivityStandChartViewAccessibility : public GraphDataChart<ActivityStandC
     DaySpans hours(hour, "ha");
     const Ref<View> view = castAsClass<View>(self);
     if (!view || count == 0) return;
-    const double height = std::floor(view->frame().height);
-    const double width = std::ceil(view->frame().width / static_cast<double>(count));
+    const Rect area = messages::frame(view);
+    const double height = std::floor(area.height);
+    const double width = std::ceil(area.width / static_cast<double>(count));
     for (std::size_t i = 0; i < count; ++i) {
       const Ref<String> value = valueOf(points->at(i));
       const Rect frame = {width * static_cast<double>(i), 0, width, height};

@@ -28,7 +28,8 @@ class CHNoHeartRateDataViewControllerAccessibility
     _accessibilityAddTrait(self.safeValueForKey("titleLabel"_key), TraitHeader);
     messages::setIsAccessibilityElement(self.safeValueForKey("linkLabel"_key), false);
     _setAccessibilityLabelBlock(self.safeValueForKey("linkButton"_key), [controller = Weak<Object>(self)] {
-      return messages::accessibilityLabel(safeValueForKey(controller.lock(), "linkLabel"_key));
+      const Ref<Object> screen = controller.lock();
+      return labelOfPart(safeValueForKey(screen, "linkButton"_key), safeValueForKey(screen, "linkLabel"_key));
     });
   }
 };

@@ -11,8 +11,9 @@ const Message<void()> createAndConstraintNoDataOverlay{"_createAndConstraintNoDa
 // Nil when none of the view's direct subviews is one, or there is no view.
 template <class T>
 Ref<T> firstSubview(const Ref<View>& view) {
-  if (!view) return nullptr;
-  for (const Ref<View>& subview : view->subviews()) {
+  const Ref<Array> subviews = messages::subviews(view);
+  if (!subviews) return nullptr;
+  for (const Ref<Object>& subview : *subviews) {
     if (T* found = cast<T>(subview.get())) return Ref<T>(found);
   }
   return nullptr;
@@ -46,7 +47,7 @@ class CHWorkoutDetailHeartRateChartTableViewCellAccessibility
     const Ref<View> overlay = safeUIViewForKey(self, "_noDataOverlayView"_key);
     if (!overlay) return;
     const Weak<View> weak = overlay;
-    _setIsAccessibilityElementBlock(overlay, [weak] { return weak && !weak.get()->isHidden(); });
+    _setIsAccessibilityElementBlock(overlay, [weak] { return weak && !messages::isHidden(weak.lock()); });
     _setAccessibilityLabelBlock(overlay, [weak] { return labelOfOverlay(weak.lock()); });
     _setAccessibilityActivateBlock(
         overlay, [weak] { return messages::accessibilityActivate(firstSubview<Button>(weak.lock())); });

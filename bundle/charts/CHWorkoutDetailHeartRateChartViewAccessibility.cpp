@@ -87,7 +87,7 @@ class CHWorkoutDetailHeartRateChartViewAccessibility
     if (!points || (axis != 0 && axis != 1)) return array({});
     values.reserve(points->count());
     for (const Ref<Object>& item : *points) {
-      const Ref<Object> point = safeClass("VLUIChartPointMultiple", item);
+      const Ref<Object> point = safeClass("VLUIChartPointMultiple"_key, item);
       const auto hour = [&] {
         return decimalForDate(self, cast<Date>(safeValueForKey(point, "xValue"_key)));
       };
@@ -130,9 +130,8 @@ class CHWorkoutDetailHeartRateChartViewAccessibility
     if (!workout || index >= messages::_accessibilityNumberOfSlices(self)) return nullptr;
     const TimeInterval length = messages::_accessibilityTimeIntervalPerSlice(self);
     const auto slice = static_cast<double>(index);
-    const Date& start = *workout->startDate();
-    return spokenRange(ratesIn(*make<DateInterval>(start.dateByAddingTimeInterval(length * slice),
-                                                   start.dateByAddingTimeInterval(length * (slice + 1)))));
+    const double start = workout->startDate()->timeIntervalSince1970();
+    return spokenRange(ratesBetween(start + length * slice, start + length * (slice + 1)));
   }
 
   Ref<DateInterval> _axDateInterval() {
@@ -148,21 +147,29 @@ class CHWorkoutDetailHeartRateChartViewAccessibility
 
  private:
   Ref<Number> endOfRange(Key key) {
-    const Ref<Object> chart = safeClass("VLUIChartView", self.safeValueForKey("_chartView"_key));
+    const Ref<Object> chart = safeClass("VLUIChartView"_key, self.safeValueForKey("_chartView"_key));
     return cast<Number>(safeValueForKey(chart, key));
   }
 
-  // Of the whole heart rates in a stretch of time.
-  Extremes ratesIn(const DateInterval& interval) {
+  // Of the whole heart rates in a stretch of time, both ends included.
+  Extremes ratesBetween(double start, double end) {
     Extremes range;
     const Ref<Array> readings = safeArrayForKey(self, "_heartRateReadings"_key);
     if (!readings) return range;
+    const Class& readingClass = HeartRateSummaryReading::staticClass();
     for (const Ref<Object>& item : *readings) {
-      const Ref<HeartRateSummaryReading> reading = castAsClass<HeartRateSummaryReading>(item);
-      if (!reading || !reading->date() || !interval.containsDate(*reading->date())) continue;
-      range.include(std::round(safeDoubleForKey(reading->quantity(), "ch_beatsPerMinute"_key)));
+      if (&item->isa() != &readingClass && !castAsClass<HeartRateSummaryReading>(item)) continue;
+      const auto& reading = static_cast<const HeartRateSummaryReading&>(*item);
+      if (!reading.date()) continue;
+      const double time = reading.date()->timeIntervalSince1970();
+      if (start <= time && time <= end) range.include(rateOf(reading));
     }
     return range;
+  }
+
+  static double rateOf(const HeartRateSummaryReading& reading) {
+    const Ref<Quantity>& rate = reading.quantity();
+    return rate ? std::round(rate->safeDoubleForKey("ch_beatsPerMinute"_key)) : 0;
   }
 };
 

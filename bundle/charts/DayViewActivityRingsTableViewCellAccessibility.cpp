@@ -13,7 +13,7 @@ class DayViewActivityRingsTableViewCellAccessibility
   static void _accessibilityPerformValidations(Manager& manager) { manager.validateClass("ARUIRingsView"); }
 
   Ref<Array> accessibilityElements() {
-    const Class* ringsClass = safeClassFromString("ARUIRingsView");
+    const Class* ringsClass = safeClassFromString("ARUIRingsView"_key);
     return _accessibilityFindSubviewDescendantsPassingTest(
         self, [ringsClass](Object& view) { return view.isKindOf(ringsClass); });
   }

@@ -15,7 +15,7 @@ void refreshGraphData(Object& chart, const GraphSource& source) {
 
 Ref<AccessibilityElement> chartElement(Object& chart, Rect frame, Ref<String> label, Ref<String> value) {
   Ref<AccessibilityElement> element = AccessibilityElement::initWithAccessibilityContainer(chart);
-  element->setAccessibilityFrameInContainerSpace(frame);
+  messages::setAccessibilityFrameInContainerSpace(element, frame);
   messages::setAccessibilityLabel(element, std::move(label));
   messages::setAccessibilityValue(element, std::move(value));
   return element;

@@ -21,12 +21,11 @@ Ref<Unit> trendUnit(Object& chart) {
 }
 
 Ref<String> trendUnitString(Object& chart) {
-  const Ref<Unit> unit = trendUnit(chart);
-  return unit ? unit->unitString() : nullptr;
+  return messages::unitString(trendUnit(chart));
 }
 
 double figureInUnit(const Ref<Quantity>& quantity, const Ref<Unit>& unit) {
-  return quantity ? quantity->doubleValueForUnit(unit) : 0;
+  return messages::doubleValueForUnit(quantity, unit);
 }
 
 Ref<String> spokenFigure(double value, const Ref<Unit>& unit) {

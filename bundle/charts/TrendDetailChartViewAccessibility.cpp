@@ -44,7 +44,7 @@ class TrendDetailChartViewAccessibility : public TrendChart<TrendDetailChartView
     if (axis == 0) return accessibilityLocalizedString("trend.time.axis");
     if (axis != 1) return nullptr;
     const Ref<Label> top = castAsClass<Label>(safeUIViewForKey(self, "chartMaxLabel"_key));
-    return top ? top->text() : trendUnitString(self);
+    return top ? messages::text(top) : trendUnitString(self);
   }
 
   Ref<String> _accessibilityDataSeriesUnitLabelForAxis(std::int64_t axis) {
@@ -83,7 +83,7 @@ class TrendDetailChartViewAccessibility : public TrendChart<TrendDetailChartView
       const Ref<View> title = safeUIViewForKey(self, "titleLabel"_key);
       _accessibilityAddTrait(title, TraitHeader);
       elements.axSafelyAddObject(title);
-      addBars(elements, title ? title->frame().height : 0);
+      addBars(elements, messages::frame(title).height);
     });
   }
 
@@ -115,8 +115,9 @@ class TrendDetailChartViewAccessibility : public TrendChart<TrendDetailChartView
     const Ref<Array> stops = messages::_accessibilityGraphData(self);
     if (!view || !stops || stops->isEmpty()) return;
     const double top = 2 * titleHeight;
-    const double width = view->frame().width / static_cast<double>(stops->count());
-    const double height = std::floor(view->frame().height) - top;
+    const Rect area = messages::frame(view);
+    const double width = area.width / static_cast<double>(stops->count());
+    const double height = std::floor(area.height) - top;
     Extremes extremes;
     for (std::size_t i = 0; i < stops->count(); ++i) {
       const Rect frame = {width + static_cast<float>(unboxDouble(stops->at(i))), top, width, height};
@@ -131,8 +132,8 @@ class TrendDetailChartViewAccessibility : public TrendChart<TrendDetailChartView
     const Ref<Quantity> quantity = answerForColumn(accessibilityQuantityForIndex, self, bar);
     const Ref<DateInterval> days = answerForColumn(accessibilityDateIntervalForIndex, self, bar);
     const Ref<Unit> unit = trendUnit(self);
-    if (!quantity || !days || !unit || !quantity->isCompatibleWithUnit(unit)) return nullptr;
-    const double figure = quantity->doubleValueForUnit(unit);
+    if (!quantity || !days || !unit || !messages::isCompatibleWithUnit(quantity, unit)) return nullptr;
+    const double figure = messages::doubleValueForUnit(quantity, unit);
     extremes.include(figure);
     return chartElement(self, frame, formatter.stringFromDateInterval(*days), spokenFigure(figure, unit));
   }

@@ -81,7 +81,7 @@ class TrendDetailDailyAverageViewAccessibility : public TrendChart<TrendDetailDa
       const Ref<View> title = safeUIViewForKey(self, "titleLabel"_key);
       _accessibilityAddTrait(title, TraitHeader);
       elements.axSafelyAddObject(title);
-      addDays(elements, title ? title->frame().height : 0);
+      addDays(elements, messages::frame(title).height);
     });
   }
 
@@ -131,7 +131,7 @@ class TrendDetailDailyAverageViewAccessibility : public TrendChart<TrendDetailDa
     const Ref<Array> stops = messages::_accessibilityGraphData(self);
     if (!view || !stops || stops->count() != daysOfWeek) return;
     const double top = 2 * titleHeight;
-    const double height = std::floor(static_cast<float>(view->frame().height)) - top;
+    const double height = std::floor(static_cast<float>(messages::frame(view).height)) - top;
     const float width = unbox<float>(stops->at(1)) - unbox<float>(stops->at(0));
     for (std::size_t i = 0; i < daysOfWeek; ++i) {
       const Ref<String> label = axLabelForIndex(self, static_cast<std::int64_t>(i), formatter);

@@ -11,6 +11,7 @@
 #include "platform/toolkit/AccessibilityProperties.h"
 #include "platform/toolkit/ElementTree.h"
 #include "platform/toolkit/SpokenText.h"
+#include "platform/toolkit/ToolkitMessages.h"
 
 namespace ax {
 

@@ -34,8 +34,8 @@ class ExerciseChartDetailCellAccessibility : public SafeCategory<ExerciseChartDe
  private:
   static Ref<String> wholeMinutes(const Ref<Object>& time) {
     const Ref<Quantity> quantity = castAsClass<Quantity>(time);
-    const double minutes = quantity ? quantity->doubleValueForUnit(Unit::minuteUnit()) : 0;
-    return formatInteger(number(std::round(minutes))->int64Value());
+    const double minutes = messages::doubleValueForUnit(quantity, Unit::minuteUnit());
+    return formatWhole(std::round(minutes));
   }
 };
 

@@ -43,13 +43,14 @@ class MoveChartDetailCellAccessibility : public SafeCategory<MoveChartDetailCell
 
   // Nil when the host cannot say: then no amount is spoken, and the figure speaks its own text.
   static Ref<Unit> userActiveEnergyUnit() {
-    const Ref<Object> manager = safeValueForKey(safeClassFromString("VLUIUnitManager"), "sharedManager"_key);
+    const Ref<Object> manager =
+        safeValueForKey(safeClassFromString("VLUIUnitManager"_key), "sharedManager"_key);
     return castAsClass<Unit>(safeValueForKey(manager, "userActiveEnergyBurnedUnit"_key));
   }
 
   static Ref<String> wholeAmount(const Ref<Object>& energy, const Ref<Unit>& unit) {
     const Ref<Quantity> quantity = castAsClass<Quantity>(energy);
-    const double amount = quantity ? quantity->doubleValueForUnit(unit) : 0;
+    const double amount = messages::doubleValueForUnit(quantity, unit);
     return formatFloat(0, static_cast<float>(std::floor(amount)));
   }
 };

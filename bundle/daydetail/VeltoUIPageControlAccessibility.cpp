@@ -45,12 +45,12 @@ class VeltoUIPageControlAccessibility : public SafeCategory<VeltoUIPageControlAc
   void _axUpdateStateForDetailView() {
     const Ref<ScrollView> scrollView = cast<ScrollView>(axScrollView(self));
     const Ref<PageControl> pages = castAsClass<PageControl>(self);
-    const std::int64_t page = pages ? pages->currentPage() : 0;
+    const std::int64_t page = messages::currentPage(pages);
     if (scrollView) {
-      scrollView->setContentOffset(
-          {scrollView->bounds().width * static_cast<double>(page), scrollView->contentOffset().y});
+      const double left = messages::bounds(scrollView).width * static_cast<double>(page);
+      messages::setContentOffset(scrollView, {left, messages::contentOffset(scrollView).y});
     }
-    if (pages) pages->setCurrentPage(page);
+    messages::setCurrentPage(pages, page);
     postNotification(LayoutChangedNotification);
   }
 

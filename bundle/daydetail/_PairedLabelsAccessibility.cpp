@@ -16,8 +16,8 @@ class PairedLabelsAccessibility : public SafeCategory<PairedLabelsAccessibility>
 
   bool isAccessibilityElement() { return true; }
   Ref<String> accessibilityLabel() {
-    return stringForVariables({messages::accessibilityLabel(self.safeValueForKey("keyLabel"_key)),
-                               messages::accessibilityLabel(self.safeValueForKey("valueLabel"_key)),
+    return stringForVariables({labelOfPart(self, self.safeValueForKey("keyLabel"_key)),
+                               labelOfPart(self, self.safeValueForKey("valueLabel"_key)),
                                stringForVariablesSentinel});
   }
 };

@@ -1,6 +1,7 @@
 #include "bundle/shared/AXGroupedTitleValueView.h"
 
 #include "platform/runtime/ClassBuilder.h"
+#include "platform/toolkit/SpokenText.h"
 
 namespace ax {
 
@@ -28,15 +29,14 @@ Ref<AXGroupedTitleValueView> AXGroupedTitleValueView::initWithAccessibilityConta
 }
 
 bool AXGroupedTitleValueView::isAccessibilityElement() {
-  return !isEmpty(messages::accessibilityLabel(titleView_)) &&
-         !isEmpty(messages::accessibilityLabel(valueView_));
+  return !isEmpty(accessibilityLabel()) && !isEmpty(accessibilityValue());
 }
 
 Ref<String> AXGroupedTitleValueView::accessibilityLabel() {
-  return messages::accessibilityLabel(titleView_);
+  return labelOfPart(*this, titleView_);
 }
 Ref<String> AXGroupedTitleValueView::accessibilityValue() {
-  return messages::accessibilityLabel(valueView_);
+  return labelOfPart(*this, valueView_);
 }
 
 namespace {

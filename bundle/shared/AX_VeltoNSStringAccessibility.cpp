@@ -27,7 +27,8 @@ class AX_VeltoNSStringAccessibility : public SafeCategory<AX_VeltoNSStringAccess
 
  private:
   static Ref<String> textOf(const Ref<Object>& styled) {
-    if (const auto* attributed = cast<AttributedString>(styled.get())) return attributed->string();
+    if (const Ref<AttributedString> attributed = cast<AttributedString>(styled))
+      return messages::string(attributed);
     return cast<String>(styled);
   }
 };

@@ -3,14 +3,15 @@
 #include "bundle/shared/RingsDescription.h"
 #include "platform/health/ActivitySummary.h"
 #include "platform/runtime/KeyReading.h"
+#include "platform/runtime/SafeMessage.h"
 
 using namespace ax;
 
 namespace {
 
 const Message<Ref<Object>(std::int64_t)> activitySummaryForCacheIndex{"activitySummaryForCacheIndex:"};
-const Message<double()> activeEnergyCompletionPercentage{"_activeEnergyCompletionPercentage"};
-const Message<double()> standHoursCompletionPercentage{"_standHoursCompletionPercentage"};
+const SafeMessage<double()> activeEnergyCompletionPercentage{"_activeEnergyCompletionPercentage"};
+const SafeMessage<double()> standHoursCompletionPercentage{"_standHoursCompletionPercentage"};
 
 const Ref<Calendar>& gregorianCalendar() {
   static const auto& calendar =
@@ -43,7 +44,7 @@ Ref<String> accessibilityVeltoStringForDate(const Ref<Date>& date, bool arePerce
   Ref<Object> found;
   performSafeBlock([&] {
     const Ref<Object> cache =
-        safeValueForKey(safeClassFromString("ActivitySummaryCache"), "sharedInstance"_key);
+        safeValueForKey(safeClassFromString("ActivitySummaryCache"_key), "sharedInstance"_key);
     found = activitySummaryForCacheIndex(cache, CHCacheIndexForDate(date));
   });
   const Ref<ActivitySummary> summary = castAsClass<ActivitySummary>(found);

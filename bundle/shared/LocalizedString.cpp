@@ -3,18 +3,18 @@
 #include "bundle/shared/WheelchairUse.h"
 #include "platform/foundation/AddressBook.h"
 #include "platform/foundation/Bundle.h"
-#include "platform/runtime/Message.h"
+#include "platform/runtime/SafeMessage.h"
 
 namespace ax {
 
 namespace {
 
-const Message<void(Ref<String>)> setName{"setName:"};
-const Message<void(bool)> setWheelchairUser{"setWheelchairUser:"};
-const Message<Ref<String>(Ref<Object>)> titleForAchievement{"titleForAchievement:"};
+const SafeMessage<void(Ref<String>)> setName{"setName:"};
+const SafeMessage<void(bool)> setWheelchairUser{"setWheelchairUser:"};
+const SafeMessage<Ref<String>(Ref<Object>)> titleForAchievement{"titleForAchievement:"};
 
 Ref<Object> makeAchievementLocalizationProvider() {
-  const Class* providerClass = safeClassFromString("ODUIAchievementLocalizationProvider");
+  const Class* providerClass = safeClassFromString("ODUIAchievementLocalizationProvider"_key);
   if (providerClass == nullptr) return nullptr;
   Ref<Object> provider = providerClass->instantiate();
   setName(provider, copyUserFirstNameFromAddressBook());
@@ -31,7 +31,7 @@ const Ref<Object>& achievementLocalizationProvider() {
 }  // namespace
 
 Ref<String> accessibilityLocalizedString(std::string_view key) {
-  const Ref<Bundle> bundle = Bundle::bundleForClass(safeClassFromString("AXVeltoGlue"));
+  const Ref<Bundle> bundle = Bundle::bundleForClass(safeClassFromString("AXVeltoGlue"_key));
   return bundle ? bundle->localizedStringForKey(key, emptyString(), "Accessibility") : nullptr;
 }
 
@@ -45,6 +45,6 @@ Ref<String> accessibilityLocalizedString(const Ref<String>& key) {
 
 Ref<String> accessibilityLocalizedStringForAchievement(const Ref<Object>& achievement) {
   const Ref<Object>& provider = achievementLocalizationProvider();
-  if (!achievement || !achievement->isKindOf(safeClassFromString("ACHAchievement"))) return nullptr;
+  if (!achievement || !achievement->isKindOf(safeClassFromString("ACHAchievement"_key))) return nullptr;
   return titleForAchievement(provider, achievement);
 }

@@ -16,7 +16,7 @@ class CHFriendDetailActionCellAccessibility : public SafeCategory<CHFriendDetail
 
   bool isAccessibilityElement() { return true; }
   Ref<String> accessibilityLabel() {
-    return messages::accessibilityLabel(self.safeValueForKey("_actionTitleLabel"_key));
+    return labelOfPart(self, self.safeValueForKey("_actionTitleLabel"_key));
   }
   Traits accessibilityTraits() { return super(messages::accessibilityTraits) | TraitButton; }
 };

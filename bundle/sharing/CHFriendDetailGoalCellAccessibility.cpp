@@ -16,12 +16,8 @@ class CHFriendDetailGoalCellAccessibility : public SafeCategory<CHFriendDetailGo
   }
 
   bool isAccessibilityElement() { return true; }
-  Ref<String> accessibilityLabel() {
-    return messages::accessibilityLabel(self.safeValueForKey("_titleLabel"_key));
-  }
-  Ref<String> accessibilityValue() {
-    return messages::accessibilityLabel(self.safeValueForKey("_subtitleLabel"_key));
-  }
+  Ref<String> accessibilityLabel() { return labelOfPart(self, self.safeValueForKey("_titleLabel"_key)); }
+  Ref<String> accessibilityValue() { return labelOfPart(self, self.safeValueForKey("_subtitleLabel"_key)); }
 };
 
 using C = CHFriendDetailGoalCellAccessibility;

@@ -34,8 +34,7 @@ class CHFriendListTableViewCellAccessibility : public SafeCategory<CHFriendListT
 
   void _accessibilityLoadAccessibilityInformation() {
     super(messages::_accessibilityLoadAccessibilityInformation);
-    const Ref<TableViewCell> cell = castAsClass<TableViewCell>(self);
-    const Ref<Label> name = cell ? cell->textLabel() : nullptr;
+    const Ref<Label> name = messages::textLabel(castAsClass<TableViewCell>(self));
     if (!name) return;
     const Ref<Object> lineOne = self.safeValueForKey("detailLineOneLabel"_key);
     const Ref<Object> lineTwo = self.safeValueForKey("detailLineTwoLabel"_key);
@@ -49,9 +48,8 @@ class CHFriendListTableViewCellAccessibility : public SafeCategory<CHFriendListT
 
  private:
   static void speakWithoutBullets(Label& label) {
-    _setAccessibilityLabelBlock(label, [weakLabel = Weak<Label>(label)]() -> Ref<String> {
-      const Ref<Label> shown = weakLabel.lock();
-      return shown ? stringByRemoving(shown->text(), "\u2022") : nullptr;
+    _setAccessibilityLabelBlock(label, [weak = Weak<Label>(label)] {
+      return stringByRemoving(messages::text(weak.lock()), "\u2022");
     });
   }
 };

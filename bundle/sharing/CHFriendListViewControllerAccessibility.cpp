@@ -27,10 +27,8 @@ class CHFriendListViewControllerAccessibility : public SafeCategory<CHFriendList
     const Ref<BarButtonItem> item =
         castAsClass<BarButtonItem>(self.safeValueForKey("_sortBarButtonItem"_key));
     _setAccessibilityLabelBlock(item, [] { return accessibilityLocalizedString("sort.by.options"); });
-    _setAccessibilityValueBlock(item, [weakItem = Weak<BarButtonItem>(item)]() -> Ref<String> {
-      const Ref<BarButtonItem> shown = weakItem.lock();
-      return shown ? shown->title() : nullptr;
-    });
+    _setAccessibilityValueBlock(item,
+                                [weak = Weak<BarButtonItem>(item)] { return messages::title(weak.lock()); });
   }
 };
 

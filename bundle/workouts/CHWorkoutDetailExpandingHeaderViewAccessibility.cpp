@@ -24,7 +24,8 @@ class CHWorkoutDetailExpandingHeaderViewAccessibility
   Ref<String> accessibilityLabel() { return _accessibilityStringForLabelKeyValues(self, "_titleLabel"); }
   Traits accessibilityTraits() { return TraitButton | TraitHeader; }
   Point accessibilityActivationPoint() {
-    return messages::accessibilityActivationPoint(safeUIViewForKey(self, "_expandButton"_key));
+    return answerOfPart(messages::accessibilityActivationPoint, self,
+                        safeUIViewForKey(self, "_expandButton"_key));
   }
   std::int64_t _accessibilityExpandedStatus() {
     return self.safeBoolForKey("_expanded"_key) ? isExpanded : isCollapsed;

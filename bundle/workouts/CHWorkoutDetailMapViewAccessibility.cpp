@@ -23,7 +23,7 @@ class CHWorkoutDetailMapViewAccessibility : public SafeCategory<CHWorkoutDetailM
 
   Rect accessibilityFrame() {
     const Ref<View> view = castAsClass<View>(self);
-    return view ? frameForElements(view->subviewArray()) : super(messages::accessibilityFrame);
+    return view ? frameForElements(messages::subviews(view)) : super(messages::accessibilityFrame);
   }
 };
 

@@ -21,11 +21,12 @@ class CHWorkoutDetailSplitTableViewCellAccessibility
 
   Ref<String> accessibilityLabel() {
     const Ref<Label> distance = castAsClass<Label>(safeUIViewForKey(self, "_distanceLabel"_key));
-    return stringForVariables({messages::accessibilityLabel(safeUIViewForKey(self, "_unitLabel"_key)),
-                               _accessibilityViewIsVisible(distance) ? distance->text() : emptyString(),
-                               accessibilityAttributedStringForPaceContainingString(
-                                   messages::accessibilityLabel(safeUIViewForKey(self, "_paceLabel"_key))),
-                               stringForVariablesSentinel});
+    return stringForVariables(
+        {labelOfPart(self, safeUIViewForKey(self, "_unitLabel"_key)),
+         _accessibilityViewIsVisible(distance) ? messages::text(distance) : emptyString(),
+         accessibilityAttributedStringForPaceContainingString(
+             labelOfPart(self, safeUIViewForKey(self, "_paceLabel"_key))),
+         stringForVariablesSentinel});
   }
 };
 

@@ -22,8 +22,9 @@ class CHWorkoutFormattingManagerAccessibility : public SafeCategory<CHWorkoutFor
   Ref<Object> formattedDurationForWorkoutContext(Ref<Object> workout, Ref<Object> context) {
     const Ref<Object> result = super(ax::formattedDurationForWorkoutContext, workout, context);
     const Ref<AttributedString> formatted = castAsClass<AttributedString>(result);
-    if (!formatted || isEmpty(formatted->string())) return result;
-    const auto spoken = AccessibilityAttributedString::initWithString(formatted->string());
+    const Ref<String> duration = messages::string(formatted);
+    if (isEmpty(duration)) return result;
+    const auto spoken = AccessibilityAttributedString::initWithString(duration);
     spoken->setAttributeForKey(number(true), DurationTimeHHMMSS);
     messages::setAccessibilityLabel(formatted, spoken);
     return result;

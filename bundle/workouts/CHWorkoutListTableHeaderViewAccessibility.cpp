@@ -18,8 +18,8 @@ class CHWorkoutListTableHeaderViewAccessibility
 
   bool isAccessibilityElement() { return true; }
   Ref<String> accessibilityLabel() {
-    return stringForVariables({messages::accessibilityLabel(self.safeValueForKey("_dateLabel"_key)),
-                               messages::accessibilityLabel(self.safeValueForKey("_detailLabel"_key)),
+    return stringForVariables({labelOfPart(self, self.safeValueForKey("_dateLabel"_key)),
+                               labelOfPart(self, self.safeValueForKey("_detailLabel"_key)),
                                stringForVariablesSentinel});
   }
   Traits accessibilityTraits() { return super(messages::accessibilityTraits) | TraitHeader; }

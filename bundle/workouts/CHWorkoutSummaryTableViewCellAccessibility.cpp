@@ -24,14 +24,14 @@ class CHWorkoutSummaryTableViewCellAccessibility
 
   Ref<String> accessibilityLabel() {
     const Ref<TableViewCell> cell = castAsClass<TableViewCell>(self);
-    if (!cell || cell->contentView()->subviews().empty()) return super(messages::accessibilityLabel);
-    return labelForElements(cell->contentView()->subviewArray());
+    const Ref<Array> shown = messages::subviews(messages::contentView(cell));
+    return shown && !shown->isEmpty() ? labelForElements(shown) : super(messages::accessibilityLabel);
   }
 
   void _accessibilityLoadAccessibilityInformation() {
     super(messages::_accessibilityLoadAccessibilityInformation);
     const Ref<Object> duration =
-        safeClass("_CHWorkoutSummaryTabbedLabelContainer", self.safeValueForKey("_durationLabel"_key));
+        safeClass("_CHWorkoutSummaryTabbedLabelContainer"_key, self.safeValueForKey("_durationLabel"_key));
     messages::_accessibilitySetLabelAttribute(duration, string(std::string(DurationTimeHHMMSS.name())));
   }
 

@@ -36,19 +36,20 @@ class CHWorkoutsListTableViewCellAccessibility
     super(messages::_accessibilityLoadAccessibilityInformation);
     const Ref<Workout> workout = castAsClass<Workout>(self.safeValueForKey("_workout"_key));
     if (!workout) return;
-    if (workout->sourceRevision()) nameSource(workout->sourceRevision()->source());
-    if (!workout->startDate()) return;
+    nameSource(safeValueForKey(workout->safeValueForKey("sourceRevision"_key), "source"_key));
+    const Ref<Date> start = castAsClass<Date>(workout->safeValueForKey("startDate"_key));
+    if (!start) return;
     messages::setAccessibilityLabel(self.safeValueForKey("_dateLabel"_key),
-                                    dateStringForFormat(workout->startDate(), "EEEE, MMM d, yyyy"));
+                                    dateStringForFormat(start, "EEEE, MMM d, yyyy"));
   }
 
  private:
-  void nameSource(const Ref<Source>& source) {
-    if (!source || safeBoolForKey(source, "_isNorvaleWatch"_key) || isEmpty(source->name())) return;
-    const Ref<TableViewCell> cell = castAsClass<TableViewCell>(self);
-    if (!cell) return;
-    messages::setAccessibilityLabel(cell->imageView(), source->name());
-    messages::setIsAccessibilityElement(cell->imageView(), true);
+  void nameSource(const Ref<Object>& source) {
+    const Ref<String> name = safeStringForKey(source, "name"_key);
+    if (isEmpty(name) || safeBoolForKey(source, "_isNorvaleWatch"_key)) return;
+    const Ref<ImageView> icon = messages::imageView(castAsClass<TableViewCell>(self));
+    messages::setAccessibilityLabel(icon, name);
+    messages::setIsAccessibilityElement(icon, true);
   }
 };
 

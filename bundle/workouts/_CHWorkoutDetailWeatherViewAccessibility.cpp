@@ -39,7 +39,7 @@ class CHWorkoutDetailWeatherViewAccessibility : public SafeCategory<CHWorkoutDet
     super(setWeather, temperature, humidity, weatherCondition, formattingManager);
     const Ref<ImageView> imageView =
         castAsClass<ImageView>(self.safeValueForKey("_weatherConditionImageView"_key));
-    if (!imageView || !imageView->image()) return;
+    if (!messages::image(imageView)) return;
     const std::int64_t code = conditionCodeFromLegacyWeatherConditionCode(weatherCondition);
     messages::setAccessibilityLabel(
         imageView, WeatherUtilities::sharedInstance()->descriptionForWeatherWXQConditionCode(code));
@@ -50,15 +50,15 @@ class CHWorkoutDetailWeatherViewAccessibility : public SafeCategory<CHWorkoutDet
   Ref<AccessibilityElement> summaryWithout(const Ref<Object>& button) {
     Array::Items shown;
     Rect frame;
-    if (const Ref<View> view = castAsClass<View>(self)) {
-      for (const Ref<View>& subview : view->subviews()) {
+    if (const Ref<Array> subviews = messages::subviews(castAsClass<View>(self))) {
+      for (const Ref<Object>& subview : *subviews) {
         if (subview == button) continue;
         shown.push_back(subview);
-        frame = frame.unionWith(subview->frame());
+        frame = frame.unionWith(messages::frame(subview));
       }
     }
     const Ref<AccessibilityElement> summary = AccessibilityElement::initWithAccessibilityContainer(self);
-    summary->setAccessibilityFrameInContainerSpace(frame);
+    messages::setAccessibilityFrameInContainerSpace(summary, frame);
     messages::setAccessibilityLabel(summary, labelForElements(array(std::move(shown))));
     return summary;
   }
