@@ -28,6 +28,8 @@ class WeekPaletteTappableDay : public ActivityTappableDay {
   static Class& staticClass();
 
   void layoutSubviews() override;
+  // It stays below its weekday.
+  bool changesSides() const override { return false; }
 
  private:
   Ref<Layer> circle_;

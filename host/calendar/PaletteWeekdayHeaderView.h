@@ -16,6 +16,8 @@ class PaletteWeekdayHeaderView : public View {
   void highlightWeekdayLabelForDateAndSetDay(Ref<Object> date);
   // Puts the labels that have no superview into equal columns.
   void layoutSubviews() override;
+  // A touch is counted from the left in every language, and so are the columns.
+  bool changesSides() const override { return false; }
 
  private:
   Ref<MutableArray> weekdayLabels_;

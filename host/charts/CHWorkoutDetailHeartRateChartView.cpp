@@ -60,7 +60,6 @@ Class& CHWorkoutDetailHeartRateChartView::staticClass() {
                              .instanceVariable<&T::hasAdequateDataForDisplay_>("_hasAdequateDataForDisplay")
                              .instanceVariable<&T::workout_>("_workout")
                              .method<&T::_dateInterval>("_dateInterval")
-                             .method<&T::dateInterval>("dateInterval")
                              .build();
   return result;
 }

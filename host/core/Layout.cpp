@@ -20,7 +20,7 @@ void addUnplaced(View& parent, const Ref<View>& part, Rect frame) {
 
 void showIn(View& parent, const Ref<View>& part, Rect frame) {
   if (!part) return;
-  if (part->frame().isEmpty()) part->setFrame(frame);
+  if (part->frame().isEmpty()) part->setFrame(inDirection(parent, frame));
   if (part->superview() == nullptr) parent.addSubview(part);
 }
 
@@ -38,7 +38,8 @@ void stackIn(View& parent, std::initializer_list<Ref<View>> parts) {
 }
 
 Rect inDirection(const View& view, Rect frame) {
-  if (formatting::currentLanguageIsRightToLeft()) frame.x = view.frame().width - frame.maxX();
+  const bool turns = view.changesSides() && formatting::currentLanguageIsRightToLeft();
+  if (turns) frame.x = view.frame().width - frame.maxX();
   return frame;
 }
 

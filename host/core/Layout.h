@@ -13,8 +13,8 @@ void addUnplaced(View& parent, std::initializer_list<Ref<View>> parts);
 // The same for one part, which gets the frame unless it has one of its own.
 void addUnplaced(View& parent, const Ref<View>& part, Rect frame);
 
-// Puts a part of a view in its place, unless it has a superview or a frame with an area of its own. Nil parts
-// are left out.
+// Puts a part of a view in its place as the language has it, unless it has a superview or a frame with an
+// area of its own. Nil parts are left out.
 void showIn(View& parent, const Ref<View>& part, Rect frame);
 
 // The same for several, one below the other in equal shares of a size.

@@ -1,4 +1,6 @@
+#include "host/core/HostStrings.h"
 #include "platform/foundation/AttributedString.h"
+#include "platform/foundation/Formatters.h"
 #include "platform/runtime/ClassBuilder.h"
 
 // What the app adds to the platform's String: figures with a small unit behind them.
@@ -7,8 +9,8 @@ namespace ax::host {
 namespace {
 
 Ref<AttributedString> attrStringWithValueUnit(Ref<Object> value, Ref<String> unit) {
-  const std::string number = value ? value->description() : "";
-  return make<AttributedString>(string(isEmpty(unit) ? number : number + " " + unit->text()));
+  return make<AttributedString>(
+      stringWithFormat(HostStrings::textForKey(string("value.with.unit")), {value, unit}));
 }
 
 struct HostExtensions {

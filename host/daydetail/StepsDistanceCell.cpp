@@ -10,18 +10,18 @@ namespace {
 
 const Message<void()> setupSubviewsMessage{"_setupSubviews"};
 
-Ref<Label> labelAt(int column, double y) {
+Ref<Label> labelAt(const View& cell, int column, double y) {
   const Ref<Label> label = make<Label>();
-  label->setFrame({16 + column * 120.0, y, 110, 22});
+  label->setFrame(inDirection(cell, {16 + column * 120.0, y, 110, 22}));
   return label;
 }
 
-void makePair(Ref<Label>& title, Ref<Label>& value, const char* key, int column) {
+void makePair(const View& cell, Ref<Label>& title, Ref<Label>& value, const char* key, int column) {
   if (!title) {
-    title = labelAt(column, 8);
+    title = labelAt(cell, column, 8);
     title->setText(HostStrings::textForKey(string(key)));
   }
-  if (!value) value = labelAt(column, 30);
+  if (!value) value = labelAt(cell, column, 30);
 }
 
 }  // namespace
@@ -42,9 +42,9 @@ Class& StepsDistanceCell::staticClass() {
 
 void StepsDistanceCell::setupSubviews() {
   isSetUp_ = true;
-  makePair(stepsTitle_, stepsValue_, "day.steps.title", 0);
-  makePair(distanceTitle_, distanceValue_, "day.distance.title", 1);
-  makePair(flightsTitle_, flightsValue_, "day.flights.title", 2);
+  makePair(*this, stepsTitle_, stepsValue_, "day.steps.title", 0);
+  makePair(*this, distanceTitle_, distanceValue_, "day.distance.title", 1);
+  makePair(*this, flightsTitle_, flightsValue_, "day.flights.title", 2);
   addUnplaced(*contentView(),
               {stepsTitle_, stepsValue_, distanceTitle_, distanceValue_, flightsTitle_, flightsValue_});
 }

@@ -18,16 +18,31 @@ double CHWorkoutDataCalculator::paceForWorkout(Ref<Workout> workout) {
 }
 
 Ref<Quantity> CHWorkoutDataCalculator::speedForWorkout(Ref<Workout> workout) {
-  if (!workout || !workout->totalDistance() || workout->duration() <= 0) return nullptr;
-  const Ref<Unit> unit = unitOf(workout->totalDistance());
-  const double hours = workout->duration() / 3600;
-  return quantity(workout->totalDistance()->doubleValueForUnit(unit) / hours,
+  return workout ? speed(workout->totalDistance(), workout->duration()) : nullptr;
+}
+
+Ref<Quantity> CHWorkoutDataCalculator::speed(const Ref<Quantity>& distance, double seconds) {
+  if (!distance || seconds <= 0) return nullptr;
+  constexpr double hour = 3600;
+  const Ref<Unit> unit = unitOf(distance);
+  return quantity(distance->doubleValueForUnit(unit) / (seconds / hour),
                   unit->unitDividedByUnit(*Unit::hourUnit()));
 }
 
 double CHWorkoutDataCalculator::pace(const Ref<Quantity>& distance, double seconds) {
   const double units = distance ? distance->doubleValueForUnit(unitOf(distance)) : 0;
   return units > 0 ? seconds / units : 0;
+}
+
+ShownPace CHWorkoutDataCalculator::shownPace(double secondsPerUnit, const Ref<Quantity>& distance,
+                                             std::int64_t activityType) {
+  const Ref<Unit> unit = unitOf(distance);
+  if (activityType != workoutActivityTypeNamed("swimming")) return {secondsPerUnit, unit};
+  const bool isInYards =
+      distance && distance->unit() && (distance->unit()->text() == "yd" || unit->text() == "mi");
+  const Ref<Unit> swum = Unit::unitFromString(isInYards ? "yd" : "m");
+  constexpr double hundred = 100;
+  return {secondsPerUnit * quantity(hundred, swum)->doubleValueForUnit(unit), swum};
 }
 
 Ref<Unit> CHWorkoutDataCalculator::unitOf(const Ref<Quantity>& distance) {

@@ -42,8 +42,10 @@ void CHWorkoutDetailPaceTableViewCell::configureWithWorkoutDataCalculator(Ref<Wo
   if (isRide) {
     ensure(valueLabel_).setAttributedText(figureOf(cast<Quantity>(speedForWorkout(calculator, workout))));
   } else {
-    const Ref<Unit> unit = CHWorkoutDataCalculator::unitOf(workout ? workout->totalDistance() : nullptr);
-    ensure(valueLabel_).setAttributedText(paceFigure(paceForWorkout(calculator, workout), *unit));
+    const ShownPace pace = CHWorkoutDataCalculator::shownPace(paceForWorkout(calculator, workout),
+                                                              workout ? workout->totalDistance() : nullptr,
+                                                              workout ? workout->workoutActivityType() : 0);
+    ensure(valueLabel_).setAttributedText(paceFigure(pace.seconds, *pace.unit));
   }
   layoutSubviews();
 }

@@ -15,6 +15,23 @@ bool isWholeUnit(const Ref<Quantity>& distance) {
   return formatFloat(1, static_cast<float>(distance->doubleValueForUnit(unit)))->isEqual(*formatInteger(1));
 }
 
+Ref<String> nameOf(const CHWorkoutSplit& split) {
+  const Ref<String> name =
+      hostText(split.isLength() ? "split.length" : "split.number", {formatInteger(split.index())});
+  if (split.isRest()) return hostText("split.rest", {name});
+  return split.stroke() ? hostText("split.stroke", {name, split.stroke()}) : name;
+}
+
+Ref<AttributedString> paceOf(const CHWorkoutSplit& split) {
+  const Ref<Quantity>& distance = split.distance();
+  if (!distance && split.duration() > 0) return clockFigure(split.duration());
+  const bool isRide = split.activityType() == WorkoutActivityTypeCycling;
+  if (isRide) return figureOf(CHWorkoutDataCalculator::speed(distance, split.duration()));
+  const double pace = CHWorkoutDataCalculator::pace(distance, split.duration());
+  const ShownPace shown = CHWorkoutDataCalculator::shownPace(pace, distance, split.activityType());
+  return paceFigure(shown.seconds, *shown.unit);
+}
+
 }  // namespace
 
 Class& CHWorkoutSplit::staticClass() {
@@ -23,6 +40,10 @@ Class& CHWorkoutSplit::staticClass() {
                              .instanceVariable<&T::index_>("index")
                              .instanceVariable<&T::distance_>("distance")
                              .instanceVariable<&T::duration_>("duration")
+                             .instanceVariable<&T::activityType_>("activityType")
+                             .instanceVariable<&T::isRest_>("isRest")
+                             .instanceVariable<&T::isLength_>("isLength")
+                             .instanceVariable<&T::stroke_>("stroke")
                              .build();
   return result;
 }
@@ -40,11 +61,10 @@ void CHWorkoutDetailSplitTableViewCell::setSplit(Ref<CHWorkoutSplit> split) {
   split_ = std::move(split);
   if (!split_) return;
   const Ref<Quantity>& distance = split_->distance();
-  const double pace = CHWorkoutDataCalculator::pace(distance, split_->duration());
-  ensure(unitLabel_).setText(hostText("split.number", {formatInteger(split_->index())}));
+  ensure(unitLabel_).setText(nameOf(*split_));
   ensure(distanceLabel_).setText(distanceInWords(distance));
   distanceLabel_->setHidden(!distance || isWholeUnit(distance));
-  ensure(paceLabel_).setAttributedText(paceFigure(pace, *CHWorkoutDataCalculator::unitOf(distance)));
+  ensure(paceLabel_).setAttributedText(paceOf(*split_));
   layoutSubviews();
 }
 

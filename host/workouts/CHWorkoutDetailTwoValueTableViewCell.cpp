@@ -3,6 +3,7 @@
 #include "host/workouts/CHWorkoutFormattingManager.h"
 #include "host/workouts/Placement.h"
 #include "host/workouts/WorkoutFigures.h"
+#include "platform/foundation/Formatters.h"
 #include "platform/runtime/ClassBuilder.h"
 
 namespace ax::host {
@@ -14,6 +15,7 @@ const Message<void(Ref<Object>, Ref<Object>)> configure2{"configureWithTitle2:va
 
 Ref<Object> asFigure(const Ref<Object>& value) {
   if (const Ref<Workout> workout = cast<Workout>(value)) return formattedDuration(workout, "detail");
+  if (const Ref<Date> date = cast<Date>(value)) return dateStringForFormat(date, "EEEEMMMMdyjm");
   if (!value || cast<Quantity>(value.get()) != nullptr) return figureOf(cast<Quantity>(value));
   return value;
 }

@@ -5,7 +5,8 @@
 namespace ax::host {
 
 // Two figures of a workout side by side, each under its title. A figure is given as a styled text, a plain
-// text, a Quantity, or a Workout, which stands for its duration; nil shows two dashes.
+// text, a Quantity, a Date with its time of day, or a Workout, which stands for its duration; nil shows two
+// dashes.
 class CHWorkoutDetailTwoValueTableViewCell : public TableViewCell {
  public:
   static Class& staticClass();

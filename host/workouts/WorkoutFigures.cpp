@@ -34,6 +34,10 @@ constexpr std::array shownUnits = {
     ShownUnit{"km/hr", "unit.km.per.hour", 1},
     ShownUnit{"mi/hr", "unit.mi.per.hour", 1},
     ShownUnit{"count/min", "unit.bpm", 0},
+    ShownUnit{"W", "unit.w", 0},
+    ShownUnit{"rev/min", "unit.rpm", 0},
+    ShownUnit{"step/min", "unit.steps.per.minute", 0},
+    ShownUnit{"stroke/min", "unit.strokes.per.minute", 0},
 };
 
 // Null for none, and for one that the app has no texts for.
@@ -54,12 +58,6 @@ Ref<AttributedString> withUnit(const Ref<String>& number, std::string_view unitK
   return styled ? styled : make<AttributedString>(string(number->text() + " " + unit->text()));
 }
 
-Ref<String> spokenUnit(const ShownUnit& unit, const String& number) {
-  const std::string key = std::string(unit.key) + ".spoken";
-  const Ref<String> one = number.isEqual(*formatInteger(1)) ? hostText(key + ".one") : nullptr;
-  return isEmpty(one) ? hostText(key) : one;
-}
-
 Ref<Quantity> asShown(const Ref<Quantity>& quantity) {
   const Ref<Unit> preferred = Unit::unitFromString(environment().energyUnit);
   if (!preferred || !quantity->isCompatibleWithUnit(preferred)) return quantity;
@@ -78,8 +76,11 @@ std::string paceText(double secondsPerUnit) {
   return text;
 }
 
-std::string paceKey(const Unit& unitOfDistance) {
-  return unitOfDistance.text() == "mi" ? "unit.per.mi" : "unit.per.km";
+// The end of the keys of what a pace is told by.
+std::string distanceKey(const Unit& unitOfDistance) {
+  const std::string& unit = unitOfDistance.text();
+  if (unit == "m" || unit == "yd") return "per.100" + unit;
+  return unit == "mi" ? "per.mi" : "per.km";
 }
 
 }  // namespace
@@ -95,23 +96,30 @@ std::string clockText(double seconds) {
   return text;
 }
 
+Ref<AttributedString> clockFigure(double seconds) {
+  auto figure = make<AttributedString>(string(clockText(seconds)));
+  messages::setAccessibilityLabel(figure, durationStringForDuration(seconds));
+  return figure;
+}
+
 Ref<AttributedString> figureOf(const Ref<Quantity>& given) {
   if (!given) return missingFigure();
   const Ref<Quantity> quantity = asShown(given);
   const ShownUnit* unit = shownUnit(quantity->unit());
   if (unit == nullptr) return make<AttributedString>(string(quantity->description()));
   const Ref<String> number = formatFloat(unit->formatOption, static_cast<float>(quantity->value()));
-  return withUnit(number, unit->key, spokenUnit(*unit, *number));
+  return withUnit(number, unit->key, quantity->unit()->spokenName());
 }
 
 Ref<AttributedString> paceFigure(double secondsPerUnit, const Unit& unitOfDistance) {
-  const std::string key = paceKey(unitOfDistance);
-  return withUnit(string(paceText(secondsPerUnit)), key, hostText(key + ".spoken"));
+  const std::string key = distanceKey(unitOfDistance);
+  const Ref<String> spoken =
+      make<UnitName>(hostText("unit." + key + ".spoken")->text(), hostText("pace." + key));
+  return withUnit(string(paceText(secondsPerUnit)), "unit." + key, spoken);
 }
 
 Ref<String> spokenPace(double secondsPerUnit, const Unit& unitOfDistance) {
-  return string(durationStringForDuration(secondsPerUnit)->text() + " " +
-                hostText(paceKey(unitOfDistance) + ".spoken")->text());
+  return hostText("pace." + distanceKey(unitOfDistance), {durationStringForDuration(secondsPerUnit)});
 }
 
 Ref<String> plainText(const Ref<AttributedString>& figure) {
@@ -129,7 +137,7 @@ Ref<String> distanceInWords(const Ref<Quantity>& distance) {
   const ShownUnit* unit = distance ? shownUnit(distance->unit()) : nullptr;
   if (unit == nullptr) return nullptr;
   const Ref<String> number = formatFloat(unit->formatOption, static_cast<float>(distance->value()));
-  return string(number->text() + " " + spokenUnit(*unit, *number)->text());
+  return hostText("value.with.unit", {number, distance->unit()});
 }
 
 Ref<String> hostText(std::string_view key, std::initializer_list<Ref<Object>> arguments) {

@@ -12,6 +12,9 @@ namespace ax::host {
 // "42:10", or "1:05:30" from an hour on; in whole seconds.
 std::string clockText(double seconds);
 
+// The same with its words.
+Ref<AttributedString> clockFigure(double seconds);
+
 // "5.01 km", in the quantity's own unit, energies in the user's; "--" for nil.
 Ref<AttributedString> figureOf(const Ref<Quantity>& quantity);
 

@@ -1,5 +1,7 @@
 #include "host/workouts/WorkoutTotals.h"
 
+#include <optional>
+
 #include "host/workouts/CHWorkoutDataCalculator.h"
 #include "host/workouts/WorkoutFigures.h"
 #include "platform/foundation/Formatters.h"
@@ -9,8 +11,7 @@ namespace ax::host {
 namespace {
 
 bool countsForPace(const Workout& workout) {
-  return workout.totalDistance() && workout.totalDistance()->value() > 0 &&
-         workout.workoutActivityType() != WorkoutActivityTypeCycling;
+  return workout.totalDistance() && workout.totalDistance()->value() > 0;
 }
 
 Ref<String> spokenClock(double seconds) {
@@ -27,6 +28,8 @@ void WorkoutTotals::Sum::add(const Ref<Quantity>& more) {
 
 WorkoutTotals::WorkoutTotals(const Ref<Array>& workouts) {
   if (!workouts) return;
+  std::optional<std::int64_t> sport;
+  bool isMixed = false;
   for (const Ref<Object>& item : *workouts) {
     const Workout* workout = cast<Workout>(item.get());
     if (workout == nullptr) continue;
@@ -35,9 +38,13 @@ WorkoutTotals::WorkoutTotals(const Ref<Array>& workouts) {
     distance.add(workout->totalDistance());
     energy.add(workout->totalEnergyBurned());
     if (!countsForPace(*workout)) continue;
+    isMixed = isMixed || sport.value_or(workout->workoutActivityType()) != workout->workoutActivityType();
+    sport = workout->workoutActivityType();
     pacedSeconds += workout->duration();
     pacedDistance.add(workout->totalDistance());
   }
+  pacedActivityType = sport.value_or(0);
+  if (isMixed || sport == WorkoutActivityTypeCycling) pacedDistance = {};
 }
 
 void showFigure(CHWorkoutSummaryTabbedLabelContainer& container, std::string_view titleKey,
@@ -59,10 +66,11 @@ void showPace(CHWorkoutSummaryTabbedLabelContainer& container, const WorkoutTota
   const Ref<Quantity>& distance = totals.pacedDistance.total;
   container.setHidden(!distance);
   if (!distance) return container.show(nullptr, nullptr, nullptr);
-  const double pace = CHWorkoutDataCalculator::pace(distance, totals.pacedSeconds);
-  const Ref<Unit> unit = CHWorkoutDataCalculator::unitOf(distance);
+  const ShownPace pace = CHWorkoutDataCalculator::shownPace(
+      CHWorkoutDataCalculator::pace(distance, totals.pacedSeconds), distance, totals.pacedActivityType);
   container.show(hostText("pace.title"), nullptr,
-                 textWithSpokenForm(paceFigure(pace, *unit)->description(), spokenPace(pace, *unit)));
+                 textWithSpokenForm(paceFigure(pace.seconds, *pace.unit)->description(),
+                                    spokenPace(pace.seconds, *pace.unit)));
 }
 
 }  // namespace ax::host

@@ -21,8 +21,10 @@ struct WorkoutTotals {
   double seconds = 0;
   Sum distance;
   Sum energy;
-  double pacedSeconds = 0;  // of the workouts that count for the pace: with a distance, and no rides
+  // Of the workouts with a distance, where all of these are of one sport, and no rides; nil otherwise.
   Sum pacedDistance;
+  double pacedSeconds = 0;
+  std::int64_t pacedActivityType = 0;
 };
 
 // A total, and from two workouts on the average, in a container that hides when there is no total.
