@@ -1,10 +1,13 @@
 #include "reader/graph/ChartDescription.h"
 
+#include "platform/formatting/Dates.h"
 #include "platform/formatting/Durations.h"
 #include "platform/formatting/Numbers.h"
-#include "reader/ReaderStrings.h"
-#include "reader/transcript/SpokenTime.h"
-#include "reader/transcript/Transcript.h"
+#include "platform/health/Unit.h"
+#include "reader/snapshot/Charts.h"
+#include "reader/speech/SpokenLine.h"
+#include "reader/speech/SpokenTime.h"
+#include "reader/text/ReaderStrings.h"
 
 namespace ax::reader {
 
@@ -22,6 +25,13 @@ std::string number(double value) {
 
 std::string words(const std::optional<AttributedText>& text) {
   return text ? withSpokenTimes(*text) : std::string();
+}
+
+// A chart may give a unit as its sign; it is told by its name where it has one.
+std::string unitName(const std::optional<AttributedText>& label) {
+  const std::string text = words(label);
+  const Ref<Unit> unit = Unit::unitFromString(text);
+  return unit ? unit->description() : text;
 }
 
 std::string named(std::string_view key, const std::string& text) {
@@ -59,7 +69,7 @@ std::string separatedFigures(const Lines& figures) {
 
 void addAxis(const DataSeriesAxis& axis, std::string_view key, Lines& lines) {
   add(lines, once,
-      readerText(key, {joined({words(axis.title), named("chart.unit", words(axis.unitLabel)), range(axis),
+      readerText(key, {joined({words(axis.title), named("chart.unit", unitName(axis.unitLabel)), range(axis),
                                count("chart.values", axis.values.size())})}));
   Lines values;
   for (const double value : axis.values) values.push_back(number(value));
@@ -92,24 +102,33 @@ void addElements(const std::vector<const Node*>& elements, Lines& lines) {
 
 void addSlices(const DataSeries& series, Lines& lines) {
   if (!series.usesSlices) return;
-  const auto hours = static_cast<std::int64_t>(series.hoursPerSlice);
-  const bool isWholeHours = hours > 0 && static_cast<double>(hours) * 3600 == series.secondsPerSlice;
   add(lines, once,
       joined({count("chart.slices", series.slices.size()),
-              isWholeHours ? readerText("chart.slice.hours", {hours})
-                           : formatting::spokenDuration(series.secondsPerSlice)}));
-  std::int64_t index = 0;
-  for (const DataSlice& slice : series.slices) {
-    const std::string from = formatting::spokenDuration(slice.start),
-                      to = formatting::spokenDuration(slice.end);
-    const std::string quantity = words(slice.quantity);
-    add(lines, twice,
-        joined({readerText("chart.slice", {++index, readerText("chart.range", {from, to})}),
-                quantity.empty() ? readerText("chart.no.data") : quantity}));
-  }
+              readerText("chart.slice.duration", {formatting::spokenDuration(series.secondsPerSlice)})}));
+  for (std::size_t i = 0; i < series.slices.size(); ++i) add(lines, twice, describeSlice(series, i));
 }
 
 }  // namespace
+
+std::string spokenSpan(const DataSlice& slice) {
+  if (!slice.startTime || !slice.endTime) {
+    return readerText("chart.range",
+                      {formatting::spokenDuration(slice.start), formatting::spokenDuration(slice.end)});
+  }
+  // Shorter slices can begin and end in the same minute.
+  constexpr double minute = 60;
+  const std::string_view clock = slice.end - slice.start < minute ? "h:mm:ssa" : "h:mma";
+  return readerText("chart.range", {formatting::dateString(*slice.startTime, clock),
+                                    formatting::dateString(*slice.endTime, clock)});
+}
+
+std::string describeSlice(const DataSeries& series, std::size_t index) {
+  if (index >= series.slices.size()) return "";
+  const DataSlice& slice = series.slices[index];
+  const std::string quantity = words(slice.quantity);
+  return joined({readerText("chart.slice", {static_cast<std::int64_t>(index) + 1, spokenSpan(slice)}),
+                 quantity.empty() ? readerText("chart.no.data") : quantity});
+}
 
 std::vector<std::string> describeChart(const Snapshot& snapshot, const Node& chart) {
   const DataSeries& series = *chart.series;

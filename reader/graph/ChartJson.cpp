@@ -1,5 +1,7 @@
+#include "platform/formatting/IsoTime.h"
 #include "reader/graph/ChartDescription.h"
-#include "reader/transcript/TextJson.h"
+#include "reader/snapshot/Charts.h"
+#include "reader/text/TextJson.h"
 
 namespace ax::reader {
 
@@ -25,7 +27,6 @@ Json axisAsJson(const DataSeriesAxis& axis) {
 }
 
 void addSeries(const DataSeries& series, Json& json) {
-  json["name"] = textAsJson(series.name);
   json["type"] = series.type;
   json["supportsSummarization"] = series.supportsSummarization;
   json["supportsSonification"] = series.supportsSonification;
@@ -47,7 +48,10 @@ void addSlices(const DataSeries& series, Json& json) {
   json["hoursPerSlice"] = series.hoursPerSlice;
   Json slices = Json::array();
   for (const DataSlice& slice : series.slices) {
-    slices.push_back({{"start", slice.start}, {"end", slice.end}, {"quantity", textAsJson(slice.quantity)}});
+    slices.push_back({{"start", slice.start}, {"end", slice.end}});
+    if (slice.startTime) slices.back()["from"] = formatting::isoWithOffset(*slice.startTime);
+    if (slice.endTime) slices.back()["to"] = formatting::isoWithOffset(*slice.endTime);
+    slices.back()["quantity"] = textAsJson(slice.quantity);
   }
   json["slices"] = std::move(slices);
 }
@@ -56,6 +60,7 @@ void addSlices(const DataSeries& series, Json& json) {
 
 Json chartAsJson(const Snapshot& snapshot, const Node& chart) {
   Json json = {{"id", chart.objectId.empty() ? Json() : Json(chart.objectId)}, {"class", chart.className}};
+  json["name"] = textAsJson(chart.series->name);
   if (chart.series->hasAxes) addSeries(*chart.series, json);
   json["elements"] = elementsAsJson(elementsOfChart(snapshot, chart));
   if (chart.series->usesSlices) addSlices(*chart.series, json);

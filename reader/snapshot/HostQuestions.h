@@ -4,7 +4,7 @@
 #include <optional>
 
 #include "platform/runtime/Message.h"
-#include "reader/snapshot/AttributedText.h"
+#include "reader/text/AttributedText.h"
 
 namespace ax::reader {
 

@@ -7,8 +7,8 @@
 
 #include "platform/runtime/Geometry.h"
 #include "platform/toolkit/Traits.h"
-#include "reader/graph/DataSeries.h"
-#include "reader/snapshot/AttributedText.h"
+#include "reader/snapshot/DataSeries.h"
+#include "reader/text/AttributedText.h"
 
 namespace ax::reader {
 

@@ -11,6 +11,8 @@
 
 namespace ax::reader {
 
+class HostQuestions;
+
 enum class ActionResult {
   done,
   notHandled,   // the object was asked and did nothing
@@ -38,12 +40,13 @@ class Snapshot {
   ActionResult perform(Action action, NodeId id) const;
   // The element under a point in screen space: what the deepest view there that answers hit tests itself
   // says, else the front-most. Null when there is none.
+  const Node* hitTest(Point point, HostQuestions& questions) const;
   const Node* hitTest(Point point) const;
 
  private:
   friend class SnapshotWalk;
 
-  const Node* frontMostElement(const Ref<View>& view, Point point) const;
+  const Node* frontMostElement(const Ref<View>& view, Point point, HostQuestions& questions) const;
 
   std::vector<Node> nodes_;  // ids are consecutive
   std::vector<Weak<Object>> objects_;

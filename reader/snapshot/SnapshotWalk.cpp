@@ -3,8 +3,9 @@
 #include <limits>
 
 #include "platform/toolkit/ElementTree.h"
+#include "platform/toolkit/TreeDepth.h"
 #include "platform/toolkit/ViewController.h"
-#include "reader/graph/DataSeriesReading.h"
+#include "reader/snapshot/DataSeriesReading.h"
 #include "reader/snapshot/NodeReading.h"
 
 namespace ax::reader {
@@ -12,7 +13,6 @@ namespace ax::reader {
 namespace {
 
 constexpr std::size_t nowhere = std::numeric_limits<std::size_t>::max();
-constexpr int deepest = 256;
 
 NodeId lastId = 0;
 
@@ -39,8 +39,8 @@ void SnapshotWalk::visitScreen(Object& screen) {
 }
 
 // The one that is drawn last: it lies in front of the others.
-Ref<Object> SnapshotWalk::frontMostModal(Object& view, int depth) {
-  if (depth > deepest || !_accessibilityViewIsVisible(view)) return nullptr;
+Ref<Object> SnapshotWalk::frontMostModal(Object& view, std::size_t depth) {
+  if (!isWithinDepth(depth) || !isVisible(view)) return nullptr;
   const std::vector<Ref<Object>> children = drawnChildren(view);
   for (auto child = children.rbegin(); child != children.rend(); ++child) {
     if (Ref<Object> modal = frontMostModal(**child, depth + 1)) return modal;
@@ -54,16 +54,21 @@ void SnapshotWalk::visitEach(const Ref<Array>& objects, Place place) {
 }
 
 void SnapshotWalk::visit(Object& object, Place place) {
-  if (place.depth > deepest || !met_.insert(&object).second) return;
+  if (met_.contains(&object) || !isWithinDepth(place.depth)) return;
+  met_.insert(&object);
   kept_.push_back(Ref<Object>(&object));
-  bool isVisible = false;
-  questions_.attempt([&] { isVisible = _accessibilityViewIsVisible(object); });
-  if (!isVisible) return visitInvisible(object, place);
+  if (!isVisible(object)) return visitInvisible(object, place);
   if (!questions_.ask(messages::isAccessibilityElement, object)) return visitContainer(object, place);
   Node node = readNode(object, questions_);
   node.isElement = true;
   node.series = readDataSeries(object, questions_);
   add(std::move(node), object, place);
+}
+
+bool SnapshotWalk::isVisible(Object& object) {
+  bool isVisible = false;
+  questions_.attempt([&] { isVisible = _accessibilityViewIsVisible(object); });
+  return isVisible;
 }
 
 // A view may claim to be visible inside one that is not.

@@ -19,7 +19,7 @@ class SnapshotWalk {
  private:
   struct Place {
     std::size_t parent;  // an index into the nodes, or none
-    int depth;
+    std::size_t depth;
   };
 
   void visitScreen(Object& screen);
@@ -30,7 +30,8 @@ class SnapshotWalk {
   void visitChildren(Object& object, Place place);
   void visitInvisible(Object& object, Place place);
 
-  Ref<Object> frontMostModal(Object& view, int depth);
+  Ref<Object> frontMostModal(Object& view, std::size_t depth);
+  bool isVisible(Object& object);
   Ref<Array> childrenInReadingOrder(Object& object);
   void addTitle(const Ref<Object>& item, const Ref<String>& title, Place place);
   void add(Node node, Object& object, Place place);

@@ -1,108 +1,29 @@
 #include "reader/transcript/Transcript.h"
 
-#include <algorithm>
+#include <utility>
 
-#include "platform/formatting/Lists.h"
-#include "reader/ReaderStrings.h"
-#include "reader/graph/ChartDescription.h"
-#include "reader/transcript/SpokenTime.h"
+#include "reader/speech/SpokenLine.h"
+#include "reader/text/ReaderStrings.h"
 
 namespace ax::reader {
 
-namespace {
-
-struct TraitWord {
-  Traits trait;
-  std::string_view key;
-};
-
-// Static text has no word: it is what is expected.
-constexpr TraitWord traitWords[] = {{TraitHeader, "role.header"},
-                                    {TraitButton, "role.button"},
-                                    {TraitLink, "role.link"},
-                                    {TraitImage, "role.image"},
-                                    {TraitAdjustable, "role.adjustable"},
-                                    {TraitSelected, "state.selected"},
-                                    {TraitNotEnabled, "state.disabled"}};
-
-// Line breaks become pauses, runs of blanks one blank.
-std::string onOneLine(const std::string& text) {
-  std::string line;
-  for (std::size_t i = 0; i < text.size();) {
-    const std::size_t end = std::min(text.find_first_not_of(" \t\r\n", i), text.size());
-    if (end == i) {
-      line += text[i++];
-      continue;
-    }
-    const bool isBreak = text.find_first_of("\r\n", i) < end;
-    if (!line.empty() && end < text.size()) line += isBreak ? formatting::listSeparator() : " ";
-    i = end;
-  }
-  return line;
-}
-
-class SpokenPieces {
- public:
-  void add(const std::optional<AttributedText>& text) {
-    if (text) add(onOneLine(withSpokenTimes(*text)));
-  }
-  void add(std::string piece) {
-    if (!piece.empty() && !isSaid(piece)) pieces_.push_back(std::move(piece));
-  }
-  std::string line() const { return joined(pieces_); }
-
- private:
-  // Whether a piece, or whole parts of one, say the same.
-  bool isSaid(const std::string& piece) const {
-    const std::string separator(formatting::listSeparator());
-    const std::string part = separator + piece + separator;
-    return std::ranges::any_of(pieces_, [&](const std::string& said) {
-      return (separator + said + separator).find(part) != std::string::npos;
-    });
-  }
-
-  std::vector<std::string> pieces_;
-};
-
-void addStates(const Node& node, SpokenPieces& pieces) {
-  for (const TraitWord& word : traitWords) {
-    if ((node.traits & word.trait) != 0) pieces.add(readerText(word.key));
-  }
-  if (node.series) pieces.add(readerText("role.chart"));
-  if (node.states.expanded) pieces.add(readerText("state.expanded"));
-  if (node.states.collapsed) pieces.add(readerText("state.collapsed"));
-  if (node.states.modal) pieces.add(readerText("state.modal"));
-}
-
-// A chart with a name but nothing in it to step to would otherwise pass unheard.
-bool isSpoken(const Snapshot& snapshot, const Node& node) {
-  const bool isNamedChart = node.series && (node.label || node.series->name);
-  return node.isElement || (isNamedChart && elementsOfChart(snapshot, node).empty());
-}
-
-}  // namespace
-
-std::string spokenLine(const Node& node) {
-  SpokenPieces pieces;
-  pieces.add(node.label);
-  if (node.series && !node.label) pieces.add(node.series->name);
-  pieces.add(node.value);
-  addStates(node, pieces);
-  pieces.add(node.hint);
-  return pieces.line();
-}
-
-std::vector<std::string> transcript(const Snapshot& snapshot, const std::string& title) {
-  std::vector<std::string> lines = {title.empty() ? readerText("screen.untitled")
-                                                  : readerText("screen.title", {onOneLine(title)})};
+std::vector<SpokenNode> spokenNodes(const Snapshot& snapshot) {
+  std::vector<SpokenNode> spoken;
   bool isModalAhead = false;
   for (Node node : snapshot.nodes()) {
     isModalAhead |= node.states.modal;
     if (!isSpoken(snapshot, node)) continue;
     node.states.modal = std::exchange(isModalAhead, false);
     std::string line = spokenLine(node);
-    if (!line.empty()) lines.push_back(std::move(line));
+    if (!line.empty()) spoken.push_back({node.id, std::move(line), node.states.modal});
   }
+  return spoken;
+}
+
+std::vector<std::string> transcript(const Snapshot& snapshot, const std::string& title) {
+  std::vector<std::string> lines = {title.empty() ? readerText("screen.untitled")
+                                                  : readerText("screen.title", {onOneLine(title)})};
+  for (SpokenNode& spoken : spokenNodes(snapshot)) lines.push_back(std::move(spoken.line));
   if (lines.size() == 1) lines.push_back(readerText("screen.empty"));
   return lines;
 }

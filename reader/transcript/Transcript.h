@@ -9,9 +9,15 @@
 // only.
 namespace ax::reader {
 
-// One line, without blanks at its ends and without any text twice: label, value, what it is and how it
-// stands, hint. Empty for a node that has nothing to say.
-std::string spokenLine(const Node& node);
+// A node that is read, and how.
+struct SpokenNode {
+  NodeId node = 0;
+  std::string line = {};    // never empty
+  bool opensModal = false;  // the first in what covers the rest of the screen; its line says so
+};
+
+// What is spoken of a screen, in reading order: each element, and a chart with a name that holds none.
+std::vector<SpokenNode> spokenNodes(const Snapshot& snapshot);
 
 // The screen's title, then a line for each element in reading order, and for a chart with a name that holds
 // none. What covers the rest of the screen says so with its first element.

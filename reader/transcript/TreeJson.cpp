@@ -1,7 +1,7 @@
 #include "reader/transcript/TreeJson.h"
 
-#include "reader/scene/Reply.h"
-#include "reader/transcript/TextJson.h"
+#include "reader/text/TextJson.h"
+#include "reader/text/TraitNames.h"
 
 namespace ax::reader {
 

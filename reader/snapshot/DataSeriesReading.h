@@ -2,7 +2,7 @@
 
 #include <optional>
 
-#include "reader/graph/DataSeries.h"
+#include "reader/snapshot/DataSeries.h"
 #include "reader/snapshot/HostQuestions.h"
 
 namespace ax::reader {

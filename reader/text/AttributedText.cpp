@@ -1,4 +1,4 @@
-#include "reader/snapshot/AttributedText.h"
+#include "reader/text/AttributedText.h"
 
 #include <algorithm>
 

@@ -1,4 +1,4 @@
-#include "reader/graph/ChartDescription.h"
+#include "reader/snapshot/Charts.h"
 
 namespace ax::reader {
 

@@ -4,7 +4,7 @@
 #include <string>
 #include <string_view>
 
-#include "reader/snapshot/AttributedText.h"
+#include "reader/text/AttributedText.h"
 
 // How times that stand as digits in a text are spoken. Main thread only.
 namespace ax::reader {

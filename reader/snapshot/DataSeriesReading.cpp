@@ -1,9 +1,10 @@
-#include "reader/graph/DataSeriesReading.h"
+#include "reader/snapshot/DataSeriesReading.h"
 
 #include <algorithm>
 
 #include "platform/toolkit/AccessibilityMessages.h"
 #include "platform/toolkit/DataSeriesMessages.h"
+#include "reader/snapshot/SliceChart.h"
 
 namespace ax::reader {
 
@@ -52,10 +53,18 @@ void readSlices(Object& chart, HostQuestions& questions, DataSeries& series) {
   const std::uint64_t count = std::min(questions.ask(_accessibilityNumberOfSlices, chart), mostSlices);
   series.secondsPerSlice = questions.ask(_accessibilityTimeIntervalPerSlice, chart);
   series.hoursPerSlice = questions.ask(_accessibilityHoursPerSlice, chart);
+  const SliceTimes times(chart);
   for (std::uint64_t i = 0; i < count; ++i) {
-    series.slices.push_back({double(i) * series.secondsPerSlice, double(i + 1) * series.secondsPerSlice,
-                             questions.askText(_accessibilityQuantityForSliceAtIndex, chart, i)});
+    const double start = double(i) * series.secondsPerSlice, end = double(i + 1) * series.secondsPerSlice;
+    series.slices.push_back({start, end, questions.askText(_accessibilityQuantityForSliceAtIndex, chart, i),
+                             times.after(start), times.after(end)});
   }
+}
+
+std::optional<AttributedText> ownLabelOr(std::optional<AttributedText> name, Object& chart,
+                                         HostQuestions& questions) {
+  auto label = questions.askText(accessibilityLabel, chart);
+  return label && !label->text.empty() ? label : name;
 }
 
 }  // namespace
@@ -67,6 +76,7 @@ std::optional<DataSeries> readDataSeries(Object& object, HostQuestions& question
   if (!series.hasAxes && !series.usesSlices) return std::nullopt;
   if (series.hasAxes) readSeries(object, questions, series);
   if (series.usesSlices) readSlices(object, questions, series);
+  if (!series.hasAxes) series.name = ownLabelOr(nameOfSliceChart(object, questions), object, questions);
   return series;
 }
 

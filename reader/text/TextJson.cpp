@@ -1,4 +1,4 @@
-#include "reader/transcript/TextJson.h"
+#include "reader/text/TextJson.h"
 
 namespace ax::reader {
 

@@ -1,16 +1,14 @@
-#include "reader/transcript/SpokenTime.h"
+#include "reader/speech/SpokenTime.h"
 
 #include <cmath>
 
 #include "platform/formatting/Durations.h"
 #include "platform/formatting/Numbers.h"
-#include "reader/ReaderStrings.h"
 
 namespace ax::reader {
 
 namespace {
 
-constexpr double secondsPerHour = 3600;
 constexpr std::string_view directionMarks[] = {"\u200e", "\u200f", "\u061c"};
 
 std::string withoutDirectionMarks(std::string text) {
@@ -32,21 +30,12 @@ bool isField(double value, bool isFirst, bool isLast) {
          (isLast || value == std::floor(value));
 }
 
-// Minutes are not gathered into hours: that is how a pace is told.
-std::string minutesAndSeconds(double seconds) {
-  if (std::round(seconds) < secondsPerHour) return formatting::spokenDuration(seconds);
-  const auto whole = std::llround(std::min(seconds, 9e15));
-  std::vector<std::string> parts = {readerText("duration.minutes", {std::int64_t(whole / 60)})};
-  if (whole % 60 != 0) parts.push_back(readerText("duration.seconds", {std::int64_t(whole % 60)}));
-  return joined(parts);
-}
-
 std::optional<std::string> spokenTime(std::string_view key, std::string_view text) {
   const bool isMinutesAndSeconds = key == DurationTimeMMSS.name();
   if (!isMinutesAndSeconds && key != DurationTimeHHMMSS.name()) return std::nullopt;
   const std::optional<double> seconds = secondsFromText(text);
   if (!seconds) return std::nullopt;
-  return isMinutesAndSeconds ? minutesAndSeconds(*seconds) : formatting::spokenDuration(*seconds);
+  return isMinutesAndSeconds ? formatting::spokenMinutes(*seconds) : formatting::spokenDuration(*seconds);
 }
 
 }  // namespace

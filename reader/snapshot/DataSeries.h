@@ -6,7 +6,7 @@
 #include <string>
 #include <vector>
 
-#include "reader/snapshot/AttributedText.h"
+#include "reader/text/AttributedText.h"
 
 namespace ax::reader {
 
@@ -29,12 +29,14 @@ struct DataSlice {
   double start;  // seconds after the beginning of the chart's time
   double end;
   std::optional<AttributedText> quantity;
+  std::optional<double> startTime = {};  // seconds since 1970, where the chart tells when it begins
+  std::optional<double> endTime = {};
 };
 
 // A chart as it describes itself: as a data series with two axes, as a row of time slices, or both.
 struct DataSeries {
-  bool hasAxes = false;  // else name, type, flags and axes say nothing
-  std::optional<AttributedText> name;
+  bool hasAxes = false;                // else type, flags and axes say nothing
+  std::optional<AttributedText> name;  // its own; of slices alone, what stands for one
   std::int64_t type = 0;
   bool supportsSummarization = false;
   bool supportsSonification = false;
