@@ -1,6 +1,7 @@
 #include "reader/importers/GpxFile.h"
 
 #include "reader/importers/IsoTime.h"
+#include "reader/importers/PointFigures.h"
 #include "reader/importers/RouteMeasures.h"
 #include "reader/importers/Sport.h"
 #include "reader/importers/XmlFields.h"
@@ -8,14 +9,36 @@
 namespace ax::reader {
 namespace {
 
+struct ExtensionField {
+  std::string_view name;
+  std::optional<float> TrackPoint::*field;
+  NumberLimits limits;
+};
+
+constexpr ExtensionField extensionFields[] = {
+    {"hr", &TrackPoint::heartRate, heartRates},
+    {"cad", &TrackPoint::cadence, cadences},
+    {"power", &TrackPoint::power, powers},
+    {"PowerInWatts", &TrackPoint::power, powers},
+};
+
+// Writers nest them differently: directly, or in an extension element of their own.
+void readExtensions(pugi::xml_node node, TrackPoint& point) {
+  for (const pugi::xml_node child : node) {
+    for (const ExtensionField& each : extensionFields) {
+      if (localName(child) == each.name) point.*each.field = parseShort(textOf(child), each.limits);
+    }
+    readExtensions(child, point);
+  }
+}
+
 TrackPoint readPoint(pugi::xml_node node, double time) {
   TrackPoint point;
   point.time = time;
   point.latitude = parseNumber(node.attribute("lat").value(), latitudes);
   point.longitude = parseNumber(node.attribute("lon").value(), longitudes);
-  // Writers nest it differently: directly, or in an extension element of their own.
-  const pugi::xml_node heartRate = descendantNamed(childNamed(node, "extensions"), "hr");
-  point.heartRate = parseNumber(textOf(heartRate), heartRates);
+  point.altitude = parseShort(textOf(childNamed(node, "ele")), altitudes);
+  readExtensions(childNamed(node, "extensions"), point);
   dropFalsePosition(point);
   return point;
 }
@@ -23,13 +46,14 @@ TrackPoint readPoint(pugi::xml_node node, double time) {
 void appendSegment(pugi::xml_node node, WorkoutActivity& activity) {
   PointRange range{.first = activity.points.size()};
   for (const pugi::xml_node point : childrenNamed(node, "trkpt")) {
-    const auto time = parseIsoTime(textOf(childNamed(point, "time")));
-    if (time) activity.points.push_back(readPoint(point, *time));
+    const std::string text = textOf(childNamed(point, "time"));
+    const auto time = parseIsoTime(text);
+    if (!time) continue;
+    if (activity.points.empty()) activity.secondsEastOfUtc = offsetOfIsoTime(text);
+    activity.points.push_back(readPoint(point, *time));
   }
   range.count = activity.points.size() - range.first;
-  if (range.count == 0) return;
-  activity.activeSeconds += secondsOf(pointsIn(activity, range));
-  activity.segments.push_back(range);
+  if (range.count > 0) activity.segments.push_back(range);
 }
 
 WorkoutActivity readTrack(pugi::xml_node node) {
@@ -39,9 +63,7 @@ WorkoutActivity readTrack(pugi::xml_node node) {
   for (const pugi::xml_node segment : childrenNamed(node, "trkseg")) appendSegment(segment, activity);
   fillDistances(activity);
   fillTimes(activity);
-  // Some writers open a segment for every point.
-  if (activity.activeSeconds == 0) activity.activeSeconds = activity.duration;
-  for (const TrackPoint& point : activity.points) activity.metres = point.distance.value_or(activity.metres);
+  completeFigures(activity);
   return activity;
 }
 

@@ -85,9 +85,13 @@ std::optional<double> takeOffset(Scanner& scanner) {
   return direction * (*hours * 3600.0 + *minutes * 60.0);
 }
 
-}  // namespace
+struct IsoTime {
+  double local;
+  double offset;
+  bool tellsOffset;
+};
 
-std::optional<double> parseIsoTime(std::string_view text) {
+std::optional<IsoTime> takeTime(std::string_view text) {
   constexpr std::string_view blanks = " \t\r\n";
   text = text.substr(0, text.find_last_not_of(blanks) + 1);
   Scanner scanner{text.substr(std::min(text.find_first_not_of(blanks), text.size()))};
@@ -95,9 +99,22 @@ std::optional<double> parseIsoTime(std::string_view text) {
   if (!date || !scanner.take("Tt ")) return std::nullopt;
   const auto clock = takeClock(scanner);
   if (!clock) return std::nullopt;
+  const bool tellsOffset = !scanner.rest.empty() && scanner.rest.find_first_of("Zz") != 0;
   const auto offset = takeOffset(scanner);
   if (!offset || !scanner.rest.empty()) return std::nullopt;
-  return *date + *clock - *offset;
+  return IsoTime{*date + *clock, *offset, tellsOffset};
+}
+
+}  // namespace
+
+std::optional<double> parseIsoTime(std::string_view text) {
+  const auto time = takeTime(text);
+  return time ? std::optional(time->local - time->offset) : std::nullopt;
+}
+
+std::optional<double> offsetOfIsoTime(std::string_view text) {
+  const auto time = takeTime(text);
+  return time && time->tellsOffset ? std::optional(time->offset) : std::nullopt;
 }
 
 }  // namespace ax::reader

@@ -10,4 +10,7 @@ namespace ax::reader {
 // else, such as 30 February.
 std::optional<double> parseIsoTime(std::string_view text);
 
+// The offset of such a text in seconds east of UTC; empty for "Z" and for none, which tell no local time.
+std::optional<double> offsetOfIsoTime(std::string_view text);
+
 }  // namespace ax::reader

@@ -57,6 +57,12 @@ void fillDistances(WorkoutActivity& activity) {
   }
 }
 
+double lastDistance(const WorkoutActivity& activity) {
+  double last = 0;
+  for (const TrackPoint& point : activity.points) last = point.distance.value_or(last);
+  return last;
+}
+
 void fillTimes(WorkoutActivity& activity) {
   double first = std::numeric_limits<double>::infinity();
   double last = -first;

@@ -22,6 +22,9 @@ void dropFalsePosition(TrackPoint& point);
 // Gives every point with a position its distance along the route, unless the file recorded distances.
 void fillDistances(WorkoutActivity& activity);
 
+// Of the last point that has one; 0 where none has.
+double lastDistance(const WorkoutActivity& activity);
+
 // The start and duration: of the points, or where there are none, of the laps.
 void fillTimes(WorkoutActivity& activity);
 

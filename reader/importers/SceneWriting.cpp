@@ -32,13 +32,8 @@ Json sceneDate(double time) {
   return {{"date", text}};
 }
 
-double sceneNumber(double value) {
-  constexpr double places = 1e4;
-  return std::round(value * places) / places;
-}
-
 Json sceneQuantity(double value, const std::string& unit) {
-  return {{"quantity", {sceneNumber(value), unit}}};
+  return {{"quantity", {value, unit}}};
 }
 
 Json appText(const std::string& key) {

@@ -9,8 +9,7 @@ namespace ax::reader {
 
 // An instant to the millisecond, with the offset of the current time zone.
 nlohmann::ordered_json sceneDate(double time);
-// Figures are rounded to four decimals.
-double sceneNumber(double value);
+// Not rounded: the app does so once, where it shows the figure.
 nlohmann::ordered_json sceneQuantity(double value, const std::string& unit);
 // A text of the app's own, by its key.
 nlohmann::ordered_json appText(const std::string& key);

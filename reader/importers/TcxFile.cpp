@@ -1,6 +1,7 @@
 #include "reader/importers/TcxFile.h"
 
 #include "reader/importers/IsoTime.h"
+#include "reader/importers/PointFigures.h"
 #include "reader/importers/RouteMeasures.h"
 #include "reader/importers/Sport.h"
 #include "reader/importers/XmlFields.h"
@@ -18,7 +19,36 @@ constexpr PointField pointFields[] = {
     {"Position/LatitudeDegrees", &TrackPoint::latitude, latitudes},
     {"Position/LongitudeDegrees", &TrackPoint::longitude, longitudes},
     {"DistanceMeters", &TrackPoint::distance, notNegative},
+};
+
+struct ShortField {
+  std::string_view path;
+  std::optional<float> TrackPoint::*field;
+  NumberLimits limits;
+};
+
+// The later ones of a point take the place of the earlier ones.
+constexpr ShortField shortFields[] = {
     {"HeartRateBpm/Value", &TrackPoint::heartRate, heartRates},
+    {"AltitudeMeters", &TrackPoint::altitude, altitudes},
+    {"Cadence", &TrackPoint::cadence, cadences},
+    {"Extensions/TPX/RunCadence", &TrackPoint::cadence, cadences},
+    {"Extensions/TPX/Watts", &TrackPoint::power, powers},
+};
+
+struct LapField {
+  std::string_view path;
+  std::optional<double> Measures::*field;
+  NumberLimits limits;
+};
+
+constexpr LapField lapFields[] = {
+    {"Calories", &Measures::kilocalories, notNegative},
+    {"AverageHeartRateBpm/Value", &Measures::averageHeartRate, heartRates},
+    {"MaximumHeartRateBpm/Value", &Measures::maximumHeartRate, heartRates},
+    {"Cadence", &Measures::averageCadence, {1, 254}},
+    {"Extensions/LX/AvgRunCadence", &Measures::averageCadence, {1, 254}},
+    {"Extensions/LX/AvgWatts", &Measures::averagePower, {1, 10000}},
 };
 
 std::optional<double> amountIn(pugi::xml_node node, std::string_view path) {
@@ -28,12 +58,18 @@ std::optional<double> amountIn(pugi::xml_node node, std::string_view path) {
 PointRange appendTrack(pugi::xml_node track, WorkoutActivity& activity) {
   const std::size_t first = activity.points.size();
   for (const pugi::xml_node node : childrenNamed(track, "Trackpoint")) {
-    const auto time = parseIsoTime(textOf(childNamed(node, "Time")));
+    const std::string text = textOf(childNamed(node, "Time"));
+    const auto time = parseIsoTime(text);
     if (!time) continue;
+    if (activity.points.empty()) activity.secondsEastOfUtc = offsetOfIsoTime(text);
     TrackPoint point;
     point.time = *time;
     for (const PointField& each : pointFields) {
       point.*each.field = parseNumber(textOf(childAt(node, each.path)), each.limits);
+    }
+    for (const ShortField& each : shortFields) {
+      const auto value = parseShort(textOf(childAt(node, each.path)), each.limits);
+      if (value) point.*each.field = value;
     }
     dropFalsePosition(point);
     activity.points.push_back(point);
@@ -71,7 +107,11 @@ void appendLap(pugi::xml_node node, WorkoutActivity& activity) {
   const double clock = amountIn(node, "TotalTimeSeconds").value_or(0);
   lap.seconds = clock > 0 ? clock : trackSeconds;
   lap.metres = amountIn(node, "DistanceMeters").value_or(0);
-  lap.kilocalories = amountIn(node, "Calories");
+  lap.isRest = textOf(childNamed(node, "Intensity")) == "Resting";
+  for (const LapField& each : lapFields) {
+    const auto value = parseNumber(textOf(childAt(node, each.path)), each.limits);
+    if (value) lap.told.*each.field = value;
+  }
   activity.laps.push_back(lap);
 }
 
@@ -87,25 +127,21 @@ void measureLaps(WorkoutActivity& activity) {
   }
 }
 
-void sumLaps(WorkoutActivity& activity) {
-  for (const Lap& lap : activity.laps) {
-    activity.activeSeconds += lap.seconds;
-    activity.metres += lap.metres;
-    if (lap.kilocalories) activity.kilocalories = activity.kilocalories.value_or(0) + *lap.kilocalories;
-  }
-}
-
-WorkoutActivity readActivity(pugi::xml_node node, const std::string& author) {
+// `counted` is the distance at which the activity before ended, by a count that may go on through the file.
+WorkoutActivity readActivity(pugi::xml_node node, const std::string& author, double& counted) {
   WorkoutActivity activity;
   activity.title = lineOf(textOf(childNamed(node, "Notes")));
   activity.sport = sportNamed(node.attribute("Sport").value());
   activity.sourceName = lineOf(textOf(childAt(node, "Creator/Name")));
   if (activity.sourceName.empty()) activity.sourceName = author;
   for (const pugi::xml_node lap : childrenNamed(node, "Lap")) appendLap(lap, activity);
+  const double end = lastDistance(activity);
+  beginDistancesAtZero(activity, counted);
+  counted = end;
   fillDistances(activity);
   fillTimes(activity);
   measureLaps(activity);
-  sumLaps(activity);
+  completeFigures(activity);
   return activity;
 }
 
@@ -115,11 +151,13 @@ WorkoutActivity readActivity(pugi::xml_node node, const std::string& author) {
 std::vector<WorkoutActivity> readTcx(pugi::xml_node root) {
   std::vector<WorkoutActivity> activities;
   const std::string author = lineOf(textOf(childAt(root, "Author/Name")));
+  double counted = 0;
   for (const pugi::xml_node node : childNamed(root, "Activities")) {
-    if (localName(node) == "Activity") activities.push_back(readActivity(node, author));
+    if (localName(node) == "Activity") activities.push_back(readActivity(node, author, counted));
     if (localName(node) != "MultiSportSession") continue;
     for (const pugi::xml_node leg : node) {
-      for (const auto part : childrenNamed(leg, "Activity")) activities.push_back(readActivity(part, author));
+      for (const auto part : childrenNamed(leg, "Activity"))
+        activities.push_back(readActivity(part, author, counted));
     }
   }
   return activities;

@@ -1,7 +1,10 @@
 #include "reader/importers/TextEncoding.h"
 
 #include <algorithm>
-#include <pugixml.hpp>
+#include <cctype>
+#include <optional>
+
+#include "platform/formatting/Encodings.h"
 
 namespace ax::reader {
 namespace {
@@ -27,33 +30,43 @@ std::size_t characterLength(std::string_view bytes, std::size_t index) {
   return length;
 }
 
-std::string fromUtf16(std::string_view bytes, bool bigEndian) {
-  std::wstring wide;
-  for (std::size_t i = 0; i + 1 < bytes.size(); i += 2) {
-    const unsigned high = byteAt(bytes, bigEndian ? i : i + 1);
-    const unsigned low = byteAt(bytes, bigEndian ? i + 1 : i);
-    const auto unit = static_cast<wchar_t>(high << 8 | low);
-    const bool completes =
-        unit >= 0xDC00 && unit < 0xE000 && !wide.empty() && wide.back() >= 0xD800 && wide.back() < 0xDC00;
-    if (completes) {
-      wide.back() = ((wide.back() - 0xD800) << 10) + (unit - 0xDC00) + 0x10000;
-    } else {
-      wide += unit;
-    }
+bool hasCharacterBeyondAscii(std::string_view bytes) {
+  for (std::size_t i = 0; i < bytes.size(); ++i) {
+    if (byteAt(bytes, i) >= 0x80 && characterLength(bytes, i) > 0) return true;
   }
-  return pugi::as_utf8(wide);
+  return false;
 }
 
-std::string fromLatin1(std::string_view bytes) {
-  std::string text;
-  text.reserve(bytes.size());
-  for (std::size_t i = 0; i < bytes.size(); ++i) {
-    const unsigned code = byteAt(bytes, i);
-    if (code >= 0x80) text += static_cast<char>(0xC0 | code >> 6);
-    text += static_cast<char>(code < 0x80 ? code : (0x80 | (code & 0x3F)));
-  }
-  return text;
+// The name in <?xml version="1.0" encoding="KOI8-R"?>.
+std::string declaredEncoding(std::string_view text) {
+  if (!text.starts_with("<?xml")) return {};
+  const std::string_view declaration = text.substr(0, text.find("?>"));
+  const std::size_t key = declaration.find("encoding");
+  if (key == std::string_view::npos) return {};
+  const std::size_t quote = declaration.find_first_of("\"'", key);
+  if (quote == std::string_view::npos) return {};
+  const std::string_view rest = declaration.substr(quote + 1);
+  return std::string(rest.substr(0, rest.find(declaration[quote])));
 }
+
+// UTF-16 is none where its bytes have not shown it.
+bool isUtf8Name(std::string name) {
+  std::ranges::transform(name, name.begin(),
+                         [](unsigned char c) { return static_cast<char>(std::tolower(c)); });
+  return name == "utf-8" || name == "utf8" || name == "us-ascii" || name.starts_with("utf-16");
+}
+
+// UTF-16 without any doubt, from the first two bytes.
+struct WideStart {
+  std::string_view start;
+  const char* encoding;
+  bool isMark;
+};
+constexpr std::string_view openLittle("<\0", 2), openBig("\0<", 2);
+constexpr WideStart wideStarts[] = {{"\xFF\xFE", "UTF-16LE", true},
+                                    {"\xFE\xFF", "UTF-16BE", true},
+                                    {openLittle, "UTF-16LE", false},
+                                    {openBig, "UTF-16BE", false}};
 
 }  // namespace
 
@@ -66,16 +79,27 @@ bool isUtf8(std::string_view bytes) {
   return true;
 }
 
-std::string toUtf8(std::string_view bytes) {
-  using namespace std::string_view_literals;
-  if (bytes.starts_with("\xFF\xFE")) return fromUtf16(bytes.substr(2), false);
-  if (bytes.starts_with("\xFE\xFF")) return fromUtf16(bytes.substr(2), true);
-  if (bytes.starts_with("<\0"sv)) return fromUtf16(bytes, false);
-  if (bytes.starts_with("\0<"sv)) return fromUtf16(bytes, true);
-  std::string text(bytes);
+std::string_view toUtf8(std::string_view bytes, std::string& kept) {
+  for (const auto& [start, encoding, isMark] : wideStarts) {
+    if (!bytes.starts_with(start)) continue;
+    kept = formatting::utf8FromEncoding(bytes.substr(isMark ? start.size() : 0), encoding).value_or("");
+    return kept;
+  }
   const std::size_t start = std::min(bytes.find_first_not_of(" \t\r\n"), bytes.size());
-  if (bytes.substr(start).starts_with("\xEF\xBB\xBF")) text.erase(start, 3);
-  return isUtf8(text) ? text : fromLatin1(text);
+  const bool isMarked = bytes.substr(start).starts_with("\xEF\xBB\xBF");
+  if (isMarked && start == 0) bytes.remove_prefix(3);
+  if (isMarked && start != 0) {
+    kept = std::string(bytes).erase(start, 3);
+    bytes = kept;
+  }
+  const std::string declared = isMarked ? "" : declaredEncoding(bytes.substr(start));
+  const bool isOwn = declared.empty() || isUtf8Name(declared);
+  if (isOwn && isUtf8(bytes)) return bytes;
+  const bool isOther = declared.empty() && !isMarked && !hasCharacterBeyondAscii(bytes);
+  auto text = formatting::utf8FromEncoding(bytes, isOther ? "windows-1252" : isOwn ? "UTF-8" : declared);
+  if (!text) text = formatting::utf8FromEncoding(bytes, "UTF-8");
+  kept = std::move(text).value_or("");
+  return kept;
 }
 
 }  // namespace ax::reader

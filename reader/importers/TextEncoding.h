@@ -8,8 +8,10 @@ namespace ax::reader {
 bool isUtf8(std::string_view bytes);
 
 // The text without its byte-order mark, which may follow blanks. UTF-16 is known by its mark or by the zero
-// byte beside the first character; anything else that is not UTF-8 is taken as Latin-1, whatever the file
-// says of itself.
-std::string toUtf8(std::string_view bytes);
+// byte beside the first character; otherwise the encoding counts that an XML declaration names. Without one
+// the text is UTF-8, or where no byte beyond ASCII belongs to a character of it, windows-1252. A byte that
+// stands for nothing becomes U+FFFD and changes nothing else. `kept` holds the text where it is not the bytes
+// themselves.
+std::string_view toUtf8(std::string_view bytes, std::string& kept);
 
 }  // namespace ax::reader

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <iterator>
 
+#include "reader/importers/FitFile.h"
 #include "reader/importers/GpxFile.h"
 #include "reader/importers/TcxFile.h"
 #include "reader/importers/XmlFields.h"
@@ -26,11 +27,11 @@ constexpr FileKind kinds[] = {
 };
 
 bool tellsNothing(const WorkoutActivity& activity) {
-  return activity.points.empty() && activity.laps.empty();
+  return activity.points.empty() && activity.laps.empty() && activity.duration == 0;
 }
 
 WorkoutFileResult readKind(const FileKind& kind, pugi::xml_node root) {
-  WorkoutFile file{kind.read(root)};
+  WorkoutFile file{kind.read(root), std::nullopt};
   const std::string home(kind.home);
   const std::string activity(kind.activity);
   if (file.activities.empty()) {
@@ -44,21 +45,43 @@ WorkoutFileResult readKind(const FileKind& kind, pugi::xml_node root) {
   return file;
 }
 
-WorkoutFileResult readDocument(const XmlText& xml) {
-  if (auto fault = xml.fault()) return *std::move(fault);
+WorkoutFileResult readDocument(const XmlText& xml, const WorkoutReadOptions& options) {
+  auto fault = xml.fault();
+  if (fault && (!options.readsDamaged || !xml.root())) return *std::move(fault);
   const std::string_view found = localName(xml.root());
   const auto kind = std::ranges::find(kinds, found, &FileKind::root);
-  if (kind != std::end(kinds)) return readKind(*kind, xml.root());
-  return WorkoutFileFault{"", xml.placeOf(xml.root()), "the root element is " + std::string(found),
-                          "TrainingCenterDatabase or gpx"};
+  if (kind == std::end(kinds)) {
+    return WorkoutFileFault{"", xml.placeOf(xml.root()), "the root element is " + std::string(found),
+                            "TrainingCenterDatabase or gpx"};
+  }
+  WorkoutFileResult result = readKind(*kind, xml.root());
+  if (auto* file = std::get_if<WorkoutFile>(&result)) file->damage = std::move(fault);
+  return result;
+}
+
+WorkoutFileResult readFitFile(std::string_view bytes, const WorkoutReadOptions& options) {
+  FitContent content = readFit(bytes);
+  WorkoutFile file{std::move(content.activities), std::nullopt};
+  if (content.fault) {
+    file.damage = {"", "byte " + std::to_string(content.fault->at), content.fault->what,
+                   content.fault->expected};
+    if (!options.readsDamaged) return *std::move(file.damage);
+  }
+  std::erase_if(file.activities, tellsNothing);
+  if (!file.activities.empty()) return file;
+  if (file.damage) return *std::move(file.damage);
+  return WorkoutFileFault{"", "byte 0", "a FIT file without a workout", "an activity with records"};
 }
 
 }  // namespace
 
-WorkoutFileResult readWorkoutFile(std::string_view bytes, std::string_view name) {
-  const XmlText xml(bytes);
-  WorkoutFileResult result = readDocument(xml);
+WorkoutFileResult readWorkoutFile(std::string_view bytes, std::string_view name,
+                                  const WorkoutReadOptions& options) {
+  WorkoutFileResult result =
+      isFit(bytes) ? readFitFile(bytes, options) : readDocument(XmlText(bytes), options);
   if (auto* fault = std::get_if<WorkoutFileFault>(&result)) fault->file = name;
+  if (auto* file = std::get_if<WorkoutFile>(&result); file != nullptr && file->damage)
+    file->damage->file = name;
   return result;
 }
 

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <array>
+#include <vector>
 
 #include "platform/health/Workout.h"
 #include "reader/importers/SceneWriting.h"
@@ -15,6 +16,10 @@ const DistanceUnit miles{"mi", 1609.344};
 
 namespace {
 
+const DistanceUnit meters{"m", 1};
+const DistanceUnit yards{"yd", 0.9144};
+const DistanceUnit feet{"ft", 0.3048};
+
 constexpr std::array<std::string_view, 4> regionsInMiles = {"US", "GB", "LR", "MM"};
 
 // "US" of "en_US" or "en_Latn_US"; empty when the locale names no region.
@@ -24,15 +29,51 @@ std::string_view regionOf(std::string_view locale) {
   return last == std::string_view::npos ? std::string_view() : locale.substr(last + 1);
 }
 
-bool isDated(const WorkoutActivity& activity) {
-  return !activity.points.empty() || !activity.laps.empty();
-}
-
 Json sourceRevision(const std::string& name) {
   return sceneObject("SourceRevision", {{"source", sceneObject("Source", {{"name", name}})}});
 }
 
+Json readingOf(const TrackPoint& point) {
+  return sceneObject("HeartRateSummaryReading", {{"date", sceneDate(point.time)},
+                                                 {"quantity", sceneQuantity(*point.heartRate, "count/min")}});
+}
+
+struct Extremes {
+  const TrackPoint* lowest = nullptr;
+  const TrackPoint* highest = nullptr;
+};
+
+// The stretches divide the time as the slices of a chart do, so that each slice keeps its range.
+std::vector<const TrackPoint*> extremesOf(const WorkoutActivity& activity) {
+  constexpr std::size_t count = 8000;
+  std::vector<Extremes> stretches(count);
+  for (const TrackPoint& point : activity.points) {
+    if (!point.heartRate || activity.duration <= 0) continue;
+    const double place = (point.time - activity.start) / activity.duration * count;
+    Extremes& stretch = stretches[static_cast<std::size_t>(std::clamp(place, 0.0, count - 1.0))];
+    if (stretch.lowest == nullptr || point.heartRate < stretch.lowest->heartRate) stretch.lowest = &point;
+    if (stretch.highest == nullptr || point.heartRate > stretch.highest->heartRate) stretch.highest = &point;
+  }
+  std::vector<const TrackPoint*> kept;
+  for (const auto& [lowest, highest] : stretches) {
+    if (lowest == nullptr) continue;
+    kept.push_back(std::min(lowest, highest));
+    if (lowest != highest) kept.push_back(std::max(lowest, highest));
+  }
+  return kept;
+}
+
 }  // namespace
+
+DistanceUnit distanceUnitOf(const WorkoutActivity& activity, const DistanceUnit& unit) {
+  if (activity.sport != "swimming") return unit;
+  const bool isInYards = activity.poolMetres > 0 ? activity.isPoolInYards : unit.name == miles.name;
+  return isInYards ? yards : meters;
+}
+
+DistanceUnit heightUnitFor(const DistanceUnit& unit) {
+  return unit.name == miles.name || unit.name == yards.name ? feet : meters;
+}
 
 DistanceUnit distanceUnitOfLocale(const std::string& locale) {
   return std::ranges::count(regionsInMiles, regionOf(locale)) != 0 ? miles : kilometers;
@@ -44,44 +85,31 @@ Json distanceQuantity(double metres, const DistanceUnit& unit) {
 
 Json workoutRecord(const WorkoutActivity& activity, const DistanceUnit& unit, const std::string& id) {
   Json members = {{"workoutActivityType", workoutActivityTypeNamed(activity.sport)},
-                  {"duration", sceneNumber(activity.activeSeconds)}};
-  if (isDated(activity)) {
+                  {"duration", activity.activeSeconds}};
+  if (activity.start != 0) {
     members["startDate"] = sceneDate(activity.start);
     members["endDate"] = sceneDate(activity.start + activity.duration);
   }
   if (!activity.sourceName.empty()) members["sourceRevision"] = sourceRevision(activity.sourceName);
   if (activity.metres > 0) members["totalDistance"] = distanceQuantity(activity.metres, unit);
-  if (activity.kilocalories) members["totalEnergyBurned"] = sceneQuantity(*activity.kilocalories, "kcal");
+  if (const auto& energy = activity.measures.kilocalories) {
+    members["totalEnergyBurned"] = sceneQuantity(*energy, "kcal");
+  }
   return sceneObject("Workout", std::move(members), id);
 }
 
 Json heartRateReadings(const WorkoutActivity& activity) {
+  constexpr std::ptrdiff_t most = 20000;
+  const auto isReading = [](const TrackPoint& point) { return point.heartRate.has_value(); };
   Json readings = Json::array();
+  if (std::ranges::count_if(activity.points, isReading) > most) {
+    for (const TrackPoint* point : extremesOf(activity)) readings.push_back(readingOf(*point));
+    return readings;
+  }
   for (const TrackPoint& point : activity.points) {
-    if (!point.heartRate) continue;
-    readings.push_back(sceneObject(
-        "HeartRateSummaryReading",
-        {{"date", sceneDate(point.time)}, {"quantity", sceneQuantity(*point.heartRate, "count/min")}}));
+    if (isReading(point)) readings.push_back(readingOf(point));
   }
   return readings;
-}
-
-std::optional<HeartRateFigures> heartRateFigures(const WorkoutActivity& activity) {
-  double sum = 0;
-  double highest = 0;
-  std::size_t count = 0;
-  for (const TrackPoint& point : activity.points) {
-    if (!point.heartRate) continue;
-    sum += *point.heartRate;
-    highest = std::max(highest, *point.heartRate);
-    ++count;
-  }
-  if (count == 0) return std::nullopt;
-  return HeartRateFigures{sum / static_cast<double>(count), highest};
-}
-
-bool hasRoute(const WorkoutActivity& activity) {
-  return std::ranges::any_of(activity.points, [](const TrackPoint& p) { return p.latitude.has_value(); });
 }
 
 }  // namespace ax::reader

@@ -1,8 +1,11 @@
 #include "reader/importers/WorkoutRows.h"
 
 #include <algorithm>
+#include <cmath>
+#include <iterator>
 
 #include "platform/formatting/CalendarMath.h"
+#include "platform/health/Workout.h"
 
 namespace ax::reader {
 
@@ -24,53 +27,119 @@ struct Figure {
 
 // Pauses included. The cell takes a time as that of a workout.
 Json elapsedTime(const WorkoutActivity& activity) {
-  return sceneObject("Workout",
-                     {{"duration", sceneNumber(std::max(activity.duration, activity.activeSeconds))}});
+  return sceneObject("Workout", {{"duration", activity.duration}});
 }
 
-// In pairs: an odd one is followed by a heart rate, which is missing when there is none.
+// As it is said: what rounds to the same is not said twice.
+bool hasPauses(const WorkoutActivity& activity) {
+  return std::round(activity.duration) > std::round(activity.activeSeconds);
+}
+
+struct CadenceRow {
+  std::string_view sport;
+  const char* titleKey;
+  const char* unit;
+  double times;  // files count the steps of one foot
+};
+constexpr CadenceRow cadences[] = {{"cycling", "figure.average.cadence", "rev/min", 1},
+                                   {"running", "figure.average.step.rate", "step/min", 2},
+                                   {"walking", "figure.average.step.rate", "step/min", 2},
+                                   {"hiking", "figure.average.step.rate", "step/min", 2},
+                                   {"swimming", "figure.average.stroke.rate", "stroke/min", 1},
+                                   {"rowing", "figure.average.stroke.rate", "stroke/min", 1}};
+
+struct MeasureRow {
+  const char* titleKey;
+  std::optional<double> Measures::*measure;
+  const char* unit;
+};
+constexpr MeasureRow measureRows[] = {
+    {"figure.average.heart.rate", &Measures::averageHeartRate, "count/min"},
+    {"figure.maximum.heart.rate", &Measures::maximumHeartRate, "count/min"},
+    {"figure.average.power", &Measures::averagePower, "W"},
+    {"figure.maximum.power", &Measures::maximumPower, "W"},
+};
+
+// What the summary does not say already.
 std::vector<Figure> figuresOf(const WorkoutActivity& activity, const DistanceUnit& unit) {
-  const auto heartRate = heartRateFigures(activity);
-  std::vector<Figure> figures = {{"figure.total.time", elapsedTime(activity)}};
-  if (activity.metres > 0) figures.push_back({"figure.distance", distanceQuantity(activity.metres, unit)});
-  if (activity.kilocalories) {
-    figures.push_back({"figure.active.calories", sceneQuantity(*activity.kilocalories, "kcal")});
+  std::vector<Figure> figures;
+  if (activity.start != 0) figures.push_back({"figure.started", sceneDate(activity.start)});
+  if (hasPauses(activity)) figures.push_back({"figure.total.time", elapsedTime(activity)});
+  if (const double gain = activity.measures.elevationGain.value_or(0); gain >= 0.5) {
+    figures.push_back({"figure.elevation.gain", distanceQuantity(gain, heightUnitFor(unit))});
   }
-  if (heartRate) {
-    figures.push_back({"figure.average.heart.rate", sceneQuantity(heartRate->average, "count/min")});
+  for (const auto& [titleKey, measure, unitName] : measureRows) {
+    const auto& value = activity.measures.*measure;
+    if (value) figures.push_back({titleKey, sceneQuantity(*value, unitName)});
   }
-  if (figures.size() % 2 == 1 && heartRate) {
-    figures.push_back({"figure.maximum.heart.rate", sceneQuantity(heartRate->maximum, "count/min")});
-  } else if (figures.size() % 2 == 1) {
-    figures.push_back({"figure.average.heart.rate", nullptr});
+  const auto cadence = std::ranges::find(cadences, activity.sport, &CadenceRow::sport);
+  if (activity.measures.averageCadence && cadence != std::end(cadences)) {
+    const double turns = *activity.measures.averageCadence * cadence->times;
+    figures.push_back({cadence->titleKey, sceneQuantity(turns, cadence->unit)});
   }
   return figures;
 }
 
-Json twoValues(const Figure& first, const Figure& second) {
-  return sceneObject("CHWorkoutDetailTwoValueTableViewCell", {{"title1", appText(first.titleKey)},
-                                                              {"value1", first.value},
-                                                              {"title2", appText(second.titleKey)},
-                                                              {"value2", second.value}});
+// The place of a second figure stays empty when there is none.
+Json twoValues(const Figure& first, const Figure* second) {
+  return sceneObject("CHWorkoutDetailTwoValueTableViewCell",
+                     {{"title1", appText(first.titleKey)},
+                      {"value1", first.value},
+                      {"title2", second != nullptr ? appText(second->titleKey) : Json("")},
+                      {"value2", second != nullptr ? second->value : Json("")}});
 }
 
-Json splitRow(const Lap& lap, std::size_t number, const DistanceUnit& unit) {
-  Json split = {{"index", number}, {"duration", sceneNumber(lap.seconds)}};
+Json splitRow(const Lap& lap, std::size_t number, const WorkoutActivity& activity, const DistanceUnit& unit) {
+  Json split = {{"index", number},
+                {"duration", lap.seconds},
+                {"activityType", workoutActivityTypeNamed(activity.sport)},
+                {"isRest", lap.isRest}};
   if (lap.metres > 0) split["distance"] = distanceQuantity(lap.metres, unit);
-  return sceneObject("CHWorkoutDetailSplitTableViewCell",
-                     {{"split", sceneObject("CHWorkoutSplit", std::move(split))}});
+  return sceneObject("CHWorkoutSplit", std::move(split));
+}
+
+Json lengthRow(const PoolLength& length, std::size_t number, const WorkoutActivity& activity,
+               const DistanceUnit& unit) {
+  const Lap lap{.start = length.start,
+                .seconds = length.seconds,
+                .metres = length.isRest ? 0 : activity.poolMetres,
+                .isRest = length.isRest,
+                .told = {},
+                .points = {}};
+  Json split = splitRow(lap, number, activity, unit);
+  split["set"]["isLength"] = true;
+  if (!length.stroke.empty()) split["set"]["stroke"] = appText("stroke." + length.stroke);
+  return split;
+}
+
+// Lengths of a pool, else laps. A single one would say again what the summary says.
+std::vector<Json> splitsOf(const WorkoutActivity& activity, const DistanceUnit& unit) {
+  std::vector<Json> splits;
+  if (activity.metres <= 0) return splits;
+  if (activity.poolMetres > 0) {
+    for (const PoolLength& length : activity.lengths) {
+      splits.push_back(lengthRow(length, splits.size() + 1, activity, unit));
+    }
+  }
+  if (splits.empty()) {
+    for (const Lap& lap : activity.laps) splits.push_back(splitRow(lap, splits.size() + 1, activity, unit));
+  }
+  if (splits.size() == 1) splits.clear();
+  return splits;
 }
 
 void addSplits(SceneRows& rows, const WorkoutActivity& activity, const DistanceUnit& unit) {
-  if (activity.metres <= 0 || activity.laps.empty()) return;
+  std::vector<Json> splits = splitsOf(activity, unit);
+  if (splits.empty()) return;
   rows.add(sceneObject("CHWorkoutDetailExpandingHeaderView",
                        {{"_titleLabel", sceneLabel(appText("split.title"))},
                         {"_expandButton", sceneObject("Button", Json::object())},
                         {"_expanded", true}},
                        "splits"),
            Height::header);
-  std::size_t number = 0;
-  for (const Lap& lap : activity.laps) rows.add(splitRow(lap, ++number, unit), Height::split);
+  for (Json& split : splits) {
+    rows.add(sceneObject("CHWorkoutDetailSplitTableViewCell", {{"split", std::move(split)}}), Height::split);
+  }
 }
 
 Json heartRateRow(const WorkoutActivity& activity) {
@@ -103,13 +172,14 @@ Json monthHeader(const ListedActivity& first, std::ptrdiff_t count) {
 
 }  // namespace
 
-void addDetailRows(SceneRows& rows, const WorkoutActivity& activity, const DistanceUnit& unit) {
+void addDetailRows(SceneRows& rows, const WorkoutActivity& activity, const DistanceUnit& unitOfRegion) {
+  const DistanceUnit unit = distanceUnitOf(activity, unitOfRegion);
   rows.add(sceneObject("CHWorkoutSummaryTableViewCell",
                        {{"workouts", Json::array({workoutRecord(activity, unit, recordId)})}}, "summary"),
            Height::summary);
   const std::vector<Figure> figures = figuresOf(activity, unit);
-  for (std::size_t i = 0; i + 1 < figures.size(); i += 2) {
-    rows.add(twoValues(figures[i], figures[i + 1]), Height::twoValues);
+  for (std::size_t i = 0; i < figures.size(); i += 2) {
+    rows.add(twoValues(figures[i], i + 1 < figures.size() ? &figures[i + 1] : nullptr), Height::twoValues);
   }
   if (activity.metres > 0) {
     rows.add(sceneObject("CHWorkoutDetailPaceTableViewCell", {{"workout", sceneReference(recordId)}}, "pace"),
@@ -117,7 +187,7 @@ void addDetailRows(SceneRows& rows, const WorkoutActivity& activity, const Dista
   }
   addSplits(rows, activity, unit);
   rows.add(heartRateRow(activity), Height::chart);
-  if (hasRoute(activity)) rows.add(mapRow(activity), Height::map);
+  if (activity.hasRoute) rows.add(mapRow(activity), Height::map);
 }
 
 void addListRows(SceneRows& rows, std::vector<ListedActivity> activities) {

@@ -8,7 +8,7 @@
 namespace ax::reader {
 
 // Puts one activity's detail screen into rows, from the summary to the map. Its record has the id "workout".
-void addDetailRows(SceneRows& rows, const WorkoutActivity& activity, const DistanceUnit& unit);
+void addDetailRows(SceneRows& rows, const WorkoutActivity& activity, const DistanceUnit& unitOfRegion);
 
 // One activity of a list with its record: the record itself, or a reference to it.
 struct ListedActivity {

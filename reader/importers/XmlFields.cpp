@@ -46,7 +46,7 @@ pugi::xml_node descendantNamed(pugi::xml_node node, std::string_view name) {
 }
 
 std::string textOf(pugi::xml_node node) {
-  std::string text;
+  std::string text = node.type() == pugi::node_element ? node.value() : "";  // kept there when it is all
   for (const pugi::xml_node child : node) {
     if (child.type() == pugi::node_pcdata || child.type() == pugi::node_cdata) text += child.value();
   }
@@ -75,6 +75,11 @@ std::optional<double> parseNumber(std::string_view text, NumberLimits limits) {
   // "inf" lies outside all limits, and no comparison with "nan" holds.
   if (!isWhole || !(value >= limits.least && value <= limits.most)) return std::nullopt;
   return value;
+}
+
+std::optional<float> parseShort(std::string_view text, NumberLimits limits) {
+  const auto value = parseNumber(text, limits);
+  return value ? std::optional(static_cast<float>(*value)) : std::nullopt;
 }
 
 }  // namespace ax::reader

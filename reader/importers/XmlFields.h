@@ -37,8 +37,13 @@ constexpr NumberLimits notNegative{0, beyondAnyRecord};
 constexpr NumberLimits heartRates{1, 255};  // beats a minute, what both formats have room for
 constexpr NumberLimits latitudes{-90, 90};
 constexpr NumberLimits longitudes{-180, 180};
+constexpr NumberLimits altitudes{-1000, 20000};
+constexpr NumberLimits cadences{0, 254};
+constexpr NumberLimits powers{0, 10000};
 
 // A decimal number with nothing but blanks around it, in the notation of XML whatever the locale.
 std::optional<double> parseNumber(std::string_view text, NumberLimits limits);
+// The same, for fields that need no more digits.
+std::optional<float> parseShort(std::string_view text, NumberLimits limits);
 
 }  // namespace ax::reader

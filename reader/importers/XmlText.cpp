@@ -3,18 +3,24 @@
 #include <algorithm>
 
 #include "reader/importers/TextEncoding.h"
+#include "reader/importers/XmlNesting.h"
 
 namespace ax::reader {
 
-// Read as a fragment, so that text and elements beside the root are kept and can be complained about.
-XmlText::XmlText(std::string_view bytes)
-    : text_(toUtf8(bytes)),
-      result_(document_.load_buffer(text_.data(), text_.size(), pugi::parse_default | pugi::parse_fragment,
-                                    pugi::encoding_utf8)) {}
+// Read as a fragment, so that text and elements beside the root are kept and can be complained about. Text
+// that is all of an element is kept in it: that halves what the elements take.
+XmlText::XmlText(std::string_view bytes) : text_(toUtf8(bytes, kept_)) {
+  if (const auto excess = findXmlExcess(text_)) {
+    excess_ = {"", placeAt(static_cast<std::ptrdiff_t>(excess->at + 1)), excess->what, excess->expected};
+    return;
+  }
+  constexpr unsigned kinds = pugi::parse_default | pugi::parse_fragment | pugi::parse_embed_pcdata;
+  result_ = document_.load_buffer(text_.data(), text_.size(), kinds, pugi::encoding_utf8);
+}
 
 std::string XmlText::placeAt(std::ptrdiff_t offset) const {
   const std::size_t end = std::clamp<std::ptrdiff_t>(offset, 0, static_cast<std::ptrdiff_t>(text_.size()));
-  const std::string_view before = std::string_view(text_).substr(0, end);
+  const std::string_view before = text_.substr(0, end);
   const std::string_view line = before.substr(before.rfind('\n') + 1);
   const auto startsCharacter = [](char c) { return (static_cast<unsigned char>(c) & 0xC0) != 0x80; };
   return "line " + std::to_string(std::ranges::count(before, '\n') + 1) + ", column " +
@@ -22,7 +28,8 @@ std::string XmlText::placeAt(std::ptrdiff_t offset) const {
 }
 
 std::optional<WorkoutFileFault> XmlText::fault() const {
-  const std::string_view lastBlanks = std::string_view(text_).substr(text_.find_last_not_of(" \t\r\n") + 1);
+  if (excess_) return excess_;
+  const std::string_view lastBlanks = text_.substr(text_.find_last_not_of(" \t\r\n") + 1);
   const auto end = static_cast<std::ptrdiff_t>(text_.size() - lastBlanks.size());
   if (!result_ && result_.offset >= end - 1) {
     return WorkoutFileFault{"", placeAt(end), "the file is cut off", "all elements closed"};

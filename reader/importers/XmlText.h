@@ -5,16 +5,18 @@
 #include <string>
 #include <string_view>
 
-#include "reader/importers/WorkoutFileReader.h"
+#include "reader/importers/WorkoutFile.h"
 
 namespace ax::reader {
 
-// An XML text and its elements, which knows where in the text each of them stands.
+// An XML text and its elements, which knows where in the text each of them stands. The bytes stay the
+// caller's and must outlive it.
 class XmlText {
  public:
   explicit XmlText(std::string_view bytes);
 
-  // Why the text is no well-formed document with a single root element; its `file` is left empty.
+  // Why the text is no well-formed document with a single root element; its `file` is left empty. The
+  // elements before the fault are there, unless there are too many.
   std::optional<WorkoutFileFault> fault() const;
   pugi::xml_node root() const { return document_.document_element(); }
 
@@ -24,7 +26,9 @@ class XmlText {
  private:
   std::string placeAt(std::ptrdiff_t offset) const;
 
-  std::string text_;
+  std::string kept_;
+  std::string_view text_;
+  std::optional<WorkoutFileFault> excess_;
   pugi::xml_document document_;
   pugi::xml_parse_result result_;
 };
