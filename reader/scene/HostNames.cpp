@@ -51,16 +51,11 @@ bool mayAnswer(const Object& object, std::string_view method) {
   return selector && (answersMethod(object.isa(), selector) || categoryBrings(object, selector));
 }
 
-bool mayRead(const Object& object, std::string_view key) {
-  const Selector selector = Selector::find(key);
-  return selector &&
-         (object.isa().instanceVariableEvenIfHidden(selector) != nullptr || mayAnswer(object, key));
-}
-
 std::pair<Class*, std::string> classAndMember(std::string_view given) {
   std::string name(given);
   std::erase(name, ' ');
   if (Class* whole = Class::namedEvenIfHidden(name)) return {whole, ""};
+  if (name.ends_with('.')) return {nullptr, ""};  // a member is named, and has no name
   for (std::size_t dot = name.rfind('.'); dot != std::string::npos && dot != 0;
        dot = name.rfind('.', dot - 1)) {
     if (Class* found = Class::namedEvenIfHidden(name.substr(0, dot))) return {found, name.substr(dot + 1)};

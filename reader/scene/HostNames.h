@@ -20,8 +20,6 @@ std::string setterName(const std::string& key);
 // Whether an object answers a method by its class, or would if nothing of the host were taken away: a
 // category's method counts for its target's instances also when the category was not installed.
 bool mayAnswer(const Object& object, std::string_view method);
-// The same for a member that is read by key.
-bool mayRead(const Object& object, std::string_view key);
 
 // Splits "Class.member" at the longest prefix that is a registered class; a class alone has no member. Null
 // when no prefix is one. Blanks do not count.

@@ -14,7 +14,9 @@ std::string listed(std::initializer_list<std::string_view> names) {
   return text;
 }
 
-std::string escaped(std::string_view key) {
+}  // namespace
+
+std::string escapedForPointer(std::string_view key) {
   std::string text;
   for (char c : key) {
     if (c == '~' || c == '/') {
@@ -25,8 +27,6 @@ std::string escaped(std::string_view key) {
   }
   return text;
 }
-
-}  // namespace
 
 void JsonNode::fail(std::string what, std::string expected) const {
   throw Fault{*file_, place_, std::move(what), std::move(expected)};
@@ -85,7 +85,7 @@ void JsonNode::expectCount(std::size_t count, const std::string& expected) const
 }
 
 JsonNode JsonNode::child(const Json& json, std::string_view key) const {
-  return {json, place_ + "/" + escaped(key), *file_};
+  return {json, place_ + "/" + escapedForPointer(key), *file_};
 }
 
 JsonNode JsonNode::item(std::size_t index) const {

@@ -10,6 +10,9 @@
 
 namespace ax::reader {
 
+// A key as a JSON pointer writes it.
+std::string escapedForPointer(std::string_view key);
+
 // A value of a JSON document and where it stands. What it is asked for and is not, it throws as a Fault. It
 // refers to the document and to the file's name.
 class JsonNode {

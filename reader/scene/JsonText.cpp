@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <optional>
+#include <unordered_set>
 
 namespace ax::reader {
 
@@ -40,18 +41,22 @@ class DocumentBuilder final : public nlohmann::json_sax<Json> {
   bool open(Json value);
   bool close() {
     open_.pop_back();
+    keys_.pop_back();
     return true;
   }
   Json& place();
 
   std::vector<Json*> open_;
+  std::vector<std::unordered_set<std::string>> keys_;  // of each; an ordered object looks them up one by one
   std::string key_;
 };
 
 Json& DocumentBuilder::place() {
   if (open_.empty()) return document;
   Json& parent = *open_.back();
-  if (parent.is_object()) return parent[key_];
+  if (parent.is_object()) {
+    return parent.get_ref<Json::object_t&>().emplace_back(std::move(key_), nullptr).second;
+  }
   parent.push_back(nullptr);
   return parent.back();
 }
@@ -65,12 +70,13 @@ bool DocumentBuilder::open(Json value) {
   Json& opened = place();
   opened = std::move(value);
   open_.push_back(&opened);
+  keys_.emplace_back();
   return true;
 }
 
 bool DocumentBuilder::key(string_t& name) {
   key_ = std::move(name);
-  if (!open_.back()->contains(key_)) return true;
+  if (keys_.back().insert(key_).second) return true;
   what = "the key \"" + key_ + "\" twice in one object";
   expected = "it once";
   return false;

@@ -4,7 +4,7 @@
 #include <string>
 #include <string_view>
 
-#include "reader/Fault.h"
+#include "reader/text/Fault.h"
 
 namespace ax::reader {
 

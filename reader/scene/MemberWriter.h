@@ -3,7 +3,7 @@
 #include <string>
 
 #include "platform/runtime/Object.h"
-#include "reader/Fault.h"
+#include "reader/text/Fault.h"
 
 namespace ax::reader {
 

@@ -39,6 +39,19 @@ const ReadyReply& choose(const std::vector<ReadyReply>& replies, std::span<const
 ObjectBuilder::ObjectBuilder(const std::string& file)
     : table_(file), maker_(table_, [this](const SceneObject& object) { return build(object); }) {}
 
+ObjectBuilder::~ObjectBuilder() {
+  for (const auto& [scene, object] : allocated_) removeScriptedAnswers(*object);
+  for (const auto& [object, key] : linked_) {
+    const Ref<Object> holder = object.lock();
+    if (!holder) continue;
+    try {
+      writeMember(*holder, key, nullptr, "", table_.file());
+    } catch (...) {
+      continue;  // a member that cannot be empty
+    }
+  }
+}
+
 void ObjectBuilder::allocate(const SceneObject& object) {
   const Class* made = Class::namedEvenIfHidden(object.className);
   Ref<Object> instance = made == nullptr ? nullptr : made->instantiate();
@@ -69,16 +82,22 @@ Ref<Object> ObjectBuilder::build(const SceneObject& object) {
   Ref<Object> made = allocated_.at(&object);
   addChildren(object, made);
   for (const SceneAnswer& answer : object.answers) addAnswer(answer, *made);
-  for (const SceneMember& member : object.set) setMember(member, *made);
+  for (const SceneMember& member : object.set) fillMember(member, *made);
   return made;
 }
 
 void ObjectBuilder::addChildren(const SceneObject& object, const Ref<Object>& made) {
   const Ref<View> view = cast<View>(made);
-  for (const SceneObject& child : object.subviews) view->addSubview(cast<View>(build(child)));
+  for (const SceneObject& child : object.subviews) {
+    const Ref<View> subview = cast<View>(build(child));
+    if (view) view->addSubview(subview);
+  }
   if (object.sublayers.empty()) return;
   const Ref<Layer> layer = view ? view->layer() : cast<Layer>(made);
-  for (const SceneObject& child : object.sublayers) layer->addSublayer(cast<Layer>(build(child)));
+  for (const SceneObject& child : object.sublayers) {
+    const Ref<Layer> sublayer = cast<Layer>(build(child));
+    if (layer) layer->addSublayer(sublayer);
+  }
 }
 
 void ObjectBuilder::addAnswer(const SceneAnswer& answer, Object& made) {
@@ -102,12 +121,20 @@ void ObjectBuilder::addAnswer(const SceneAnswer& answer, Object& made) {
       });
 }
 
+// A value that the host refuses is no value for the member.
+void ObjectBuilder::fillMember(const SceneMember& member, Object& made) {
+  const auto raised = raisedBy([&] { setMember(member, made); });
+  if (!raised) return;
+  throw Fault{table_.file(), member.value.place, "the host raised \"" + *raised + "\"",
+              "a value that it takes"};
+}
+
 void ObjectBuilder::setMember(const SceneMember& member, Object& made) {
   const std::string& place = member.value.place;
   const Ref<Object> given = value(member.value);
-  const auto raised = raisedBy([&] { writeMember(made, member.key, given, place, table_.file()); });
-  if (raised)
-    throw Fault{table_.file(), place, "the host raised \"" + *raised + "\"", "a value that it takes"};
+  if (member.key == "frame") placed_.insert(&made);
+  if (given && !isNumber(*given) && !cast<String>(given.get())) linked_.emplace_back(made, member.key);
+  writeMember(made, member.key, given, place, table_.file());
 }
 
 Ref<Object> ObjectBuilder::value(const SceneValue& given) {

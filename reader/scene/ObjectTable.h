@@ -5,7 +5,7 @@
 #include <vector>
 
 #include "platform/runtime/Object.h"
-#include "reader/Fault.h"
+#include "reader/text/Fault.h"
 
 namespace ax::reader {
 

@@ -1,6 +1,7 @@
 #include "reader/scene/Presentation.h"
 
 #include "platform/runtime/KeyReading.h"
+#include "platform/toolkit/TreeDepth.h"
 #include "platform/toolkit/ViewController.h"
 #include "reader/scene/Raised.h"
 
@@ -22,21 +23,23 @@ void Presentation::present(const Ref<Object>& screen) {
   }
   const Ref<View> view = isController ? safeUIViewForKey(screen, "view"_key) : cast<View>(screen);
   if (view) {
-    layOut(view);
-    loadAccessibility(view);
+    layOut(view, 0);
+    loadAccessibility(view, 0);
   }
   if (isController) send(messages::_accessibilityLoadAccessibilityInformation, screen);
 }
 
-void Presentation::layOut(const Ref<View>& view) {
+void Presentation::layOut(const Ref<View>& view, std::size_t level) {
+  if (!isWithinDepth(level)) return;
   send(messages::layoutSubviews, view);
   const std::vector<Ref<View>> children = view->subviews();
-  for (const Ref<View>& child : children) layOut(child);
+  for (const Ref<View>& child : children) layOut(child, level + 1);
 }
 
-void Presentation::loadAccessibility(const Ref<View>& view) {
+void Presentation::loadAccessibility(const Ref<View>& view, std::size_t level) {
+  if (!isWithinDepth(level)) return;
   const std::vector<Ref<View>> children = view->subviews();
-  for (const Ref<View>& child : children) loadAccessibility(child);
+  for (const Ref<View>& child : children) loadAccessibility(child, level + 1);
   send(messages::_accessibilityLoadAccessibilityInformation, view);
 }
 

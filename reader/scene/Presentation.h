@@ -19,8 +19,8 @@ class Presentation {
  private:
   template <class M>
   void send(const M& message, const Ref<Object>& receiver);
-  void layOut(const Ref<View>& view);
-  void loadAccessibility(const Ref<View>& view);
+  void layOut(const Ref<View>& view, std::size_t level);
+  void loadAccessibility(const Ref<View>& view, std::size_t level);
 
   std::vector<std::string> hostFaults_;
 };

@@ -4,7 +4,7 @@
 #include <optional>
 #include <string>
 
-#include "reader/Fault.h"
+#include "reader/text/Fault.h"
 
 namespace ax::reader {
 

@@ -12,6 +12,7 @@
 #include "platform/health/Quantity.h"
 #include "platform/toolkit/AccessibilityMessages.h"
 #include "platform/toolkit/Responder.h"
+#include "reader/text/TraitNames.h"
 
 namespace ax::reader {
 
@@ -20,8 +21,6 @@ namespace {
 using Json = nlohmann::ordered_json;
 
 // One bit each, in the order of the bits.
-constexpr std::array traitsByBit = {"button", "header",     "selected",   "link",
-                                    "image",  "adjustable", "staticText", "notEnabled"};
 
 Json real(double value) {
   if (std::isnan(value)) return "nan";
@@ -161,15 +160,6 @@ Json ReplyWriter::writeOther(const Object& other) const {
 
 Json replyAsJson(const Ref<Object>& reply, const IdOf& idOf) {
   return ReplyWriter(idOf).write(reply);
-}
-
-std::vector<std::string> traitNames(Traits traits) {
-  std::vector<std::string> names;
-  for (unsigned bit = 0; bit < 64; ++bit) {
-    if ((traits >> bit & 1) == 0) continue;
-    names.push_back(bit < traitsByBit.size() ? traitsByBit[bit] : "bit " + std::to_string(bit));
-  }
-  return names;
 }
 
 }  // namespace ax::reader

@@ -5,7 +5,6 @@
 #include <string>
 
 #include "platform/runtime/Object.h"
-#include "platform/toolkit/Traits.h"
 
 namespace ax::reader {
 
@@ -16,8 +15,5 @@ using IdOf = std::function<std::string(const Object&)>;
 // their content, everything that is shown on the screen by its accessibility properties, and the rest by id
 // and class. Asking for a property may raise.
 nlohmann::ordered_json replyAsJson(const Ref<Object>& reply, const IdOf& idOf);
-
-// "button", "header", ...; bits without a name as "bit 9".
-std::vector<std::string> traitNames(Traits traits);
 
 }  // namespace ax::reader

@@ -79,6 +79,7 @@ SceneValue readTitle(const JsonNode& node) {
   SceneIds none;
   SceneValue title = readValue(node, none);
   none.settleObjects();
+  if (!none.unknown().empty()) throw unknownTarget(none.unknown().front(), node.file());
   return title;
 }
 
@@ -94,25 +95,38 @@ void readContent(const JsonNode& root, Scene& scene) {
     steps->expectArray("a list of steps");
     steps->forEachItem([&](const JsonNode& item) { scene.steps.push_back(readStep(item, ids)); });
   }
+  scene.moduleNames = ids.unknown();
 }
 
 }  // namespace
 
 Scene readScene(std::string_view text, const std::string& file) {
-  const Json document = readJson(text, file);
+  return readSceneDocument(readJson(text, file), file);
+}
+
+Scene readSceneDocument(const Json& document, const std::string& file) {
   const JsonNode root(document, "", file);
-  root.expectKeys({"format", "title", "environment", "host", "days", "screen", "objects", "steps"});
+  root.expectKeys(
+      {"format", "title", "names", "environment", "host", "days", "screen", "objects", "steps", "expect"});
   if (root.field("format").text() != format) {
     root.field("format").failKind("\"" + std::string(format) + "\"");
   }
   Scene scene{file};
   if (const auto title = root.optionalField("title")) scene.title = readTitle(*title);
+  if (const auto names = root.optionalField("names")) {
+    names->expectArray("a list of texts");
+    names->forEachItem([&](const JsonNode& name) { scene.names.push_back(name.text()); });
+  }
   if (const auto environment = root.optionalField("environment")) {
     scene.environment = readEnvironment(*environment);
   }
   if (const auto host = root.optionalField("host")) readOmissions(*host, scene);
   if (const auto days = root.optionalField("days")) readDays(*days, scene);
   readContent(root, scene);
+  if (const auto expect = root.optionalField("expect")) {
+    expect->expectKeys({"speak", "tree", "graph", "notifications", "assertions", "contractFailures"});
+    scene.expect = expect->json();
+  }
   return scene;
 }
 

@@ -4,6 +4,11 @@
 
 namespace ax::reader {
 
+Fault unknownTarget(const SceneTarget& target, const std::string& file) {
+  return {file, target.place, "nothing is called \"" + target.text + "\"",
+          "an id, an earlier result or a class"};
+}
+
 void SceneIds::declare(const JsonNode& name, const Class* made) {
   const std::string text = name.text();
   if (text.empty() || text.find('.') != std::string::npos) {
@@ -32,10 +37,10 @@ void SceneIds::settleObjects() {
   objectsStand_ = true;
 }
 
-void SceneIds::check(const JsonNode& target) const {
+void SceneIds::check(const JsonNode& target) {
   const std::string name = splitTarget(target.text()).first;
   if (classes_.contains(name) || Class::namedEvenIfHidden(name) != nullptr) return;
-  target.fail("nothing is called \"" + target.text() + "\"", "an id, an earlier result or a class");
+  unknown_.push_back({target.place(), target.text()});
 }
 
 const Class* SceneIds::classOf(const std::string& target) const {

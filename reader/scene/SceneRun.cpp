@@ -4,10 +4,12 @@
 #include "platform/health/ActivitySummary.h"
 #include "platform/runtime/Message.h"
 #include "reader/contract/ContractReport.h"
+#include "reader/scene/HostNames.h"
 #include "reader/scene/Mirroring.h"
 #include "reader/scene/ObjectBuilder.h"
 #include "reader/scene/Omissions.h"
 #include "reader/scene/Presentation.h"
+#include "reader/scene/Raised.h"
 #include "reader/scene/StepRunner.h"
 
 namespace ax::reader {
@@ -18,13 +20,27 @@ using Json = nlohmann::ordered_json;
 
 constexpr const char* principalClass = "AXVeltoGlue";
 
-// Nothing is kept by a host that lost its cache, or a member of it.
-void keepDay(const SceneDay& day) {
+// Nothing is kept by a host that lost its cache, or a member of it. Nil forgets the day. Answers what the
+// host raised, if it did.
+std::optional<std::string> keepSummary(const Ref<ActivitySummary>& summary, const SceneDay& day) {
   static const Message<Ref<Object>()> sharedInstance{"sharedInstance"};
   static const Message<void(Ref<Object>, std::int64_t)> setSummaryForCacheIndex{"setSummary:forCacheIndex:"};
+  return raisedBy([&] {
+    setSummaryForCacheIndex(sharedInstance(Class::named("ActivitySummaryCache")), summary, day.index);
+  });
+}
+
+void keepDay(const SceneDay& day, std::vector<std::string>& hostFaults) {
   const Ref<ActivitySummary> summary = make<ActivitySummary>();
   summary->setFractions(day.move, day.exercise, day.stand);
-  setSummaryForCacheIndex(sharedInstance(Class::named("ActivitySummaryCache")), summary, day.index);
+  const auto raised = keepSummary(summary, day);
+  if (raised) hostFaults.push_back("ActivitySummaryCache, keeping a day: " + *raised);
+}
+
+// All classes stand once the module is open.
+void checkKnown(const SceneTarget& target, const std::string& file) {
+  if (Class::namedEvenIfHidden(splitTarget(target.text).first) != nullptr) return;
+  throw unknownTarget(target, file);
 }
 
 Json postedJson(const StepRunner& runner) {
@@ -57,16 +73,21 @@ SceneRun::SceneRun(const Scene& scene, const SceneRunOptions& options)
   for (const HostOmission& omission : scene.without) takeAway(omission.name);
   for (const std::string& name : options.without) takeAway(name);
   if (!options.modulePath.empty()) openBundle(options.modulePath);
-  for (const SceneDay& day : scene.days) keepDay(day);
+  for (const SceneTarget& target : scene.moduleNames) checkKnown(target, scene.file);
+  for (const SceneDay& day : scene.days) keepDay(day, hostFaults_);
   makeObjects();
   if (!screen_) return;
-  if (scene.isMirrored) mirror(screen_);
+  if (scene.isMirrored) {
+    mirror(screen_, [this](const Object& object) { return builder_->isPlaced(object); });
+  }
   Presentation presentation;
   presentation.present(screen_);
-  hostFaults_ = presentation.hostFaults();
+  hostFaults_.insert(hostFaults_.end(), presentation.hostFaults().begin(), presentation.hostFaults().end());
 }
 
-SceneRun::~SceneRun() = default;
+SceneRun::~SceneRun() {
+  for (const SceneDay& day : scene_.days) keepSummary(nullptr, day);
+}
 
 void SceneRun::openBundle(const std::string& modulePath) {
   std::string error;
@@ -94,8 +115,10 @@ const std::string& SceneRun::idOf(const Object& object) const {
 Json SceneRun::runSteps() {
   StepRunner runner(*builder_, bundle_.get());
   Json results = Json::array();
+  replies_.clear();
   for (std::size_t i = 0; i < scene_.steps.size(); ++i) {
     Json result = runner.run(scene_.steps[i], i);
+    replies_.push_back(result.is_null() ? std::nullopt : std::optional(result["reply"]));
     if (!result.is_null()) results.push_back(std::move(result));
   }
   return {{"results", std::move(results)},

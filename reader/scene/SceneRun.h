@@ -36,7 +36,7 @@ class SceneRun {
   Ref<Object> objectWithId(const std::string& id) const;
   // Empty for an object without one.
   const std::string& idOf(const Object& object) const;
-  // What the host raised while its screen was presented: "CHCell layoutSubviews: why".
+  // What the host raised while its days were kept and its screen was presented: "CHCell layoutSubviews: why".
   const std::vector<std::string>& hostFaults() const { return hostFaults_; }
   // Null without a module.
   const LoadedBundle* bundle() const { return bundle_.get(); }
@@ -45,6 +45,8 @@ class SceneRun {
   // "assertions" and "contractFailures" of the whole run. What a step raises is its reply; a step that
   // cannot be carried out throws a Fault.
   nlohmann::ordered_json runSteps();
+  // Of each step that has run; nothing for one without a reply.
+  const std::vector<std::optional<nlohmann::ordered_json>>& replies() const { return replies_; }
 
  private:
   void openBundle(const std::string& modulePath);
@@ -57,6 +59,7 @@ class SceneRun {
   Ref<Object> screen_;
   std::vector<Ref<Object>> objects_;
   std::vector<std::string> hostFaults_;
+  std::vector<std::optional<nlohmann::ordered_json>> replies_;
 };
 
 }  // namespace ax::reader

@@ -1,15 +1,13 @@
 #pragma once
 
+#include <nlohmann/json.hpp>
+#include <optional>
+
 #include "reader/scene/SceneEnvironment.h"
+#include "reader/scene/SceneIds.h"
 #include "reader/scene/SceneValue.h"
 
 namespace ax::reader {
-
-// Who a step is for: an id, an earlier result, a class, or an item of one of these ("bars.0").
-struct SceneTarget {
-  std::string place;
-  std::string text;
-};
 
 struct AskStep {
   std::string selector;
@@ -37,6 +35,7 @@ struct SceneStep {
   std::string place;
   std::string name = {};  // "as"; empty: none
   std::variant<AskStep, ReadStep, SetStep, SceneEnvironment, CallStep, SameStep> action;
+  std::optional<nlohmann::ordered_json> expect = {};  // the reply, as it prints
 };
 
 }  // namespace ax::reader

@@ -29,35 +29,35 @@ std::string readName(const JsonNode& node, const std::string& expected) {
 }
 
 Action readAsk(const JsonNode& node, SceneIds& ids) {
-  node.expectKeys({"ask", "of", "with", "as"});
+  node.expectKeys({"ask", "of", "with", "as", "expect"});
   return AskStep{readName(node.field("ask"), "the name of a method"), readTarget(node.field("of"), ids),
                  readArguments(node, ids)};
 }
 
 Action readSend(const JsonNode& node, SceneIds& ids) {
-  node.expectKeys({"send", "of", "with", "as"});
+  node.expectKeys({"send", "of", "with", "as", "expect"});
   return AskStep{readName(node.field("send"), "the name of a method"), readTarget(node.field("of"), ids),
                  readArguments(node, ids), true};
 }
 
 Action readRead(const JsonNode& node, SceneIds& ids) {
-  node.expectKeys({"read", "of", "as"});
+  node.expectKeys({"read", "of", "as", "expect"});
   return ReadStep{readName(node.field("read"), "the name of a member"), readTarget(node.field("of"), ids)};
 }
 
 Action readSet(const JsonNode& node, SceneIds& ids) {
-  node.expectKeys({"set", "on", "as"});
+  node.expectKeys({"set", "on", "as", "expect"});
   const SceneTarget target = readTarget(node.field("on"), ids);
   return SetStep{readMembers(node.field("set"), ids.classOf(target.text), ids), target};
 }
 
 Action readChange(const JsonNode& node, SceneIds&) {
-  node.expectKeys({"environment", "as"});
+  node.expectKeys({"environment", "as", "expect"});
   return readEnvironment(node.field("environment"));
 }
 
 Action readCall(const JsonNode& node, SceneIds& ids) {
-  node.expectKeys({"call", "with", "as"});
+  node.expectKeys({"call", "with", "as", "expect"});
   const JsonNode name = node.field("call");
   const ExportedFunction* function = exportedFunction(name.text());
   if (function == nullptr) name.fail("unknown function \"" + name.text() + "\"", "one of " + exportedNames());
@@ -70,7 +70,7 @@ Action readCall(const JsonNode& node, SceneIds& ids) {
 }
 
 Action readSame(const JsonNode& node, SceneIds& ids) {
-  node.expectKeys({"same", "as"});
+  node.expectKeys({"same", "as", "expect"});
   const JsonNode both = node.field("same");
   both.expectCount(2, "two targets");
   return SameStep{readTarget(both.item(0), ids), readTarget(both.item(1), ids)};
@@ -100,6 +100,7 @@ SceneStep readStep(const JsonNode& node, SceneIds& ids) {
     ids.declare(*name, nullptr);
     step.name = name->text();
   }
+  if (const auto expect = node.optionalField("expect")) step.expect = expect->json();
   return step;
 }
 

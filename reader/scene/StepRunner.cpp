@@ -99,22 +99,15 @@ Ref<Object> StepRunner::perform(const SceneStep& step, const AskStep& ask) {
   return method.signature->invoke(*receiver, method, arguments);
 }
 
-Ref<Object> StepRunner::perform(const SceneStep& step, const ReadStep& read) {
+Ref<Object> StepRunner::perform(const SceneStep&, const ReadStep& read) {
   const Ref<Object> receiver = find(read.of);
-  if (!receiver) return nullptr;
-  if (!mayRead(*receiver, read.key)) {
-    fail(step.place, "unknown member \"" + read.key + "\"", "a member of " + describe(receiver));
-  }
-  return receiver->safeValueForKey(read.key);
+  return receiver ? receiver->safeValueForKey(read.key) : nullptr;
 }
 
 Ref<Object> StepRunner::perform(const SceneStep&, const SetStep& set) {
   const Ref<Object> receiver = find(set.on);
   if (!receiver) return nullptr;
-  for (const SceneMember& member : set.members) {
-    writeMember(*receiver, member.key, builder_.value(member.value), member.value.place,
-                builder_.table().file());
-  }
+  for (const SceneMember& member : set.members) builder_.setMember(member, *receiver);
   return nullptr;
 }
 
