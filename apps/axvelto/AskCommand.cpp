@@ -1,6 +1,8 @@
+#include "apps/axvelto/Command.h"
+#include "apps/axvelto/Expectations.h"
 #include "apps/axvelto/NodeActions.h"
 #include "apps/axvelto/Output.h"
-#include "apps/axvelto/Presentation.h"
+#include "apps/shared/Presentation.h"
 
 namespace ax::app {
 
@@ -9,7 +11,9 @@ namespace {
 void declare(CLI::App& app, Arguments& arguments) {
   declareFile(app, arguments);
   declareLocale(app, arguments);
+  declareWorkouts(app, arguments);
   declareWithout(app, arguments);
+  app.add_flag("--accept", arguments.accepts, "write the replies into the scene as what it expects");
   CLI::Option_group* actions = app.add_option_group("Instead of the steps");
   actions->add_option("--activate", arguments.activate, "activate the element with this label or id");
   actions->add_option("--increment", arguments.increment, "increment it");
@@ -23,8 +27,10 @@ void declare(CLI::App& app, Arguments& arguments) {
 ExitCode run(const Arguments& arguments) {
   Presentation presentation(arguments);
   if (isNodeAction(arguments)) return runNodeAction(presentation, arguments);
-  print(presentation.run().runSteps());
-  return exitDone;
+  const Outcome outcome = runScene(presentation);
+  if (arguments.accepts) return accept(presentation.scene(), outcome);
+  print(outcome.document);
+  return holds(presentation.scene(), outcome) ? exitDone : exitFallsShort;
 }
 
 }  // namespace

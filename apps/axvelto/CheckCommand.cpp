@@ -1,8 +1,9 @@
 #include <iostream>
 
-#include "apps/axvelto/Input.h"
+#include "apps/axvelto/Command.h"
 #include "apps/axvelto/Output.h"
-#include "apps/axvelto/Presentation.h"
+#include "apps/shared/Input.h"
+#include "apps/shared/Presentation.h"
 #include "reader/contract/ContractReport.h"
 
 namespace ax::app {
@@ -30,7 +31,7 @@ ExitCode run(const Arguments& arguments) {
   if (arguments.asJson) {
     print(report.json());
   } else {
-    std::cout << report.text();
+    printText(report.text());
   }
   return report.holds() ? exitDone : exitFallsShort;
 }

@@ -5,19 +5,20 @@
 #include <string>
 #include <vector>
 
+#include "apps/shared/Opening.h"
+
 namespace ax::app {
 
 // What a command ends with.
 enum ExitCode : int { exitDone = 0, exitFallsShort = 1, exitBadUse = 2 };
 
 // What the command line gave; each command fills what it takes.
-struct Arguments {
-  std::vector<std::string> files;    // paths, or "-" for standard input
-  std::string locale;                // empty: the scene's
-  std::string timeZone;              // of imported workouts; empty: UTC
-  std::vector<std::string> without;  // classes and members that the host does without
+struct Arguments : Opening {
   bool asJson = false;
-  std::string chart;  // the id of one object whose charts are wanted
+  std::string chart;     // the id of one object whose charts are wanted
+  std::string output;    // the file to write; empty: standard output
+  bool accepts = false;  // writes what was found into the scene
+  bool listsRules = false;
   std::string activate, increment, decrement;
   std::vector<double> point;  // two coordinates, or none
 };
@@ -31,12 +32,16 @@ struct Command {
   ExitCode (*run)(const Arguments&);
 };
 
-extern const Command speakCommand, treeCommand, graphCommand, checkCommand, askCommand, importCommand;
+extern const Command speakCommand, treeCommand, graphCommand, checkCommand, askCommand, importCommand,
+    auditCommand, pageCommand, soundCommand;
 
 // What several commands take.
 void declareFile(CLI::App& app, Arguments& arguments);
 void declareLocale(CLI::App& app, Arguments& arguments);
+// The time zone, and how workout files are read.
+void declareWorkouts(CLI::App& app, Arguments& arguments);
 void declareWithout(CLI::App& app, Arguments& arguments);
+void declareChart(CLI::App& app, Arguments& arguments);
 void declareJson(CLI::App& app, Arguments& arguments);
 
 }  // namespace ax::app

@@ -1,23 +1,106 @@
-#include "apps/axvelto/Input.h"
+#include <unistd.h>
+
+#include <algorithm>
+#include <filesystem>
+#include <iostream>
+
+#include "apps/axvelto/Command.h"
 #include "apps/axvelto/Output.h"
+#include "apps/shared/Input.h"
+#include "apps/shared/Workouts.h"
 
 namespace ax::app {
 
 namespace {
 
+namespace fs = std::filesystem;
+
 void declare(CLI::App& app, Arguments& arguments) {
-  app.add_option("FILE", arguments.files, "workout files (.tcx, .gpx); - is standard input")->required();
+  app.add_option("FILE", arguments.files,
+                 "workout files in FIT, TCX or GPX, archives or folders of them; - is standard input")
+      ->required();
   declareLocale(app, arguments);
-  app.add_option("--time-zone", arguments.timeZone, "where the workouts took place, such as Europe/Berlin");
+  declareWorkouts(app, arguments);
+}
+
+bool isFolder(const std::string& path) {
+  std::error_code error;
+  return fs::is_directory(path, error);
+}
+
+bool isHidden(const fs::path& path) {
+  return path.filename().string().starts_with('.');
+}
+
+// Every file below a folder that is not hidden, in the order of their names.
+std::vector<std::string> filesBelow(const std::string& folder) {
+  std::vector<std::string> files;
+  std::error_code error;
+  fs::recursive_directory_iterator at(folder, fs::directory_options::skip_permission_denied, error);
+  for (; !error && at != fs::recursive_directory_iterator(); at.increment(error)) {
+    const bool isBelow = at->is_directory(error);
+    if (isHidden(at->path())) {
+      if (isBelow) at.disable_recursion_pending();
+    } else if (!isBelow) {
+      files.push_back(at->path().string());
+    }
+  }
+  if (error) throw reader::Fault{folder, "", "the folder may not be read", "permission to read it"};
+  std::ranges::sort(files);
+  return files;
+}
+
+// How far it is, on one line of a terminal.
+class Progress {
+ public:
+  explicit Progress(std::size_t count) : count_(count), isShown_(count > 1 && isatty(STDERR_FILENO) != 0) {}
+  void tell(std::size_t done) const {
+    if (isShown_) std::cerr << "\r\033[K" << done << " / " << count_ << std::flush;
+  }
+  void clear() const {
+    if (isShown_) std::cerr << "\r\033[K" << std::flush;
+  }
+
+ private:
+  std::size_t count_;
+  bool isShown_;
+};
+
+// Answers whether all could be read. What cannot be is told, and the others go on.
+bool addAll(const std::vector<std::string>& files, const Arguments& arguments, Workouts& workouts) {
+  bool isWhole = true;
+  const Progress progress(files.size());
+  for (std::size_t i = 0; i < files.size(); ++i) {
+    progress.tell(i);
+    try {
+      const auto add = [&](const std::string& name, std::string_view bytes) { workouts.add(name, bytes); };
+      isWhole = forEachUnpacked(files[i], arguments, add) && isWhole;
+    } catch (const reader::Fault& fault) {
+      isWhole = false;
+      progress.clear();
+      if (files.size() == 1) throw;
+      std::cerr << fault.text() << '\n';
+    }
+  }
+  progress.clear();
+  return isWhole;
 }
 
 ExitCode run(const Arguments& arguments) {
   checkLocale(arguments.locale);
   checkTimeZone(arguments.timeZone);
-  std::vector<InputFile> files;
-  for (const std::string& name : arguments.files) files.push_back({name, readInput(name)});
-  print(importWorkouts(files, arguments));
-  return exitDone;
+  std::vector<std::string> files;
+  for (const std::string& path : arguments.files) {
+    const std::vector<std::string> named = isFolder(path) ? filesBelow(path) : std::vector{path};
+    files.insert(files.end(), named.begin(), named.end());
+  }
+  Workouts workouts(arguments);
+  const bool isWhole = addAll(files, arguments, workouts);
+  if (workouts.isEmpty()) {
+    throw reader::Fault{arguments.files.front(), "", "no workout", "at least one in FIT, TCX or GPX"};
+  }
+  print(workouts.scene());
+  return isWhole ? exitDone : exitFallsShort;
 }
 
 }  // namespace

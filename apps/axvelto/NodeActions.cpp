@@ -5,7 +5,9 @@
 
 #include "apps/axvelto/Output.h"
 #include "platform/accessibility/Notifications.h"
-#include "reader/ReaderStrings.h"
+#include "reader/snapshot/HostQuestions.h"
+#include "reader/speech/SpokenLine.h"
+#include "reader/text/ReaderStrings.h"
 #include "reader/transcript/Transcript.h"
 
 namespace ax::app {
@@ -55,7 +57,7 @@ void printOutcome(Presentation& presentation, const Snapshot& before, const Ref<
   const Change change{transcript(before, title), transcript(after, title)};
   const Node* node = after.nodeOf(*acted);
   const std::string line = node == nullptr ? readerText("element.gone") : spokenLine(*node);
-  std::cout << line << '\n';
+  printText(line);
   for (std::size_t i = 0; i < postedNotifications().size(); ++i) {
     std::cout << readerText("layout.changed") << '\n';
   }
@@ -100,8 +102,10 @@ ExitCode act(Presentation& presentation, const WantedAction& wanted) {
 
 ExitCode speakAt(Presentation& presentation, Point point) {
   const Snapshot snapshot = presentation.snapshot();
-  const Node* node = snapshot.hitTest(point);
-  std::cout << (node == nullptr ? readerText("screen.empty") : spokenLine(*node)) << '\n';
+  HostQuestions questions;
+  const Node* node = snapshot.hitTest(point, questions);
+  presentation.tellOf(questions.raised());
+  printText(node == nullptr ? readerText("screen.empty") : spokenLine(*node));
   return node == nullptr ? exitFallsShort : exitDone;
 }
 

@@ -1,6 +1,7 @@
 #pragma once
 
-#include "apps/axvelto/Presentation.h"
+#include "apps/axvelto/Command.h"
+#include "apps/shared/Presentation.h"
 
 namespace ax::app {
 

@@ -6,8 +6,10 @@
 
 namespace ax::app {
 
-// To standard output; bytes that are no UTF-8 become U+FFFD.
+// To standard output. What a terminal would obey stands as escapes, also in JSON, where they mean the same;
+// bytes that are no UTF-8 become U+FFFD.
 void print(const nlohmann::ordered_json& json);
 void print(const std::vector<std::string>& lines);
+void printText(const std::string& text);  // of whole lines
 
 }  // namespace ax::app

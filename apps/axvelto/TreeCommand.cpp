@@ -1,5 +1,6 @@
+#include "apps/axvelto/Command.h"
 #include "apps/axvelto/Output.h"
-#include "apps/axvelto/Presentation.h"
+#include "apps/shared/Presentation.h"
 #include "reader/transcript/TreeJson.h"
 
 namespace ax::app {
@@ -9,6 +10,7 @@ namespace {
 void declare(CLI::App& app, Arguments& arguments) {
   declareFile(app, arguments);
   declareLocale(app, arguments);
+  declareWorkouts(app, arguments);
   declareWithout(app, arguments);
 }
 

@@ -1,31 +1,38 @@
 #include <iostream>
+#include <string_view>
 
 #include "apps/axvelto/Command.h"
-#include "reader/Fault.h"
+#include "apps/shared/Complaint.h"
+#include "reader/text/Fault.h"
+#include "reader/text/PlainText.h"
 
 namespace {
 
 using namespace ax::app;
 
-const Command* const commands[] = {&speakCommand, &treeCommand, &graphCommand,
-                                   &checkCommand, &askCommand,  &importCommand};
+const Command* const commands[] = {&speakCommand,  &treeCommand,  &graphCommand, &checkCommand, &askCommand,
+                                   &importCommand, &auditCommand, &pageCommand,  &soundCommand};
 
 std::string usageFailure(const CLI::App* app, const CLI::Error& error) {
   const std::vector<std::string> left = app->remaining();
   const bool isUnknownCommand = app->get_subcommands().empty() && !left.empty();
+  if (std::string_view(error.what()).starts_with("FILE: At Most 1")) {
+    return "axvelto: one FILE at a time; import makes a list of several (axvelto --help tells the use)\n";
+  }
   const std::string what = isUnknownCommand ? "unknown command \"" + left.front() + "\"" : error.what();
-  return "axvelto: " + what + " (axvelto --help tells the use)\n";
+  return "axvelto: " + ax::reader::printable(ax::reader::shortened(what)) +
+         " (axvelto --help tells the use)\n";
 }
 
 int runCommand(const Command& command, const Arguments& arguments) {
   try {
     const ExitCode code = command.run(arguments);
     if (std::cout.flush()) return code;
-    std::cerr << "axvelto: standard output: cannot be written, expected room for the result\n";
+    complain("standard output: cannot be written, expected room for the result");
   } catch (const ax::reader::Fault& fault) {
     std::cerr << fault.text() << '\n';
   } catch (const std::exception& error) {
-    std::cerr << "axvelto: " << command.name << ": " << error.what() << '\n';
+    complain(std::string(command.name) + ": " + error.what());
   }
   return exitBadUse;
 }

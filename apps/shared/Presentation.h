@@ -3,7 +3,7 @@
 #include <memory>
 #include <string>
 
-#include "apps/axvelto/Command.h"
+#include "apps/shared/Opening.h"
 #include "reader/scene/SceneRun.h"
 #include "reader/snapshot/Snapshot.h"
 
@@ -16,7 +16,7 @@ std::string modulePath();
 class Presentation {
  public:
   // Throws a Fault. What the host raised meanwhile goes to standard error.
-  explicit Presentation(const Arguments& arguments);
+  explicit Presentation(const Opening& opening);
 
   const reader::Scene& scene() const { return *scene_; }
   reader::SceneRun& run() { return *run_; }
@@ -24,6 +24,9 @@ class Presentation {
   reader::Snapshot snapshot() const;
   // The same of any object.
   reader::Snapshot snapshotOf(Receiver object) const;
+  // To standard error, where there is something to tell: how often the host raised while it was asked, and
+  // what was left out since the last time.
+  void tellOf(std::size_t timesRaised) const;
 
  private:
   std::unique_ptr<reader::Scene> scene_;

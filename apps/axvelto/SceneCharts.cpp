@@ -1,0 +1,28 @@
+#include "apps/axvelto/SceneCharts.h"
+
+#include "reader/snapshot/Charts.h"
+
+namespace ax::app {
+
+SceneCharts::SceneCharts(Presentation& presentation, const std::string& id) {
+  if (!id.empty()) {
+    const Ref<Object> object = presentation.run().objectWithId(id);
+    if (!object) {
+      throw reader::Fault{presentation.scene().file, "--of", "no object \"" + id + "\"",
+                          "an id of the scene"};
+    }
+    add(presentation.snapshotOf(object));
+    return;
+  }
+  if (presentation.run().screen()) add(presentation.snapshot());
+  for (const Ref<Object>& object : presentation.run().objects()) add(presentation.snapshotOf(object));
+}
+
+void SceneCharts::add(reader::Snapshot snapshot) {
+  const reader::Snapshot& kept = snapshots_.emplace_back(std::move(snapshot));
+  for (const reader::Node* chart : reader::charts(kept)) {
+    if (known_.insert(kept.object(chart->id).get()).second) found_.emplace_back(&kept, chart);
+  }
+}
+
+}  // namespace ax::app
