@@ -1,0 +1,30 @@
+#include "apps/view/window/Caption.h"
+
+namespace ax::view {
+
+namespace {
+
+constexpr double sizeToDesktop = 1.8;
+constexpr int linesOfRoom = 2;
+
+}  // namespace
+
+Caption::Caption() {
+  QFont large = font();
+  large.setPointSizeF(large.pointSizeF() * sizeToDesktop);
+  setFont(large);
+  setWordWrap(true);
+  setTextFormat(Qt::PlainText);
+  setAlignment(Qt::AlignLeading | Qt::AlignTop);
+  setMargin(fontMetrics().height() / 3);
+  setMinimumHeight(fontMetrics().lineSpacing() * linesOfRoom + 2 * margin());
+  setAutoFillBackground(true);
+  setBackgroundRole(QPalette::Base);
+  setForegroundRole(QPalette::Text);
+}
+
+void Caption::show(const QString& line) {
+  setText(line);
+}
+
+}  // namespace ax::view

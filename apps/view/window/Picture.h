@@ -1,0 +1,16 @@
+#pragma once
+
+#include <QPalette>
+#include <string>
+
+#include "apps/view/model/ScreenModel.h"
+
+namespace ax::view {
+
+// The screen as an SVG document, in colours that go with the desktop's.
+std::string pictureOf(const ScreenModel& model, const std::string& title, const QPalette& palette);
+
+// Of texts on that picture.
+QColor pictureInk(const QPalette& palette);
+
+}  // namespace ax::view

@@ -1,0 +1,114 @@
+#include "apps/view/window/ScreenCanvas.h"
+
+#include <QMouseEvent>
+#include <QPainter>
+
+namespace ax::view {
+
+namespace {
+
+constexpr QRectF emptyScreen(0, 0, 320, 200);
+constexpr double outlineWidth = 4;
+// In points of the screen.
+constexpr double typeSize = 13, roomForNumber = 28, textMargin = 3, narrowestText = 80;
+
+}  // namespace
+
+ScreenCanvas::ScreenCanvas(ScreenModel& model) : model_(model) {
+  setFocusPolicy(Qt::StrongFocus);
+}
+
+void ScreenCanvas::setPicture(const std::string& svg, const QColor& textColour) {
+  textColour_ = textColour;
+  picture_.load(QByteArray::fromStdString(svg));
+  setZoom(zoom_);
+}
+
+void ScreenCanvas::setZoom(double zoom) {
+  zoom_ = zoom;
+  setFixedSize(sizeHint());
+  update();
+}
+
+QSize ScreenCanvas::sizeHint() const {
+  const QRectF box = picture_.isValid() ? picture_.viewBoxF() : emptyScreen;
+  return (box.size() * zoom_).toSize();
+}
+
+QRectF ScreenCanvas::rectOf(const Rect& rect) const {
+  const QPointF origin = picture_.isValid() ? picture_.viewBoxF().topLeft() : QPointF();
+  return {(rect.x - origin.x()) * zoom_, (rect.y - origin.y()) * zoom_, rect.width * zoom_,
+          rect.height * zoom_};
+}
+
+Point ScreenCanvas::pointOf(QPointF pixel) const {
+  const QPointF origin = picture_.isValid() ? picture_.viewBoxF().topLeft() : QPointF();
+  return {pixel.x() / zoom_ + origin.x(), pixel.y() / zoom_ + origin.y()};
+}
+
+void ScreenCanvas::paintEvent(QPaintEvent* event) {
+  QPainter painter(this);
+  painter.setRenderHint(QPainter::Antialiasing);
+  if (picture_.isValid()) picture_.render(&painter, QRectF(rect()));
+  paintTexts(painter, event->rect());
+  paintFocus(painter);
+}
+
+// Beside the numbers, which stand in the corners where reading begins.
+void ScreenCanvas::paintTexts(QPainter& painter, const QRectF& exposed) {
+  QFont type = font();
+  type.setPixelSize(int(typeSize * zoom_));
+  painter.setFont(type);
+  painter.setPen(textColour_);
+  const double besides = roomForNumber * zoom_, rim = textMargin * zoom_;
+  const bool fromTheRight = layoutDirection() == Qt::RightToLeft;
+  for (const ItemId id : model_.readingOrder()) {
+    const Item& item = *model_.find(id);
+    QRectF room = rectOf(item.node.frame);
+    if (!room.intersects(exposed) || item.node.frame.width < narrowestText) continue;
+    room.adjust(fromTheRight ? rim : besides, rim, fromTheRight ? -besides : -rim, -rim);
+    painter.setClipRect(room);
+    paintText(painter, room, item);
+  }
+  painter.setClipping(false);
+}
+
+// Charts have their name at the top, on ground of its own, since their lines run anywhere.
+void ScreenCanvas::paintText(QPainter& painter, const QRectF& room, const Item& item) {
+  const QString text = QString::fromStdString(item.name);
+  const bool isChart = item.node.series.has_value();
+  const int flags = int(Qt::AlignLeading | (isChart ? Qt::AlignTop : Qt::AlignVCenter)) | Qt::TextWordWrap;
+  if (isChart) painter.fillRect(painter.boundingRect(room, flags, text), palette().color(QPalette::Base));
+  painter.drawText(room, flags, text);
+}
+
+// What has no place of its own, such as a title, belongs to the whole. Two colours, so that one of them
+// stands out from any ground.
+void ScreenCanvas::paintFocus(QPainter& painter) {
+  const Item* item = model_.find(model_.focus());
+  if (item == nullptr) return;
+  const double inside = outlineWidth / 2 + 2;
+  const bool hasPlace = !item->node.frame.isEmpty();
+  const QRectF frame =
+      hasPlace ? rectOf(item->node.frame) : QRectF(rect()).adjusted(inside, inside, -inside, -inside);
+  painter.setPen(QPen(palette().color(QPalette::Base), outlineWidth + 4));
+  painter.drawRoundedRect(frame, outlineWidth, outlineWidth);
+  painter.setPen(QPen(palette().color(QPalette::Highlight), outlineWidth));
+  painter.drawRoundedRect(frame, outlineWidth, outlineWidth);
+}
+
+void ScreenCanvas::mousePressEvent(QMouseEvent* event) {
+  if (onTouch) onTouch(model_.itemAt(pointOf(event->position())));
+}
+
+void ScreenCanvas::focusInEvent(QFocusEvent* event) {
+  QWidget::focusInEvent(event);
+  if (onFocusIn) onFocusIn();
+}
+
+// Tab steps through the screen.
+bool ScreenCanvas::focusNextPrevChild(bool) {
+  return false;
+}
+
+}  // namespace ax::view

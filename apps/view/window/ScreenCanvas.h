@@ -1,0 +1,48 @@
+#pragma once
+
+#include <QSvgRenderer>
+#include <QWidget>
+#include <functional>
+
+#include "apps/view/model/ScreenModel.h"
+
+namespace ax::view {
+
+// Shows the picture of a screen with the texts of its items, the focused one outlined.
+class ScreenCanvas : public QWidget {
+ public:
+  explicit ScreenCanvas(ScreenModel& model);
+
+  // The SVG document to show. Its view box tells the part of the screen that it shows, in points.
+  void setPicture(const std::string& svg, const QColor& textColour);
+  // Pixels for one point.
+  void setZoom(double zoom);
+  double zoom() const { return zoom_; }
+
+  // Between the screen's points and the canvas's pixels.
+  QRectF rectOf(const Rect& rect) const;
+  Point pointOf(QPointF pixel) const;
+
+  std::function<void()> onFocusIn;
+  std::function<void(ItemId)> onTouch;
+
+  QSize sizeHint() const override;
+
+ protected:
+  void paintEvent(QPaintEvent* event) override;
+  void mousePressEvent(QMouseEvent* event) override;
+  void focusInEvent(QFocusEvent* event) override;
+  bool focusNextPrevChild(bool next) override;
+
+ private:
+  void paintTexts(QPainter& painter, const QRectF& exposed);
+  void paintText(QPainter& painter, const QRectF& room, const Item& item);
+  void paintFocus(QPainter& painter);
+
+  ScreenModel& model_;
+  QSvgRenderer picture_;
+  QColor textColour_;
+  double zoom_ = 1;
+};
+
+}  // namespace ax::view

@@ -1,0 +1,29 @@
+#include "apps/view/window/ViewStrings.h"
+
+#include "platform/formatting/StringTable.h"
+
+namespace ax::view {
+
+namespace {
+
+const std::string* find(std::string_view key) {
+  static const char inThisProgram = 0;
+  static const auto& table =
+      *new formatting::StringTable(formatting::resourceFolderBeside(&inThisProgram, "../share/axvelto/View"));
+  return table.find(key);
+}
+
+}  // namespace
+
+QString viewText(std::string_view key) {
+  const std::string* text = find(key);
+  return text == nullptr ? QString() : QString::fromStdString(*text);
+}
+
+QString viewText(std::string_view key, std::initializer_list<formatting::MessageArgument> arguments) {
+  const std::string* pattern = find(key);
+  return pattern == nullptr ? QString()
+                            : QString::fromStdString(formatting::formatMessage(*pattern, arguments));
+}
+
+}  // namespace ax::view

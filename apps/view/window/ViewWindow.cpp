@@ -1,0 +1,268 @@
+#include "apps/view/window/ViewWindow.h"
+
+#include <QApplication>
+#include <QMenuBar>
+#include <QScreen>
+#include <QScrollBar>
+#include <QTimer>
+#include <QVBoxLayout>
+#include <algorithm>
+#include <iostream>
+#include <map>
+
+#include "apps/view/model/ItemWords.h"
+#include "apps/view/model/StepNote.h"
+#include "apps/view/window/Commands.h"
+#include "apps/view/window/KeyList.h"
+#include "apps/view/window/Picture.h"
+#include "apps/view/window/ViewStrings.h"
+#include "platform/formatting/Region.h"
+#include "reader/sound/ChartSound.h"
+#include "reader/sound/Speech.h"
+#include "reader/sound/Tone.h"
+#include "reader/text/ReaderStrings.h"
+#include "reader/transcript/Transcript.h"
+
+namespace ax::view {
+
+using reader::Action;
+
+namespace {
+
+constexpr double zoomStep = 1.25, leastZoom = 0.5, mostZoom = 6;
+constexpr double shareOfDesktop = 0.85;
+constexpr int leastWidth = 480;
+constexpr int roomAround = 24;  // pixels kept visible around the focused element
+
+// What became of an item that stayed, in words. Where the focus stays, none of it reaches speech by itself.
+std::string newsOf(const ScreenChange& change, const Item& item) {
+  const auto found = std::ranges::find(change.changed, item.id, &ItemChange::item);
+  if (found == change.changed.end()) return "";
+  const bool isOtherwise = found->selected || found->disabled || found->expansion;
+  const std::string state = isOtherwise ? stateWords(item) : std::string();
+  const bool needsName = found->name || (isOtherwise && state.empty());
+  return reader::joined({needsName ? item.name : std::string(), state});
+}
+
+QString screenTitle(const std::string& title) {
+  return QString::fromStdString(title.empty() ? reader::readerText("screen.untitled")
+                                              : reader::readerText("screen.title", {title}));
+}
+
+}  // namespace
+
+ViewWindow::ViewWindow(app::Presentation& presentation, Voice voice)
+    : presentation_(presentation),
+      voice_(voice),
+      model_([&] { return presentation_.snapshot(); }),
+      canvas_(new ScreenCanvas(model_)),
+      area_(new QScrollArea),
+      caption_(new Caption),
+      notice_(new Notice),
+      tree_(model_, *canvas_,
+            {[this](ItemId item) { focusOn(item); },
+             [this](Action action, ItemId item) { follow(operate(model_, action, item)); }}) {
+  setWindowTitle(screenTitle(presentation_.run().title()));
+  canvas_->setAccessibleName(windowTitle());
+  layOut();
+  fillMenus();
+  listen();
+  draw();
+  const QSize room = screen()->availableSize() * shareOfDesktop;
+  const int beside = area_->verticalScrollBar()->sizeHint().width() + 2 * area_->frameWidth();
+  const int beneath = menuBar()->sizeHint().height() + caption_->minimumHeight() + beside;
+  resize((canvas_->size() + QSize(beside, beneath)).boundedTo(room).expandedTo({leastWidth, 0}));
+  showFocus();
+  // Once the window is there.
+  QTimer::singleShot(0, this, [this] { say(caption_->text().toStdString()); });
+}
+
+void ViewWindow::layOut() {
+  auto* all = new QWidget;
+  auto* column = new QVBoxLayout(all);
+  column->setContentsMargins(0, 0, 0, 0);
+  column->setSpacing(0);
+  area_->setWidget(canvas_);
+  area_->setAlignment(Qt::AlignCenter);
+  area_->setFocusPolicy(Qt::NoFocus);
+  area_->setSizeAdjustPolicy(QAbstractScrollArea::AdjustToContents);
+  column->addWidget(area_, 1);
+  column->addWidget(caption_);
+  column->addWidget(notice_);
+  setCentralWidget(all);
+  canvas_->setFocus();
+}
+
+void ViewWindow::fillMenus() {
+  std::map<std::string, QMenu*> menus;
+  for (const Command& command : commands()) {
+    QMenu*& menu = menus[command.menu];
+    if (menu == nullptr) menu = menuBar()->addMenu(viewText(command.menu));
+    QAction* action = menu->addAction(commandText(command));
+    action->setShortcuts(keysOf(command));
+    connect(action, &QAction::triggered, this, [this, &command] { command.run(*this, command.with); });
+  }
+}
+
+void ViewWindow::listen() {
+  // After Qt has told of the canvas itself.
+  canvas_->onFocusIn = [this] { QTimer::singleShot(0, this, [this] { tree_.tellFocus(); }); };
+  canvas_->onTouch = [this](ItemId item) {
+    if (item != 0) focusOn(item);
+  };
+}
+
+void ViewWindow::draw() {
+  canvas_->setPicture(pictureOf(model_, presentation_.run().title(), palette()), pictureInk(palette()));
+}
+
+void ViewWindow::focusOn(ItemId item) {
+  if (!model_.setFocus(item)) return;
+  tour_.leave();
+  notice_->clearAway();
+  showFocus();
+  tree_.tellFocus();
+  say(caption_->text().toStdString());
+}
+
+void ViewWindow::showFocus() {
+  const Item* item = focused();
+  const std::string line = item == nullptr ? reader::readerText("screen.empty") : item->line;
+  caption_->show(QString::fromStdString(line));
+  canvas_->update();
+  if (item != nullptr) {
+    const QRect frame = canvas_->rectOf(item->node.frame).toRect();
+    area_->ensureVisible(frame.center().x(), frame.center().y(), frame.width() / 2 + roomAround,
+                         frame.height() / 2 + roomAround);
+  }
+}
+
+void ViewWindow::announce(const std::vector<std::string>& lines) {
+  if (lines.empty()) return;
+  const std::string all = reader::joined(lines);
+  notice_->announce(QString::fromStdString(all));
+  say(all);
+}
+
+void ViewWindow::say(const std::string& line) {
+  if (voice_ == Voice::none) return;
+  if (const auto spoken = reader::spokenSound(line, formatting::currentRegion().locale)) play(*spoken);
+}
+
+void ViewWindow::play(const reader::Sound& sound) {
+  if (loudspeaker_.play(sound) || hasToldOfSilence_) return;
+  hasToldOfSilence_ = true;
+  std::cerr << "axvelto-view: " << viewText("no.sound").toStdString() << '\n';
+  notice_->announce(viewText("no.sound"));
+}
+
+void ViewWindow::follow(const Effect& effect) {
+  if (effect.result == reader::ActionResult::raised) {
+    std::cerr << "axvelto-view: " << presentation_.scene().file << ": the host raised when it was acted on\n";
+  }
+  if (effect.change.isAny()) {
+    tour_.leave();
+    draw();
+    showFocus();
+  }
+  tree_.tell(effect.change);
+  std::vector<std::string> lines = effect.announcements;
+  const std::string news = focused() == nullptr ? std::string() : newsOf(effect.change, *focused());
+  if (!news.empty()) lines.insert(lines.begin(), news);
+  announce(lines);
+}
+
+void ViewWindow::go(int direction, const ScreenModel::Test& test) {
+  const ItemId item = model_.neighbour(model_.focus(), direction, test);
+  if (item == 0) return announce(viewText("nothing.more"));
+  focusOn(item);
+}
+
+void ViewWindow::goToEnd(int direction) {
+  const auto& order = model_.readingOrder();
+  if (!order.empty()) focusOn(direction < 0 ? order.front() : order.back());
+}
+
+void ViewWindow::goToChart(int direction) {
+  const ItemId here = model_.chartAround(model_.focus());
+  go(direction, [&](const Item& item) {
+    const ItemId chart = model_.chartAround(item.id);
+    return chart != 0 && chart != here && isFirstIn(model_, chart, item.id);
+  });
+}
+
+void ViewWindow::activate() {
+  follow(operate(model_, Action::activate, model_.focus()));
+}
+
+void ViewWindow::adjust(int direction) {
+  const Action action = direction > 0 ? Action::increment : Action::decrement;
+  const Item* item = focused();
+  if (item != nullptr && item->node.actions.has(action)) return follow(operate(model_, action, item->id));
+  go(-direction, [](const Item&) { return true; });
+}
+
+void ViewWindow::dismiss() {
+  follow(dismissModal(model_, model_.focus()));
+}
+
+void ViewWindow::stepInChart(int direction) {
+  if (model_.chartAround(model_.focus()) == 0) return go(direction, [](const Item&) { return true; });
+  const ChartStep* step = tour_.step(model_, model_.focus(), direction);
+  if (step == nullptr) return announce(viewText("nothing.more"));
+  const Item* element = model_.find(step->item);
+  if (element != nullptr) {
+    model_.setFocus(element->id);
+    notice_->clearAway();
+    showFocus();
+    tree_.tellFocus();
+  } else {
+    notice_->announce(QString::fromStdString(step->line));
+  }
+  soundStep(element != nullptr ? element->line : step->line);
+}
+
+void ViewWindow::soundStep(const std::string& line) {
+  reader::Sound sound;
+  const Item* chart = model_.find(tour_.chart());
+  if (const std::optional<StepNote> note = noteOfStep(model_, *chart, tour_.steps(), tour_.at())) {
+    sound = reader::note(reader::pitchOf(note->height), note->place);
+  }
+  if (voice_ == Voice::own) {
+    if (const auto spoken = reader::spokenSound(line, formatting::currentRegion().locale)) sound.add(*spoken);
+  }
+  play(sound);
+}
+
+// A screen reader would talk into an introduction.
+void ViewWindow::playChart() {
+  const Item* item = model_.find(model_.chartAround(model_.focus()));
+  if (item == nullptr) return announce(viewText("no.chart"));
+  const reader::Node& chart = *model_.snapshot().node(item->node.id);
+  const reader::Sound notes = reader::notesSound(model_.snapshot(), chart);
+  if (notes.pairs() == 0) return announce({reader::readerText("chart.no.data")});
+  play(voice_ == Voice::own ? reader::chartSound(model_.snapshot(), chart) : notes);
+}
+
+void ViewWindow::askSlice(int slice) {
+  const Item* chart = model_.find(model_.chartAround(model_.focus()));
+  if (chart == nullptr) return announce(viewText("no.chart"));
+  const std::string line = sliceLine(*chart, std::size_t(slice));
+  announce(line.empty() ? viewText("no.slice") : QString::fromStdString(line));
+}
+
+void ViewWindow::zoom(int direction) {
+  const double factor = direction > 0 ? zoomStep : 1 / zoomStep;
+  canvas_->setZoom(direction == 0 ? 1 : std::clamp(canvas_->zoom() * factor, leastZoom, mostZoom));
+  showFocus();
+}
+
+void ViewWindow::showKeys() {
+  (new KeyList(this))->open();
+}
+
+void ViewWindow::leave() {
+  close();
+}
+
+}  // namespace ax::view
