@@ -1,6 +1,7 @@
 #include "bench/BundleSides.h"
 
 #include <filesystem>
+#include <iterator>
 
 #include "bench/Comparison.h"
 #include "platform/accessibility/BundleLoader.h"
@@ -45,6 +46,17 @@ void compareMonths(std::vector<Row>& rows) {
   rows.push_back({"month of 42, formatters made when warm", "", formattersMadeByWarmMonth(), "bound", 0, 1});
 }
 
+void compareSounds(std::vector<Row>& rows) {
+  const char* const titles[] = {"sound of a day, per value of 24", "sound of a month, per value of 30",
+                                "sound of readings, per value of 10000"};
+  for (std::size_t i = 0; i < std::size(soundSizes); ++i) {
+    compare({sized("sound ", soundSizes[i]), titles[i]}, rows);
+  }
+  compareGrowth({"sound, growth per value from 24 to 10000", sized("sound ", soundSizes[0]),
+                 sized("sound ", soundSizes[2]), 1.25},
+                rows);
+}
+
 }  // namespace
 
 bool openBundleForSides(const std::string& program) {
@@ -57,6 +69,7 @@ bool openBundleForSides(const std::string& program) {
   addChartSides();
   addSliceSides();
   addMonthSides();
+  addSoundSides();
   return true;
 }
 
@@ -64,6 +77,7 @@ void compareBundleSides(std::vector<Row>& rows) {
   compareCharts(rows);
   compareSlices(rows);
   compareMonths(rows);
+  compareSounds(rows);
 }
 
 }  // namespace bench

@@ -4,6 +4,7 @@
 #include <vector>
 
 #include "bench/Report.h"
+#include "platform/toolkit/View.h"
 
 // What the bundle describes, beside the same work written directly. It is measured after everything else,
 // because the bundle changes the classes of this process for good.
@@ -16,6 +17,10 @@ bool openBundleForSides(const std::string& program);
 void addChartSides();
 void addSliceSides();
 void addMonthSides();
+void addSoundSides();
+
+// A trend of that many days, laid out.
+ax::Ref<ax::View> trendChart(int bars);
 
 // After the run.
 void compareBundleSides(std::vector<Row>& rows);
@@ -30,6 +35,7 @@ inline constexpr double benchDay = 86400;
 inline constexpr int standSizes[] = {24, 10'000};
 inline constexpr int trendSizes[] = {365, 10'000};
 inline constexpr int readingSizes[] = {10'000, 100'000};
+inline constexpr int soundSizes[] = {24, 30, 10'000};
 inline constexpr int monthSizes[] = {42, 420, 4'200};
 
 inline std::string sized(const char* what, int size) {

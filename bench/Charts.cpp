@@ -16,6 +16,12 @@ namespace {
 
 using namespace ax;
 
+Ref<View> laidOut(const Ref<View>& chart) {
+  chart->setFrame({0, 0, 360, 200});
+  chart->layoutSubviews();
+  return chart;
+}
+
 Ref<View> moveChart(int spans) {
   const auto chart = make<host::ActivityMoveAndExerciseChartView>();
   Array::Items points;
@@ -29,21 +35,6 @@ Ref<View> standChart(int hours) {
   Array::Items points;
   for (int i = 0; i < hours; ++i) points.push_back(point(double(i), double(i % 2)));
   chart->setStandChartPoints(array(std::move(points)));
-  return chart;
-}
-
-Ref<View> trendChart(int bars) {
-  const auto chart = make<host::TrendDetailChartView>();
-  const Ref<Unit> unit = Unit::unitFromString("km");
-  Array::Items items;
-  for (int i = 0; i < bars; ++i) {
-    const double start = startOfBar(i, bars);
-    items.push_back(hostObject("Velto.TrendBar"));
-    setMember(*items.back(), "dateInterval"_key, make<DateInterval>(date(start), date(start + benchDay)));
-    setMember(*items.back(), "quantity"_key, quantity(figureOfBar(i), unit));
-  }
-  setMember(*chart, "bars"_key, array(std::move(items)));
-  chart->setAccessibilityUnit(unit);
   return chart;
 }
 
@@ -66,9 +57,7 @@ template <class Floor>
 void addSides(const Chart& chart, int count) {
   const std::string name = sized(chart.name, count);
   const auto shown = [make = chart.make, count] {
-    Ref<View> view = make(count);
-    view->setFrame({0, 0, 360, 200});
-    view->layoutSubviews();
+    Ref<View> view = laidOut(make(count));
     check(describe(view) == static_cast<std::size_t>(count), "a chart lacks elements");
     return view;
   };
@@ -91,6 +80,21 @@ void addSides(const Chart& chart, int count) {
 }
 
 }  // namespace
+
+Ref<View> trendChart(int bars) {
+  const auto chart = make<host::TrendDetailChartView>();
+  const Ref<Unit> unit = Unit::unitFromString("km");
+  Array::Items items;
+  for (int i = 0; i < bars; ++i) {
+    const double start = startOfBar(i, bars);
+    items.push_back(hostObject("Velto.TrendBar"));
+    setMember(*items.back(), "dateInterval"_key, make<DateInterval>(date(start), date(start + benchDay)));
+    setMember(*items.back(), "quantity"_key, quantity(figureOfBar(i), unit));
+  }
+  setMember(*chart, "bars"_key, array(std::move(items)));
+  chart->setAccessibilityUnit(unit);
+  return laidOut(chart);
+}
 
 void addChartSides() {
   addSides<MoveChartTexts>({"move chart ", &moveChart}, 8);

@@ -49,6 +49,17 @@ class Overriding : public SafeCategory<Overriding> {
 const CategoryRegistration<Overriding> registration{
     "BenchOverriding", "Bench.Overridden", {overrides<&Overriding::advance>(advance)}};
 
+auto sendNothing() {
+  return [object = std::make_shared<Plain>()] {
+    Plain* receiver = object.get();
+    for (std::int64_t i = 0; i < bench::batch; ++i) {
+      benchmark::DoNotOptimize(receiver);
+      std::int64_t answer = i;
+      benchmark::DoNotOptimize(answer);
+    }
+  };
+}
+
 auto sendVirtually() {
   return [object = std::make_shared<Plain>()] {
     Plain* receiver = object.get();
@@ -78,6 +89,7 @@ auto sendToOverride() {
 const bench::RegisteredSide sides[] = {{"send", "ours", send<Sent>, bench::batch},
                                        {"send", "floor", sendVirtually, bench::batch},
                                        {"super", "ours", sendToOverride, bench::batch},
-                                       {"super", "floor", sendVirtually, bench::batch}};
+                                       {"super", "floor", sendVirtually, bench::batch},
+                                       {"loop", "ours", sendNothing, bench::batch}};
 
 }  // namespace

@@ -46,6 +46,13 @@ void addSide(Side side) {
   sides().push_back(std::move(side));
 }
 
+const Side* sideOf(const std::string& operation, const std::string& name) {
+  const auto found = std::find_if(sides().begin(), sides().end(), [&](const Side& side) {
+    return side.operation == operation && side.name == name;
+  });
+  return found == sides().end() ? nullptr : &*found;
+}
+
 void runSides() {
   static std::size_t done = 0;
   benchmark::ClearRegisteredBenchmarks();

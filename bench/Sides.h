@@ -3,6 +3,7 @@
 #include <benchmark/benchmark.h>
 
 #include <functional>
+#include <memory>
 #include <string>
 #include <vector>
 
@@ -15,10 +16,13 @@ struct Side {
   std::string operation;
   std::string name;  // "ours", "floor", or a peer's
   std::function<void(benchmark::State&)> body;
+  std::function<void(int)> repeat;  // that many iterations
   int items = 1;
 };
 
 void addSide(Side side);
+// Null when there is none.
+const Side* sideOf(const std::string& operation, const std::string& name);
 
 // Stands in a source file for each side that it brings. What the side works on is made at its first run and
 // kept: were it made anew among the others, the walks would measure the holes that those left in the heap.
@@ -26,11 +30,18 @@ struct RegisteredSide {
   template <class Body>
   RegisteredSide(std::string operation, std::string name, Body once, int items = 1) {
     using Run = decltype(once());
+    const auto kept = [once, made = std::make_shared<Run*>(nullptr)]() -> Run& {
+      if (*made == nullptr) *made = new Run(once());
+      return **made;
+    };
     addSide({std::move(operation), std::move(name),
-             [once, kept = static_cast<Run*>(nullptr)](benchmark::State& state) mutable {
-               if (kept == nullptr) kept = new Run(once());
-               Run& run = *kept;
+             [kept](benchmark::State& state) {
+               Run& run = kept();
                for ([[maybe_unused]] auto iteration : state) run();
+             },
+             [kept](int times) {
+               Run& run = kept();
+               for (int i = 0; i < times; ++i) run();
              },
              items});
   }

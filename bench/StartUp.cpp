@@ -44,9 +44,21 @@ int installGenerated() {
   return 0;
 }
 
+int openHost(const std::string& program) {
+  const std::string host = builtFile(program, "lib/libaxvelto-host.so");
+  return dlopen(host.c_str(), RTLD_NOW | RTLD_GLOBAL) == nullptr ? 1 : 0;
+}
+
+int openBundle(const std::string& program) {
+  std::string error;
+  const bool isOpen =
+      openHost(program) == 0 &&
+      ax::LoadedBundle::open(builtFile(program, "lib/AXVelto/AXVelto.so"), "AXVeltoGlue", error);
+  return isOpen ? 0 : 1;
+}
+
 int startBundle(const std::string& program) {
-  if (dlopen(builtFile(program, "lib/libaxvelto-host.so").c_str(), RTLD_NOW | RTLD_GLOBAL) == nullptr)
-    return 1;
+  if (openHost(program) != 0) return 1;
   std::string error;
   const auto start = Clock::now();
   const auto bundle =
@@ -85,6 +97,9 @@ double median(std::vector<double> values) {
 }  // namespace
 
 int runStartUpChild(const std::string& kind, const std::string& program) {
+  if (kind == "nothing") return 0;
+  if (kind == "host") return openHost(program);
+  if (kind == "opened") return openBundle(program);
   if (kind == "classes") return openClasses(program);
   return kind == "bundle" ? startBundle(program) : installGenerated();
 }

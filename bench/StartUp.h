@@ -14,7 +14,8 @@ struct StartUp {
 };
 StartUp measureStartUp(const std::string& program);
 
-// What such a process does: prints its figures to standard output.
+// What such a process does: prints its figures to standard output. "nothing", "host" and "opened" print none:
+// they stop before the classes, the bundle and its start.
 int runStartUpChild(const std::string& kind, const std::string& program);
 
 }  // namespace bench

@@ -45,12 +45,10 @@ class Node {
   virtual ~Node() = default;
   virtual Ref<String> label() const { return nullptr; }
   virtual Traits traits() const { return 0; }
-  virtual Point boundsOrigin() const { return {}; }
   virtual Rect frame() const {
     Rect own = {0, 0, rect.width, rect.height};
     for (const Node* node = this; node != nullptr; node = node->parent) {
-      const Point origin = node->boundsOrigin();
-      own = own.movedBy({node->rect.x - origin.x, node->rect.y - origin.y});
+      own = own.movedBy({node->rect.x - node->origin.x, node->rect.y - node->origin.y});
     }
     return own;
   }
@@ -59,6 +57,7 @@ class Node {
     children.push_back(std::move(child));
   }
   Rect rect;
+  Point origin;
   Node* parent = nullptr;
   std::vector<std::unique_ptr<Node>> children;
 };

@@ -1,8 +1,10 @@
+#include <algorithm>
 #include <cstdio>
-#include <cstring>
 
 #include "bench/BundleSides.h"
 #include "bench/Comparison.h"
+#include "bench/Instructions.h"
+#include "bench/Pages.h"
 #include "bench/Report.h"
 #include "bench/Sides.h"
 #include "bench/Sizes.h"
@@ -21,11 +23,15 @@ const Operation operations[] = {
     {"read text",
      "read by a key that arrives at run time",
      {{"floor", 1.5}, {"Qt", 1 / 5.0}, {"GLib", 1 / 5.0}, {"RTTR", 1}}},
+    {"class", "class by a literal name"},
     {"get", "stored value, get", {{"Qt", 1 / 10.0}, {"GLib", 1 / 10.0}}},
     {"set", "stored value, set"},
     {"walk 1000", "walk, per node of 1,000"},
     {"walk 10000", "walk, per node of 10,000", {{"floor", 2}, {"ATK", 1 / 4.0}}},
     {"walk 100000", "walk, per node of 100,000"},
+    {"fit", "workout file in FIT, per MB"},
+    {"tcx", "workout file in TCX, per MB"},
+    {"gpx", "workout file in GPX, per MB"},
 };
 
 void compareSizes(std::vector<Row>& rows) {
@@ -84,6 +90,18 @@ std::vector<std::string> missingPeers() {
   return notes;
 }
 
+void print(const std::vector<Row>& rows, const std::vector<std::string>& notes, bool json) {
+  std::fputs((json ? asJson(rows, notes) : asText(rows, notes)).c_str(), stdout);
+}
+
+int countInstructions(const std::string& program, bool json) {
+  std::vector<Row> rows;
+  std::vector<std::string> notes;
+  compareInstructions(program, rows, notes);
+  print(rows, notes, json);
+  return rows.empty() ? 1 : 0;
+}
+
 int run(const std::string& program, bool json) {
   std::vector<Row> rows;
   std::vector<std::string> notes = missingPeers();
@@ -92,10 +110,11 @@ int run(const std::string& program, bool json) {
   compareGrowth(
       {"walk, growth per node from 1,000 to 100,000", walkName(walkSizes[0]), walkName(walkSizes[2]), 1.25},
       rows);
+  comparePages(rows);
   compareSizes(rows);
   compareStartUp(program, rows, notes);
   measureBundle(program, rows, notes);
-  std::fputs((json ? asJson(rows, notes) : asText(rows, notes)).c_str(), stdout);
+  print(rows, notes, json);
   return 0;
 }
 
@@ -104,13 +123,19 @@ int run(const std::string& program, bool json) {
 }  // namespace bench
 
 int main(int count, char** arguments) {
-  if (count == 3 && std::strcmp(arguments[1], "--start-up") == 0) {
-    return bench::runStartUpChild(arguments[2], arguments[0]);
+  const std::vector<std::string> options(arguments + 1, arguments + count);
+  const auto has = [&](const char* option) {
+    return std::find(options.begin(), options.end(), option) != options.end();
+  };
+  const std::string program = arguments[0];
+  if (options.size() == 2 && options[0] == "--start-up") return bench::runStartUpChild(options[1], program);
+  if (options.size() == 4 && options[0] == "--repeat") {
+    return bench::repeatSide(program, options[1], options[2], std::stoi(options[3])) ? 0 : 1;
   }
-  const bool json = count == 2 && std::strcmp(arguments[1], "--json") == 0;
-  if (count > 1 && !json) {
-    std::fputs("usage: axvelto-bench [--json]\n", stderr);
+  const bool json = has("--json"), instructions = has("--instructions");
+  if (options.size() != std::size_t(json) + std::size_t(instructions)) {
+    std::fputs("usage: axvelto-bench [--instructions] [--json]\n", stderr);
     return 2;
   }
-  return bench::run(arguments[0], json);
+  return instructions ? bench::countInstructions(program, json) : bench::run(program, json);
 }
