@@ -48,7 +48,7 @@ void answer(Object& chart, const char* method, const std::function<Ref<Object>()
 
 template <class T, auto Give>
 ChartOfBars chartOfBars(Ref<Object> (*bar)(double), bool hasTitle) {
-  const auto made = [hasTitle] {
+  const auto made = [=] {
     const auto chart = make<T>();
     chart->setFrame({0, 0, 70, 100});
     if constexpr (requires { chart->setTitleLabel(nullptr); }) {

@@ -1,5 +1,7 @@
 #include <gtest/gtest.h>
 
+#include <chrono>
+
 #include "platform/foundation/AttributedString.h"
 #include "tests/bundle/StartedBundle.h"
 
@@ -38,7 +40,8 @@ class PaceTest : public testing::Test {
 TEST_F(PaceTest, IsMarkedAsADurationInSeconds) {
   EXPECT_EQ(spokenPace("5'30\""), (Spoken{"330", "330"}));
   EXPECT_EQ(spokenPace("12' 05''"), (Spoken{"725", "725"}));
-  for (const std::string space : {"\t", "\u00a0", "\u1680", "\u2007", "\u200a", "\u202f", "\u3000"}) {
+  for (const std::string space :
+       {"\t", "\u00a0", "\u1680", "\u2007", "\u200a", "\u202f", "\u3000", "\u2028", "\u0085"}) {
     EXPECT_EQ(spokenPace("5'" + space + "30\""), (Spoken{"330", "330"})) << '"' << space << '"';
   }
   EXPECT_EQ(spokenPace("0'0\""), (Spoken{"0", "0"}));
@@ -70,13 +73,22 @@ TEST_F(PaceTest, WritesFiguresInTheLanguageOfTheReader) {
   const EnvironmentScope arabic(Environment{.locale = "ar_EG"});
   EXPECT_EQ(spokenPace("5'30\""), (Spoken{"\u0663\u0663\u0660", "\u0663\u0663\u0660"}));
   EXPECT_EQ(spokenPace("\u0665'\u0663\u0660\""), (Spoken{"\u0665'\u0663\u0660\"", ""}));
+  EXPECT_EQ(spokenPace("\u0661\u0665'30\"").text, "\u0669\u0663\u0660") << "minutes in figures of any script";
 }
 
 TEST_F(PaceTest, SurvivesEndlessFigures) {
   EXPECT_EQ(spokenPace("99999999999999999999'30\""), (Spoken{"9223372036854775807", "9223372036854775807"}));
   EXPECT_EQ(spokenPace("153722867280912930'08\""), (Spoken{"9223372036854775807", "9223372036854775807"}));
-  const std::string endless = std::string(1'000'000, '7') + "'30\"";
-  EXPECT_EQ(spokenPace(endless).text, endless);
+  EXPECT_EQ(spokenPace(std::string(100'000, '0') + "5'30\"").text, "330");
+  EXPECT_EQ(spokenPace(std::string(900, '7') + " 5'30\"").asDuration, "330") << "of any pace after them";
+}
+
+// Every further digit costs the search as many steps as there are.
+TEST_F(PaceTest, LosesItsMarkAndNoTextWhereSearchingTakesTooLong) {
+  const std::string endless = std::string(1'000'000, '7');
+  const auto start = std::chrono::steady_clock::now();
+  EXPECT_EQ(spokenPace(endless + " 5'30\""), (Spoken{endless + " 5'30\"", ""}));
+  EXPECT_LT(std::chrono::steady_clock::now() - start, std::chrono::seconds(5));
 }
 
 }  // namespace

@@ -1,5 +1,7 @@
 #include <gtest/gtest.h>
 
+#include <chrono>
+
 #include "host/sharing/CHFriendInboxBarButtonView.h"
 #include "platform/foundation/Formatters.h"
 #include "platform/runtime/ScriptedAnswers.h"
@@ -47,6 +49,13 @@ TEST_F(InboxBadgeTest, CountsNoMoreThanThirtyTwoBitsHold) {
   EXPECT_EQ(valueFor("99999999999999999999"), "2,147,483,647 items waiting");
   EXPECT_EQ(valueFor("-99999999999999999999"), "(none)");
   EXPECT_EQ(valueFor("1e400"), "(none)");
+}
+
+// Reading digits takes a time that grows with the square of their number; a million once took seconds.
+TEST_F(InboxBadgeTest, DoesNotReadDigitsWithoutEnd) {
+  const auto start = std::chrono::steady_clock::now();
+  EXPECT_EQ(valueFor(std::string(1 << 20, '9')), "(none)");
+  EXPECT_LT(std::chrono::steady_clock::now() - start, std::chrono::seconds(1));
 }
 
 TEST_F(InboxBadgeTest, HasNoValueWhenTheBadgeAnswersSomethingElse) {

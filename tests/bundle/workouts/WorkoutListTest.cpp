@@ -38,13 +38,13 @@ TEST_F(WorkoutRowTest, IsUsedAgainForWorkoutsOfOtherMakers) {
   row_->setWorkout(SomeWorkout{.start = start, .source = "Trail Log"}.made());
   const Ref<ImageView> icon = row_->imageView();
   EXPECT_EQ(labelOf(icon), "Trail Log");
-  EXPECT_EQ(dateLabel(), "Saturday, Mar 7, 2026");
+  EXPECT_EQ(dateLabel(), "Saturday, March 7, 2026");
 
   row_->setWorkout(SomeWorkout{.start = start + 86400, .source = "Watch", .isWatch = true}.made());
   EXPECT_EQ(row_->imageView(), icon);
   EXPECT_EQ(icon->image(), nullptr);
   EXPECT_EQ(labelOf(icon), "Trail Log") << "the icon is only ever named, never silenced";
-  EXPECT_EQ(dateLabel(), "Sunday, Mar 8, 2026");
+  EXPECT_EQ(dateLabel(), "Sunday, March 8, 2026");
 
   row_->setWorkout(SomeWorkout{.start = start, .source = ""}.made());
   EXPECT_EQ(labelOf(icon), "Trail Log");
@@ -62,16 +62,16 @@ TEST_F(WorkoutRowTest, HasNoNameOfTheWatch) {
 TEST_F(WorkoutRowTest, KeepsTheDateOfItsLastWorkoutThatHadOne) {
   row_->setWorkout(SomeWorkout{.start = start}.made());
   row_->setWorkout(SomeWorkout{}.made());
-  EXPECT_EQ(dateLabel(), "Saturday, Mar 7, 2026");
+  EXPECT_EQ(dateLabel(), "Saturday, March 7, 2026");
   row_->setWorkout(nullptr);
-  EXPECT_EQ(dateLabel(), "Saturday, Mar 7, 2026");
+  EXPECT_EQ(dateLabel(), "Saturday, March 7, 2026");
 }
 
 TEST_F(WorkoutRowTest, SpeaksItsDateInTheLanguageAndZoneOfItsSetUp) {
   row_->setWorkout(SomeWorkout{.start = start}.made());
   const EnvironmentScope german(
       Environment{.locale = "de_DE", .timeZone = "Pacific/Kiritimati", .now = start});
-  EXPECT_EQ(dateLabel(), "Saturday, Mar 7, 2026");
+  EXPECT_EQ(dateLabel(), "Saturday, March 7, 2026");
   load(row_);
   EXPECT_EQ(dateLabel(), "Sonntag, 8. März 2026");
 }
@@ -83,7 +83,7 @@ TEST_F(WorkoutRowTest, IsLeftAloneWhenTheHostRaises) {
   ASSERT_TRUE(setScriptedAnswer(*row_, configure.selector(),
                                 [](auto) -> Ref<Object> { throw std::runtime_error("no workout"); }));
   EXPECT_THROW(configure(row_), std::runtime_error);
-  EXPECT_EQ(dateLabel(), "Saturday, Mar 7, 2026");
+  EXPECT_EQ(dateLabel(), "Saturday, March 7, 2026");
 }
 
 class DurationTest : public WorkoutListTest {
