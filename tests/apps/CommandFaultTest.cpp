@@ -37,15 +37,18 @@ TEST_F(CommandFaults, TellWhatIsWrongWhereAndWhatWasExpected) {
       "platform");
   expectRefusal("speak -", "<kml/>",
                 "-: the root element is kml, at line 1, column 2, expected TrainingCenterDatabase or gpx");
-  expectRefusal("import -", oneNote, "-: there is no element, at line 1, column 1, expected an XML document");
+  expectRefusal("import -", oneNote, "-: a JSON text, expected a workout in FIT, TCX or GPX");
   expectRefusal("import - --locale xx_YY", "",
                 "--locale: \"xx_YY\" is no known locale, expected one such as en_US");
   expectRefusal("import - --time-zone Mars/Olympus", "",
                 "--time-zone: \"Mars/Olympus\" is no known time zone, expected one such as Europe/Berlin");
-  expectRefusal("speak no/such.json", "", "no/such.json: cannot be read, expected a scene or a workout file");
+  expectRefusal("speak no/such.json", "",
+                "no/such.json: there is no such file, expected a scene or a workout file");
   expectRefusal("check --without Label.Ring", "",
                 "--without: unknown member \"Ring\", expected a member, method, class method or protocol of "
                 "class Label");
+  expectRefusal("check --without View.", "",
+                "--without: no class for \"View.\", expected Class or Class.member");
   expectRefusal("graph - --of nobody", oneNote,
                 "-: no object \"nobody\", at --of, expected an id of the scene");
 }
@@ -95,6 +98,55 @@ TEST_F(CommandFaults, AHostThatRaisesIsToldOfAndSpeaksOn) {
   EXPECT_EQ(outcome.err,
             "axvelto: -: the host raised, in View layoutSubviews: no room\n"
             "axvelto: -: the host raised while it was asked, 1 time\n");
+}
+
+// Neither one object that raises wherever it is asked nor objects without end keep the others from speaking.
+TEST_F(CommandFaults, WhatTheHostDoesWrongNeverEndsACommand) {
+  const std::string raising = scene(R"("title": "T", "screen": {"class": "View",
+      "set": {"frame": {"rect": [0, 0, 90, 90]}}, "subviews": [
+        {"class": "Label", "set": {"text": "a", "frame": {"rect": [0, 0, 90, 40]}}},
+        {"class": "View", "set": {"frame": {"rect": [0, 0, 90, 40]}},
+         "answers": {"accessibilityContainer": {"raises": "lost"}}}]})");
+  const Outcome spoken = run("speak -", raising);
+  EXPECT_EQ(spoken.code, 0);
+  EXPECT_EQ(spoken.out, "Screen: T\na\n");
+  EXPECT_EQ(spoken.err, "axvelto: -: the host raised while it was asked, 2 times\n");
+  const Outcome touched = run("ask - --at 5,5", raising);
+  EXPECT_EQ(touched.code, 0);
+  EXPECT_EQ(touched.out, "a\n");
+
+  std::string chain;
+  for (int i = 0; i < 300; ++i) {
+    chain += R"({"class": "View", "id": "v)" + std::to_string(i) +
+             R"(", "set": {"accessibilityElements": [{"ref": "v)" + std::to_string(i + 1) + R"("}]}}, )";
+  }
+  const Outcome deep =
+      run("speak -", scene(R"("title": "T", "objects": [)" + chain + R"({"class": "View", "id": "v300"}],
+      "screen": {"class": "View", "set": {"accessibilityElements": [{"ref": "v0"}]}})"));
+  EXPECT_EQ(deep.code, 0);
+  EXPECT_EQ(deep.out, "Screen: T\nNothing to speak\n");
+  EXPECT_EQ(deep.err, "axvelto: -: what lies deeper than 256 levels was left out, 1 time\n");
+}
+
+// Files come from strangers: what they hold is shown and never obeyed, on one line each and not without end.
+TEST_F(CommandFaults, TextsOfAFileDoNotReachTheTerminalAsOrders) {
+  expectRefusal(
+      "speak -", scene(R"("screen": {"class": "a\u001b[2J\n\u202eb"})"),
+      "-: unknown class \"a\\u001b[2J\\u000a\\u202eb\", at /screen/class, expected a class of the host or "
+      "the platform");
+  const std::string endless(1 << 20, 'x');
+  expectRefusal(
+      "speak -", scene(R"("screen": {"class": ")" + endless + "\"}"),
+      "-: unknown class \"" + endless.substr(0, 985) +
+          "... (1048592 characters), at /screen/class, expected a class of the host or the platform");
+  const std::string ordering = scene(R"("title": "T\u009b", "screen": {"class": "View", "subviews": [
+      {"class": "Label", "id": "l", "set": {"text": "a\u001b[31m\u2066b\u007f"}}]})");
+  EXPECT_EQ(run("speak -", ordering).out, "Screen: T\\u009b\na\\u001b[31m\\u2066b\\u007f\n");
+  const std::string tree = run("tree -", ordering).out;
+  EXPECT_NE(tree.find(R"("a\u001b[31m\u2066b\u007f")"), std::string::npos) << tree;
+  EXPECT_EQ(Json::parse(tree)["elements"][0]["label"], "a\u001b[31m\u2066b\u007f");
+  EXPECT_EQ(run("'sp\u001beak\n'").err,
+            "axvelto: unknown command \"sp\\u001beak\\u000a\" (axvelto --help tells the use)\n");
 }
 
 TEST_F(CommandFaults, AnActionThatCannotBeDoneFallsShort) {

@@ -68,6 +68,43 @@ TEST_F(Commands, ALanguageOfTheOtherDirectionTurnsTheScreenAround) {
   EXPECT_LT(month.find("٢٣ فبراير"), month.find("١ مارس"));
 }
 
+// A touch on the header counts from the left in every language.
+TEST_F(Commands, TheWeekStaysBelowItsWeekdaysInEveryLanguage) {
+  for (const char* locale : {"en_US", "ar_EG"}) {
+    const Json week =
+        Json::parse(run("tree " + sample("week-palette.json") + " --locale " + locale).out)["elements"];
+    std::size_t first = 0;
+    while (week[first]["value"].is_null()) ++first;
+    for (std::size_t day = 0; day < 7; ++day) {
+      const double weekday = week[first + day]["frame"][0];
+      EXPECT_EQ(weekday, 6 + 54.0 * double(day)) << locale;
+      EXPECT_EQ(week[first + 7 + day]["frame"][0], weekday + 2)
+          << locale << ", read in the order of the week";
+    }
+  }
+}
+
+TEST_F(Commands, AskComparesWithWhatTheSceneExpectsAndWritesItIn) {
+  const std::string start = oneButton;
+  const auto scene = [&](const std::string& more) { return start.substr(0, start.size() - 1) + more + "}"; };
+  const std::string wrong = scene(R"(, "steps": [
+    {"ask": "accessibilityValue", "of": "pages", "expect": "Page 9"},
+    {"ask": "accessibilityElements", "of": "pages"}], "expect": {"speak": ["Screen: Deck"]})");
+  const Outcome differs = run("ask -", wrong);
+  EXPECT_EQ(differs.code, 1);
+  EXPECT_NE(differs.err.find("/steps/0/expect"), std::string::npos) << differs.err;
+  EXPECT_NE(differs.err.find("/expect/speak/1"), std::string::npos) << differs.err;
+  EXPECT_EQ(std::count(differs.err.begin(), differs.err.end(), '\n'), 3) << differs.err;
+
+  const std::string path = file("wrong.json", wrong);
+  EXPECT_EQ(run("ask --accept " + path).code, 0);
+  const Outcome holds = run("ask " + path);
+  EXPECT_EQ(holds.code, 0) << holds.err;
+  EXPECT_EQ(holds.err, "");
+  EXPECT_EQ(run("ask --accept " + file("new.json", start)).code, 0);
+  EXPECT_EQ(run("ask --accept -", start).code, 2);
+}
+
 TEST_F(Commands, AskActsOnTheScreen) {
   const Outcome next = run("ask - --increment pages", oneButton);
   EXPECT_EQ(next.code, 0);
@@ -102,6 +139,15 @@ TEST_F(Commands, CheckTellsWhetherTheHostHolds) {
   const Outcome broken = run("check --without CHFriendDetailGoalCell --json");
   EXPECT_EQ(broken.code, 1);
   EXPECT_NE(broken.out.find("Friend detail"), std::string::npos);
+  // Classes that are named by the types of members alone.
+  const std::pair<const char*, const char*> typesOfMembers[] = {{"_CHWorkoutDetailMapView", "Workout detail"},
+                                                                {"ASCompetitionScoreView", "Friend list"}};
+  for (const auto& [type, screen] : typesOfMembers) {
+    const Outcome missing = run(std::string("check --without ") + type);
+    EXPECT_EQ(missing.code, 1) << type;
+    EXPECT_NE(missing.out.find(std::string("found no class ") + type), std::string::npos) << missing.out;
+    EXPECT_NE(missing.out.find(screen), std::string::npos) << missing.out;
+  }
   EXPECT_EQ(run("check -", R"({"format": "axvelto-scene/1", "environment": {"checks": false},
                                "host": {"without": ["LoadingView"]}})")
                 .code,

@@ -9,6 +9,8 @@
 #include <iterator>
 #include <string>
 
+#include "tests/tour/Samples.h"
+
 namespace ax::app {
 
 struct Outcome {
@@ -38,7 +40,7 @@ class ProgramTest : public testing::Test {
     return {WIFEXITED(status) ? WEXITSTATUS(status) : -1, textOf(out), textOf(err)};
   }
 
-  static std::string sample(const std::string& name) { return std::string(AXVELTO_SAMPLES "/") + name; }
+  static std::string sample(const std::string& name) { return (tour::samplesFolder() / name).string(); }
 
  private:
   static std::string textOf(const std::string& path) {

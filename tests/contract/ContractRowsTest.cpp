@@ -1,12 +1,11 @@
 #include <gtest/gtest.h>
-#include <sys/wait.h>
-#include <unistd.h>
 
 #include <set>
 
 #include "host/core/HostApp.h"
 #include "platform/accessibility/CategoryRegistration.h"
 #include "reader/contract/ContractReport.h"
+#include "tests/contract/InChild.h"
 #include "tests/tour/Samples.h"
 
 // The host contract with each of its rows taken away in turn. Every row gets a process of its own, since what
@@ -17,27 +16,6 @@ namespace {
 
 using reader::ContractFinding;
 using reader::ContractReport;
-
-// Runs `body` in a child process; what it returns is empty when all is well.
-std::string inChild(const std::function<std::string()>& body) {
-  int ends[2];
-  if (pipe(ends) != 0) return "no pipe";
-  const pid_t child = fork();
-  if (child == 0) {
-    const std::string fault = body();
-    const ssize_t written = write(ends[1], fault.data(), fault.size());
-    _exit(written == static_cast<ssize_t>(fault.size()) ? 0 : 1);
-  }
-  close(ends[1]);
-  std::string fault;
-  char buffer[512];
-  for (ssize_t got; (got = read(ends[0], buffer, sizeof buffer)) > 0;)
-    fault.append(buffer, static_cast<std::size_t>(got));
-  close(ends[0]);
-  int status = 0;
-  waitpid(child, &status, 0);
-  return WIFEXITED(status) && WEXITSTATUS(status) == 0 ? fault : "the process ended badly: " + fault;
-}
 
 std::vector<ContractCheck> rowsOfHealthyHost() {
   std::string error;

@@ -18,10 +18,10 @@ TEST(Dates, orderFieldsAsTheRegionDoes) {
     const char* weekday;
     const char* dayOfMonth;
     const char* whole;
-  } cases[] = {{"en_US", "Sunday", "March 8", "Sunday, Mar 8, 2026"},
+  } cases[] = {{"en_US", "Sunday", "March 8", "Sunday, March 8, 2026"},
                {"de_DE", "Sonntag", "8. März", "Sonntag, 8. März 2026"},
                {"fr_FR", "dimanche", "8 mars", "dimanche 8 mars 2026"},
-               {"es_ES", "domingo", "8 de marzo", "domingo, 8 de mar de 2026"},
+               {"es_ES", "domingo", "8 de marzo", "domingo, 8 de marzo de 2026"},
                {"ja_JP", "日曜日", "3月8日", "2026年3月8日日曜日"},
                {"ar_EG", "الأحد", "٨ مارس", "الأحد، ٨ مارس ٢٠٢٦"}};
   for (const auto& c : cases) {
@@ -31,6 +31,18 @@ TEST(Dates, orderFieldsAsTheRegionDoes) {
     EXPECT_EQ(dateString(time, "dMMMM"), c.dayOfMonth);
     EXPECT_EQ(dateString(time, "EEEE, MMM d, yyyy"), c.whole);
   }
+}
+
+TEST(Dates, areWrittenToBeSpoken) {
+  const double first = *timeFromIso("2026-03-01T09:05:00Z");
+  const RegionScope scope("fr_FR");
+  EXPECT_EQ(dateString(first, "dMMMM"), "1er mars");
+  EXPECT_EQ(dateString(first, "EEE, MMM d, yyyy"), "dimanche 1er mars 2026");
+  EXPECT_EQ(dateString(first + 10 * 86400, "dMMMM"), "11 mars");
+  EXPECT_EQ(plainSpaces(dateString(first, "h:mma")), "9:05");
+  setCurrentRegion({"en_US", "UTC"});
+  EXPECT_EQ(plainSpaces(dateString(first, "HHmm")), "9:05 AM");
+  EXPECT_EQ(dateString(first, "MMyyyy"), "03/2026");
 }
 
 TEST(Dates, belongToTheZoneAndTheGregorianCalendar) {
@@ -47,10 +59,14 @@ TEST(Dates, haveFourStyles) {
   const RegionScope scope("en_US");
   const double time = *timeFromIso("2026-03-08");
   EXPECT_EQ(dateStyleString(time, DateStyle::shortStyle), "3/8/26");
-  EXPECT_EQ(dateStyleString(time, DateStyle::mediumStyle), "Mar 8, 2026");
+  EXPECT_EQ(dateStyleString(time, DateStyle::mediumStyle), "March 8, 2026");
   EXPECT_EQ(dateStyleString(time, DateStyle::longStyle), "March 8, 2026");
   EXPECT_EQ(dateStyleString(time, DateStyle::fullStyle), "Sunday, March 8, 2026");
   EXPECT_EQ(dateStyleString(time, DateStyle{9}), "");
+  const RegionScope japan("ja_JP");
+  EXPECT_EQ(dateStyleString(time, DateStyle::mediumStyle), "2026年3月8日");
+  const RegionScope france("fr_FR");
+  EXPECT_EQ(dateStyleString(*timeFromIso("2026-03-01"), DateStyle::mediumStyle), "1er mars 2026");
 }
 
 TEST(Dates, withoutATimeAreEmpty) {
@@ -118,16 +134,27 @@ TEST(DateIntervals, followTheLanguage) {
     const char* locale;
     const char* hours;
     const char* days;
-  } cases[] = {{"de_DE", "12 – 3 Uhr AM", "1.–4. Januar 1970"},
-               {"fr_FR", "12 – 3 AM", "1–4 janvier 1970"},
-               {"es_ES", "12–3 a. m.", "1–4 de enero de 1970"},
-               {"ja_JP", "午前0時～3時", "1970年1月1日～4日"},
-               {"ar_EG", "١٢–٣ ص", "١–٤ يناير، ١٩٧٠"}};
+  } cases[] = {{"de_DE", "0–3 Uhr", "1.–4. Januar 1970"},
+               {"fr_FR", "0:00 – 3:00", "1er–4 janvier 1970"},
+               {"es_ES", "0:00–3:00", "1–4 de enero de 1970"},
+               {"ja_JP", "0時～3時", "1970年1月1日～4日"},
+               {"ar_EG", "١٢–٣ صباحًا", "١–٤ يناير، ١٩٧٠"}};
   for (const auto& c : cases) {
     const RegionScope scope(c.locale);
     EXPECT_EQ(plainSpaces(dateIntervalString(0, 10800, "hxa")), c.hours);
     EXPECT_EQ(dateIntervalString(0, 3 * 86400, "MMMMdyyyy"), c.days);
   }
+}
+
+TEST(DateIntervals, nameTheDaysThatTheirHoursLieIn) {
+  const RegionScope scope("en_US");
+  const double evening = *timeFromIso("2026-12-30T22:00:00Z");
+  EXPECT_EQ(plainSpaces(dateIntervalString(evening, evening + 10800, "h:mma")),
+            "December 30 at 10:00 PM – December 31 at 1:00 AM");
+  EXPECT_EQ(plainSpaces(dateIntervalString(evening + 86400, evening + 97200, "ha")),
+            "December 31, 2026 at 10 PM – January 1, 2027 at 1 AM");
+  setCurrentRegion({"de_DE", "UTC"});
+  EXPECT_EQ(plainSpaces(dateIntervalString(evening - 50400, evening - 46800, "h:mma")), "8:00–9:00 Uhr");
 }
 
 }  // namespace ax::formatting

@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+#include <cmath>
+
 #include "platform/formatting/StringTable.h"
 #include "tests/formatting/RegionScope.h"
 
@@ -22,9 +24,9 @@ TEST(MessagePattern, fillsPlacesInAnyOrder) {
 }
 
 TEST(MessagePattern, choosesPluralForms) {
-  const char* const days = "{0, plural, =0 {no days} one {# day} other {# days}} for {1}";
+  const char* const days = "{0, plural, one {# day} other {# days}} for {1}";
   const RegionScope english("en_US");
-  EXPECT_EQ(formatMessage(days, {std::int64_t{0}, string("Ada")}), "no days for Ada");
+  EXPECT_EQ(formatMessage(days, {std::int64_t{0}, string("Ada")}), "0 days for Ada");
   EXPECT_EQ(formatMessage(days, {std::int64_t{1}, string("Ada")}), "1 day for Ada");
   EXPECT_EQ(formatMessage(days, {std::int64_t{1200}, string("Ada")}), "1,200 days for Ada");
   EXPECT_EQ(formatMessage(days, {1.5, string("Ada")}), "1.5 days for Ada");
@@ -35,12 +37,89 @@ TEST(MessagePattern, choosesPluralForms) {
   EXPECT_EQ(all, "zotfmx");
 }
 
+TEST(MessagePattern, agreesWithANumberThatWasWrittenBefore) {
+  const char* const days = "{0, plural, one {# day} other {# days}}";
+  const RegionScope english("en_US");
+  EXPECT_EQ(formatMessage(days, {decimalNumber(1.004, 2)}), "1 day") << "by what is seen";
+  EXPECT_EQ(formatMessage(days, {decimalNumber(0.996, 0)}), "1 day");
+  EXPECT_EQ(formatMessage(days, {decimalNumber(1.04, 2)}), "1.04 days");
+  EXPECT_EQ(formatMessage(days, {percentNumber(0.01)}), "1% day");
+  EXPECT_EQ(formatMessage(days, {string("1")}), "1 days") << "a text is no number, whatever it looks like";
+  EXPECT_EQ(formatMessage(days, {string()}), "");
+  const RegionScope french("fr_FR");
+  EXPECT_EQ(
+      formatMessage("{0, plural, one {# jour} many {# de jours} other {# jours}}", {decimalNumber(1.5, 2)}),
+      "1,5 jour");
+}
+
+TEST(MessagePattern, agreesWithTheNumberThatATextEndsWith) {
+  const RegionScope scope("ar_EG");
+  const char* const days = "{0, plural, zero {z#} one {o} two {t} few {f#} many {m#} other {x#}}";
+  const auto fraction = [](std::int64_t amount, std::int64_t goal) {
+    return filledMessage("{0} / {1}", std::vector<MessageArgument>{amount, goal});
+  };
+  EXPECT_EQ(formatMessage(days, {fraction(1, 5)}), "f١ / ٥");
+  EXPECT_EQ(formatMessage(days, {fraction(5, 1)}), "x٥ / ١") << "the amount is not lost with the goal";
+  EXPECT_EQ(formatMessage(days, {filledMessage("{0}", std::vector<MessageArgument>{std::int64_t{1}})}), "o");
+  EXPECT_EQ(formatMessage(days, {filledMessage("{0}!", std::vector<MessageArgument>{std::int64_t{3}})}),
+            "x٣!");
+}
+
+TEST(MessagePattern, saysASignEvenWhereTheNumberIsAWord) {
+  const char* const days = "{0, plural, zero {#} one {يوم} two {يومان} few {# أيام} many {#} other {#}}";
+  const RegionScope scope("ar_EG");
+  EXPECT_EQ(formatMessage(days, {std::int64_t{-1}}), "ناقص يوم");
+  EXPECT_EQ(formatMessage(days, {decimalNumber(-3, 2)}), "\u061C\u2212٣ أيام");
+}
+
+TEST(MessagePattern, putsNumbersInTheirUnit) {
+  const RegionScope scope("en_US");
+  const char* const pattern = "{0, unit, 1} a day";
+  const CountedNoun mile{"miles", "{0, plural, one {# mile} other {# miles}}"};
+  EXPECT_EQ(formatMessage(pattern, {decimalNumber(1, 2), mile}), "1 mile a day");
+  EXPECT_EQ(formatMessage(pattern, {std::int64_t{1200}, mile}), "1,200 miles a day");
+  EXPECT_EQ(formatMessage(pattern, {string("--"), mile}), "-- miles a day");
+  EXPECT_EQ(formatMessage(pattern, {1.5, string("km")}), "1.5 km a day");
+  EXPECT_EQ(formatMessage(pattern, {1.5, string()}), "1.5 a day");
+  EXPECT_EQ(formatMessage(pattern, {1.5}), "{1} a day");
+  EXPECT_EQ(formatMessage("in {1}", {1.5, mile}), "in miles");
+}
+
+TEST(MessagePattern, saysNoValueWithoutANoun) {
+  const double none = std::nan("");
+  const char* const days = "for {0, plural, one {# day} other {# days}}";
+  const CountedNoun mile{"miles", "{0, plural, one {# mile} other {# miles}}"};
+  const RegionScope scope("en_US");
+  EXPECT_EQ(formatMessage(days, {none}), "no value");
+  EXPECT_EQ(formatMessage(days, {decimalNumber(-HUGE_VAL, 0)}), "no value");
+  EXPECT_EQ(formatMessage("{1}, {0, plural, one {# day} other {# days}}", {none, string("Ada")}),
+            "Ada, no value");
+  EXPECT_EQ(formatMessage("{0, unit, 1}", {decimalNumber(none, 2), mile}), "no value");
+  EXPECT_EQ(formatMessage("{0, unit, 1}", {none, string("km")}), "no value");
+  EXPECT_EQ(formatMessage("{0, number, percent}", {none}), "no value");
+}
+
+TEST(MessagePattern, keepsTheNounBehindATextThatIsReady) {
+  using Arguments = std::vector<MessageArgument>;
+  const CountedNoun mile{"miles", "{0, plural, one {# mile} other {# miles}}"};
+  const RegionScope scope("en_US");
+  const NumberText ready = filledMessage("{0}", Arguments{string("349")});
+  EXPECT_FALSE(ready.isNoValue || ready.operands);
+  EXPECT_EQ(formatMessage("{0, plural, one {# day} other {# days}}", {ready}), "349 days");
+  EXPECT_EQ(formatMessage("{0, unit, 1}", {ready, mile}), "349 miles");
+  EXPECT_EQ(formatMessage("{0, unit, 1}", {ready, string("km")}), "349 km");
+  const NumberText line = filledMessage("{0}: {1}", Arguments{string("Steps"), std::nan("")});
+  EXPECT_EQ(line.text, "Steps: no value");
+  EXPECT_FALSE(line.isNoValue) << "the text is not lost in what stands around it";
+}
+
 TEST(MessagePattern, givesNothingForWhatCannotBeFilled) {
   const RegionScope scope("en_US");
-  for (const char* pattern : {"{0", "{0} }{", "{name}", "{0, plural, one {# day}}", "{0, nonsense}", "{}"}) {
+  for (const char* pattern : {"{0", "{0} }{", "{name}", "{0, plural, one {# day}}", "{0, nonsense}", "{}",
+                              "{0, select, 1 {day} other {days}}", "{0, plural, =1 {a day} other {days}}",
+                              "{0, unit}", "{0, unit, x}", "{0, number, #0}"}) {
     EXPECT_EQ(formatMessage(pattern, {std::int64_t{1}}), "") << pattern;
   }
-  EXPECT_EQ(formatMessage("{0, plural, other {# days}}", {string("many")}), "");
 }
 
 namespace {

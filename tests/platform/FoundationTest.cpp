@@ -1,16 +1,24 @@
 #include <gtest/gtest.h>
 
+#include <atomic>
 #include <cmath>
 #include <limits>
+#include <memory>
+#include <stdexcept>
 
+#include "platform/formatting/Numbers.h"
 #include "platform/foundation/Array.h"
 #include "platform/foundation/AttributedString.h"
+#include "platform/foundation/BackgroundQueue.h"
 #include "platform/foundation/Date.h"
 #include "platform/foundation/Environment.h"
+#include "platform/foundation/Formatters.h"
 #include "platform/foundation/Number.h"
 #include "platform/foundation/Value.h"
+#include "platform/foundation/WeatherUtilities.h"
 #include "platform/runtime/Boxing.h"
 #include "platform/toolkit/AccessibilityMessages.h"
+#include "tests/formatting/RegionScope.h"
 
 namespace ax {
 
@@ -128,8 +136,26 @@ TEST(DateInterval, holdsBothItsEnds) {
   EXPECT_TRUE(hour.isEqual(*make<DateInterval>(date(3600), date(7200))));
 }
 
+TEST(PercentText, isTheFormattersOfEveryFraction) {
+  for (const char* locale : {"en_US", "ar_EG", "fr_FR"}) {
+    const RegionScope scope(locale);
+    for (int round = 0; round < 2; ++round) {
+      for (int i = -20; i < 2500; ++i) {
+        const float fraction = static_cast<float>(i) / 1000;
+        ASSERT_EQ(formatFloatWithPercentage(fraction, 0)->text(), formatting::percentString(fraction)) << i;
+      }
+    }
+    for (const double fraction : {infinity, -infinity, 1e300, -0.0, 0.00499999, 0.00500001}) {
+      const auto rounded = static_cast<float>(fraction);
+      EXPECT_EQ(formatFloatWithPercentage(rounded, 0)->text(), formatting::percentString(rounded));
+    }
+  }
+}
+
 TEST(Array, leavesOutNil) {
   const Ref<String> x = string("x");
+  EXPECT_TRUE(array({nullptr, x, nullptr})->isEqual(*array({x})));
+  EXPECT_EQ(make<MutableArray>(Array::Items{nullptr, x})->description(), "(x)");
   const Ref<Array> kept = axArrayByIgnoringNilElementsWithCount(3, {nullptr, x, nullptr});
   ASSERT_EQ(kept->count(), 1u);
   EXPECT_EQ(kept->firstObject(), x);
@@ -147,6 +173,43 @@ TEST(Array, leavesOutNil) {
   EXPECT_TRUE(odd->isEqual(*array({number(1), number(3)})));
   EXPECT_FALSE(odd->isEqual(*numbers));
 }
+
+// Comes back to the queue as it ends, as captured objects may.
+struct Returning {
+  explicit Returning(std::atomic<int>& ended) : count(&ended) {}
+  ~Returning() {
+    dispatchInBackground([all = count] { ++*all; });
+  }
+  std::atomic<int>* count;
+};
+
+TEST(BackgroundQueue, endsWhatATaskCapturedOutsideItsLock) {
+  std::atomic<int> ended = 0;
+  auto captured = std::make_shared<Returning>(ended);
+  dispatchInBackground([kept = std::move(captured)] {});
+  waitForBackgroundTasks();
+  EXPECT_EQ(ended, 1);
+}
+
+TEST(BackgroundQueue, outlivesTasksThatRaise) {
+  const std::size_t before = failedBackgroundTasks();
+  std::atomic<int> done = 0;
+  testing::internal::CaptureStderr();
+  dispatchInBackground([] { throw std::runtime_error("no store"); });
+  dispatchInBackground([] { throw 7; });
+  for (int i = 0; i < 8; ++i) dispatchInBackground([&done] { ++done; });
+  waitForBackgroundTasks();
+  const std::string told = testing::internal::GetCapturedStderr();
+  EXPECT_EQ(failedBackgroundTasks(), before + 2);
+  EXPECT_EQ(done, 8);
+  EXPECT_NE(told.find("a background task raised: no store\n"), std::string::npos) << told;
+}
+
+// Worked out while compiling, where leaving the range of a type is an error.
+static_assert(conditionCodeFromLegacyWeatherConditionCode(std::numeric_limits<std::int64_t>::min()) == -1);
+static_assert(conditionCodeFromLegacyWeatherConditionCode(std::numeric_limits<std::int64_t>::max()) == -1);
+static_assert(conditionCodeFromLegacyWeatherConditionCode(0) == -1);
+static_assert(conditionCodeFromLegacyWeatherConditionCode(48) == 47);
 
 }  // namespace
 

@@ -2,10 +2,13 @@
 
 #include <cmath>
 
+#include "platform/runtime/ClassBuilder.h"
 #include "platform/toolkit/AccessibilityElement.h"
 #include "platform/toolkit/ElementTree.h"
 #include "platform/toolkit/Label.h"
 #include "platform/toolkit/ScrollView.h"
+#include "platform/toolkit/SpokenText.h"
+#include "platform/toolkit/TreeDepth.h"
 #include "tests/formatting/RegionScope.h"
 
 namespace ax {
@@ -150,6 +153,47 @@ TEST(ElementTree, findsRelatives) {
       _accessibilityFindUnsortedDescendantsPassingTest(window, isElement)->isEqual(*array({element})));
   EXPECT_EQ(_accessibilityFindSubviewDescendantsPassingTest(window, any)->count(), 2u);
   EXPECT_TRUE(_accessibilityFindSubviewDescendantsPassingTest(nullptr, any)->isEmpty());
+}
+
+// Lists a new one of itself, and lies in a new one, whenever it is asked.
+class Endless : public View {
+ public:
+  static Class& staticClass() {
+    static Class& result = ClassBuilder<Endless>("GeometryTest.Endless", View::staticClass())
+                               .method<&Endless::elements>("accessibilityElements")
+                               .method<&Endless::container>("accessibilityContainer")
+                               .build();
+    return result;
+  }
+  Ref<Array> elements() { return array({make<Endless>()}); }
+  Ref<Object> container() { return kept_ = make<Endless>(); }
+
+ private:
+  Ref<Object> kept_;
+};
+
+TEST(ElementTree, endsWhereTheHostDoesNot) {
+  const auto all = [](Object&) { return true; };
+  const auto none = [](Object&) { return false; };
+  const Ref<Endless> endless = make<Endless>();
+  std::size_t before = timesTooDeep();
+  EXPECT_EQ(_accessibilityFindUnsortedDescendantsPassingTest(endless, all)->count(), deepestLevel);
+  EXPECT_EQ(timesTooDeep(), before + 1);
+  EXPECT_EQ(_accessibilityFindAncestor(endless, none, true), nullptr);
+  EXPECT_EQ(timesTooDeep(), before + 2);
+
+  const Ref<View> root = make<View>();
+  Ref<View> deep = root;
+  for (int i = 0; i < 1000; ++i) deep = at<View>({1, 0, 10, 10}, deep);
+  setAccessibilityLabel(deep, string("deep"));
+  before = timesTooDeep();
+  EXPECT_EQ(_accessibilityFindSubviewDescendantsPassingTest(root, all)->count(), deepestLevel);
+  EXPECT_EQ(
+      _accessibilityTextForSubhierarchyIncludingHeadersFocusableItemsExclusions(root, true, true, nullptr)
+          ->text(),
+      "");
+  EXPECT_GE(timesTooDeep(), before + 2);
+  EXPECT_EQ(convertFrameToScreenCoordinates({}, deep).x, 1000) << "a place is worked out whole";
 }
 
 }  // namespace

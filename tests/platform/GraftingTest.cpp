@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include <array>
 #include <atomic>
 #include <thread>
 
@@ -172,6 +173,128 @@ TEST(Grafting, letsOtherThreadsSendMeanwhile) {
   EXPECT_EQ(missed, 0);
   EXPECT_EQ(classWord(base)->text(), "Base+B+2") << "nobody keeps what was looked up before";
   EXPECT_EQ(word(make<Base<6>>())->text(), "base+B+2");
+}
+
+// Three threads send what asks super for another message, while eight categories are put onto the class.
+template <std::size_t N>
+class Stacked : public SafeCategory<Stacked<N>> {
+ public:
+  using SafeCategory<Stacked>::SafeCategory;
+  static void _accessibilityPerformValidations(ValidationManager&) {}
+  Text word() { return this->super(ax::word); }
+  Text inherited() { return this->super(ax::word); }
+  Text both() { return this->super(ax::inherited); }
+};
+
+template <std::size_t... N>
+std::array<Class*, sizeof...(N)> stackedCategories(const std::string& target, std::index_sequence<N...>) {
+  const auto make = [&]<std::size_t I>(std::integral_constant<std::size_t, I>) {
+    using C = Stacked<I>;
+    std::vector<Override> all = {overrides<&C::word>(word), overrides<&C::inherited>(inherited),
+                                 overrides<&C::both>(both)};
+    // So many that grafting takes its time.
+    for (int i = 0; i < 300; ++i) {
+      all.push_back(overrides<&C::word>(word));
+      all.back().method.selector = Selector::intern("graftingTestMore" + std::to_string(i));
+    }
+    return &registerCategory("GraftingTestStacked" + std::to_string(I), target,
+                             &C::_accessibilityPerformValidations, all);
+  };
+  return {make(std::integral_constant<std::size_t, N>())...};
+}
+
+TEST(Grafting, resolvesSuperOnOtherThreadsMeanwhile) {
+  Class& base = Base<7>::staticClass();
+  const auto categories = stackedCategories(base.name(), std::make_index_sequence<8>());
+  std::atomic<bool> ends = false;
+  std::atomic<int> ready = 0;
+  std::atomic<int> wrong = 0;
+  const auto sendOn = [&] {
+    const Ref<Base<7>> own = make<Base<7>>();
+    for (++ready; !ends;) {
+      const Text answer = both(own);
+      if (answer && answer->text() != "base") ++wrong;
+      if (inherited(own)->text() != "base") ++wrong;
+    }
+  };
+  std::array<std::thread, 3> senders;
+  for (std::thread& sender : senders) sender = std::thread(sendOn);
+  while (ready < 3) std::this_thread::yield();
+  for (Class* category : categories) EXPECT_TRUE(graftCategory(*category, base));
+  ends = true;
+  for (std::thread& sender : senders) sender.join();
+  EXPECT_EQ(wrong, 0);
+  EXPECT_EQ(both(make<Base<7>>())->text(), "base");
+}
+
+// A host whose methods have another type than the categories answer.
+const Message<std::int64_t(Text)> countedWord{"graftingTestWord"};
+const Message<std::int64_t(Text)> countedClassWord{"graftingTestClassWord"};
+std::int64_t countLetters(Object&, const Method&, Ref<Object> text) {
+  return static_cast<std::int64_t>(text ? text->description().size() : 0);
+}
+
+void changeTypes(Class& owner) {
+  using registration::record;
+  owner.addMethod(record<std::int64_t, Text>(word.selector(), &countLetters));
+  owner.metaclass().addMethod(record<std::int64_t, Text>(classWord.selector(), &countLetters));
+}
+
+std::vector<std::string> namesLeftBy(const Class& category) {
+  std::vector<std::string> names;
+  for (const LeftToHost& left : graftOf(category)->leftToHost) {
+    EXPECT_EQ(left.hostMethod->signature, &countedWord.signature());
+    names.push_back((left.isClassMethod ? "+" : "-") + std::string(left.override->selector.name()));
+  }
+  return names;
+}
+const std::vector<std::string> bothWords = {"-graftingTestWord", "+graftingTestClassWord"};
+
+template <int N>
+void expectBaseKeepsItsTypes() {
+  const Ref<Base<N>> base = make<Base<N>>();
+  EXPECT_EQ(countedWord(base, string("four")), 4);
+  EXPECT_EQ(countedClassWord(Base<N>::staticClass(), string("five5")), 5);
+  EXPECT_EQ(inherited(base)->text(), "base+B") << "the rest of the category is there";
+  const Ref<Base<N>> derived = make<Derived<N>>();
+  EXPECT_EQ(word(derived)->text().back(), 'D') << "the subclass's own method is of the category's type";
+  EXPECT_EQ(inherited(derived)->text(), "base+B+D");
+  EXPECT_EQ(countedClassWord(Derived<N>::staticClass(), string("six")), 3) << "inherited";
+}
+
+TEST(Grafting, leavesMethodsOfAnotherTypeToTheHost) {
+  changeTypes(Base<8>::staticClass());
+  Class& onBaseFirst = category<onBase>(8, Base<8>::staticClass().name());
+  Class& onDerivedThen = category<onDerived>(8, Derived<8>::staticClass().name());
+  graftCategory(onBaseFirst, Base<8>::staticClass());
+  graftCategory(onDerivedThen, Derived<8>::staticClass());
+  expectBaseKeepsItsTypes<8>();
+  EXPECT_EQ(namesLeftBy(onBaseFirst), bothWords);
+  EXPECT_EQ(namesLeftBy(onDerivedThen), (std::vector<std::string>{"+graftingTestClassWord"}));
+}
+
+TEST(Grafting, leavesThemInTheOtherOrderToo) {
+  changeTypes(Base<9>::staticClass());
+  Class& onDerivedFirst = category<onDerived>(9, Derived<9>::staticClass().name());
+  Class& onBaseThen = category<onBase>(9, Base<9>::staticClass().name());
+  graftCategory(onDerivedFirst, Derived<9>::staticClass());
+  graftCategory(onBaseThen, Base<9>::staticClass());
+  expectBaseKeepsItsTypes<9>();
+  EXPECT_EQ(namesLeftBy(onBaseThen), bothWords);
+  EXPECT_EQ(namesLeftBy(onDerivedFirst), (std::vector<std::string>{"+graftingTestClassWord"}));
+}
+
+// The superclass's method is what the category expects, the subclass changed it.
+TEST(Grafting, leavesToASubclassWhatItChanged) {
+  changeTypes(Derived<10>::staticClass());
+  Class& lower = category<onDerived>(10, Derived<10>::staticClass().name());
+  graftCategory(category<onBase>(10, Base<10>::staticClass().name()), Base<10>::staticClass());
+  graftCategory(lower, Derived<10>::staticClass());
+  const Ref<Base<10>> derived = make<Derived<10>>();
+  EXPECT_EQ(countedWord(derived, string("four")), 4);
+  EXPECT_EQ(word(make<Base<10>>())->text(), "base+B");
+  EXPECT_EQ(both(derived)->text(), "nil&base+B") << "super reaches the host's method, which has another type";
+  EXPECT_EQ(namesLeftBy(lower), bothWords);
 }
 
 class Viewed : public SafeCategory<Viewed> {

@@ -4,11 +4,13 @@
 #include <limits>
 
 #include "platform/foundation/Environment.h"
+#include "platform/foundation/Formatters.h"
 #include "platform/foundation/Number.h"
 #include "platform/health/ActivitySummary.h"
 #include "platform/health/HealthStore.h"
 #include "platform/health/Quantity.h"
 #include "platform/runtime/KeyReading.h"
+#include "tests/formatting/RegionScope.h"
 
 namespace ax {
 
@@ -54,6 +56,41 @@ TEST(Unit, isReadFromItsTextAlone) {
   EXPECT_TRUE(oxygen->isEqual(*Unit::unitFromString("ml/kg/min")));
   EXPECT_TRUE(Unit::meterUnitWithMetricPrefix(MetricPrefix::kilo)->isEqual(*Unit::unitFromString("km")));
   EXPECT_TRUE(Unit::unitFromString("km/m")->isCompatibleWithUnit(*Unit::countUnit()));
+}
+
+TEST(Unit, agreesWithItsNumber) {
+  const struct {
+    const char* locale;
+    float value;
+    const char* unit;
+    const char* text;
+  } cases[] = {{"en_US", 1.004f, "kcal", "1 kilocalorie"},
+               {"en_US", 1.04f, "min", "1.04 minutes"},
+               {"en_US", 12, "count", "12"},
+               {"en_US", HUGE_VALF, "km", "no value"},
+               {"de_DE", 1, "mi", "1 Meile"},
+               {"de_DE", 1, "hr", "1 Stunde"},
+               {"fr_FR", 0, "km", "0 kilomètre"},
+               {"fr_FR", 1.5f, "km", "1,5 kilomètre"},
+               {"es_ES", 1, "km", "1 kilómetro"},
+               {"ja_JP", 144, "count/min", "毎分144拍"},
+               {"ja_JP", 20, "degC", "摂氏20度"},
+               {"ar_EG", 1, "m", "متر واحد"},
+               {"ar_EG", 3, "km", "٣ كيلومترات"},
+               {"ar_EG", 103, "cal", "١٠٣ سعرات حرارية"},
+               {"ar_EG", 86, "m", "٨٦ مترًا"},
+               {"ar_EG", -1, "m", "ناقص متر واحد"},
+               {"ar_EG", 5, "count", "٥"}};
+  for (const auto& c : cases) {
+    const RegionScope language(c.locale);
+    const Ref<Object> unit = make<Unit>(c.unit, 1, Unit::Dimension());
+    EXPECT_EQ(stringWithFormat(string("{0, unit, 1}"), {formatFloat(1, c.value), unit})->text(), c.text);
+  }
+  const Ref<Unit> unnamed = make<Unit>("parsec", 1, Unit::Dimension());
+  EXPECT_EQ(stringWithFormat(string("{0, unit, 1}"), {number(1), unnamed})->text(), "1 parsec");
+  EXPECT_EQ(Unit::countUnit()->description(), "") << "what is counted has no name";
+  EXPECT_EQ(Unit::unitFromString("km")->spokenName()->text(), "kilometers");
+  EXPECT_EQ(quantity(1, Unit::unitFromString("mi"))->description(), "1 mile");
 }
 
 TEST(HealthStore, answersOrFails) {

@@ -22,6 +22,7 @@ class Clock : public Object {
   void wind() { ++windings; }
   Ref<String> zone() const { return string("UTC"); }
   std::int64_t broken() { throw std::runtime_error("no spring"); }
+  Ref<String> title() const { return string("exact"); }
   Ref<String> nameForHour(std::int64_t) { return string("noon"); }
   static Ref<String> sharedName() { return string("Big Clock"); }
 
@@ -61,6 +62,9 @@ Class& Clock::staticClass() {
                              .method<&Clock::wind>("wind")
                              .method<&Clock::zone>("zone")
                              .method<&Clock::broken>("broken")
+                             .method<&Clock::zone>("_broken")
+                             .method<&Clock::title>("title")
+                             .method<&Clock::zone>("_title")
                              .method<&Clock::nameForHour>("nameForHour:")
                              .classMethod<&Clock::sharedName>("sharedName")
                              .build();
@@ -151,6 +155,32 @@ TEST(KeyReading, followsPaths) {
   EXPECT_EQ(clock->twin->safeValueForKey("_owner"_key), clock) << "a weak member reads as its object";
 }
 
+TEST(KeyReading, takesTheMemberWithAnUnderscoreInAPath) {
+  const Ref<Clock> clock = make<Clock>();
+  clock->twin = make<Alarm>();
+  EXPECT_EQ(clock->safeValueForKeyPath("twin.zone")->description(), "CET");
+  EXPECT_EQ(clock->safeValueForKeyPath("twin.maker"), clock->twin->maker);
+  EXPECT_EQ(clock->safeValueForKey("maker"), nullptr) << "a plain read is exact";
+  EXPECT_EQ(clock->safeValueForKeyPath("title")->description(), "exact") << "the exact name goes first";
+  EXPECT_EQ(clock->safeValueForKeyPath("broken"), nullptr) << "what raises is a member all the same";
+  EXPECT_EQ(clock->safeValueForKeyPath("wind"), nullptr);
+}
+
+// A literal's class is asked for before it is there, while it is, and when it is hidden.
+TEST(Classes, areFoundByNameAsTheyComeAndGo) {
+  const auto byLiteral = [] { return safeClassFromString("KeyReadingTest.Late"_key); };
+  EXPECT_EQ(byLiteral(), nullptr);
+  EXPECT_EQ(safeClassFromString("KeyReadingTest.Late"), nullptr);
+  EXPECT_EQ(safeClassFromString(Selector()), nullptr);
+  Class& late = Class::add("KeyReadingTest.Late", &Object::staticClass(), nullptr);
+  EXPECT_EQ(byLiteral(), &late);
+  EXPECT_EQ(safeClassFromString(std::string("KeyReadingTest.") + "Late"), &late);
+  late.hide();
+  EXPECT_EQ(byLiteral(), nullptr);
+  EXPECT_EQ(safeClassFromString("KeyReadingTest.Late"), nullptr);
+  EXPECT_EQ(Class::namedEvenIfHidden("KeyReadingTest.Late"), &late);
+}
+
 TEST(KeyReading, asksClassesForTheirClassMethods) {
   Class& clocks = Clock::staticClass();
   EXPECT_EQ(clocks.safeValueForKey("sharedName"_key)->description(), "Big Clock");
@@ -188,13 +218,13 @@ TEST(Casts, countAndReportMismatches) {
   EXPECT_FALSE(mismatch);
   EXPECT_EQ(castAsClass<Label>(Ref<Object>(), &mismatch), nullptr);
   EXPECT_FALSE(mismatch) << "nil is of every class";
-  EXPECT_EQ(safeClass("KeyReadingTest.Clock", clock, &mismatch), clock);
+  EXPECT_EQ(safeClass("KeyReadingTest.Clock"_key, clock, &mismatch), clock);
   EXPECT_FALSE(mismatch);
   EXPECT_EQ(castMismatches(), before);
   testing::internal::CaptureStderr();
   EXPECT_EQ(castAsClass<Label>(clock, &mismatch), nullptr);
   EXPECT_TRUE(mismatch);
-  EXPECT_EQ(safeClass("KeyReadingTest.NoSuchClass", clock), nullptr);
+  EXPECT_EQ(safeClass("KeyReadingTest.NoSuchClass"_key, clock), nullptr);
   testing::internal::GetCapturedStderr();
   EXPECT_EQ(castMismatches(), before + 2);
 }

@@ -14,6 +14,7 @@ namespace {
 int living = 0;
 const char staticKey = 0;
 const char otherStaticKey = 0;
+const char weakKey = 0;
 
 class Counted : public Object {
  public:
@@ -75,6 +76,38 @@ TEST(Object, isGoneForWeakHandlesBeforeItEnds) {
   object = nullptr;
   EXPECT_TRUE(wasNil);
   EXPECT_EQ(living, 0) << "a handle made while the object ends must not end it twice";
+}
+
+TEST(Object, givesNoWeakHandleToItselfWhileItEnds) {
+  Weak<Counted> kept;
+  Ref<Counted> object = make<Counted>();
+  object->atEnd = [&](Counted& self) { kept = Weak<Counted>(self); };
+  object = nullptr;
+  EXPECT_FALSE(kept);
+  EXPECT_EQ(kept.lock(), nullptr);
+}
+
+TEST(Object, isWholeWhileItsValuesEnd) {
+  std::string seen;
+  const auto look = [&](Counted& owner) {
+    return [&seen, &owner](Counted&) {
+      const Ref<Object> other = getAssociatedObject(owner, &otherStaticKey);
+      seen += (other ? other->description() : "nil") + " " + owner.isa().name() + ";";
+      EXPECT_TRUE(owner.atEnd) << "its own members are there";
+      EXPECT_EQ(getAssociatedObject(owner, &staticKey), nullptr) << "the value that ends is gone from it";
+      EXPECT_FALSE(Weak<Counted>(owner));
+      setAssociatedObject(owner, &weakKey, string("late"));
+    };
+  };
+  Ref<Counted> owner = make<Counted>();
+  owner->atEnd = [](Counted& self) { setAssociatedObject(self, &staticKey, string("later still")); };
+  Ref<Counted> value = make<Counted>();
+  value->atEnd = look(*owner);
+  setAssociatedObject(*owner, &staticKey, std::move(value));
+  setAssociatedObject(*owner, &otherStaticKey, string("other"));
+  owner = nullptr;
+  EXPECT_EQ(seen, "other ObjectTest.Counted;");
+  EXPECT_EQ(living, 0);
 }
 
 TEST(Object, keepsValuesUntilItEnds) {

@@ -12,12 +12,21 @@ namespace {
 
 const Message<Ref<String>()> reply{"validationTestReply"};
 
+class Part : public View {
+ public:
+  static Class& staticClass() {
+    static Class& result = ClassBuilder<Part>("ValidationTestPart", View::staticClass()).build();
+    return result;
+  }
+};
+
 class Screen : public View {
  public:
   static Class& staticClass() {
     static Class& result = ClassBuilder<Screen>("Velto.ValidationTestScreen", View::staticClass())
                                .instanceVariable<&Screen::title>("_titleLabel")
                                .instanceVariable<&Screen::isBusy>("_isBusy")
+                               .instanceVariable<&Screen::part>("_part")
                                .method<&Screen::configure>("configureWithTitle1:value1:")
                                .method<&Screen::run>("runWithBlock:")
                                .method<&Screen::place>("placeAt:")
@@ -33,6 +42,7 @@ class Screen : public View {
   Ref<String> reply() { return string("host"); }
   static Ref<Screen> shared() { return nullptr; }
   Ref<Label> title;
+  Ref<Part> part;
   bool isBusy = false;
 };
 
@@ -163,6 +173,35 @@ TEST(ValidationManager, installsInOrderWhateverIsMissing) {
   EXPECT_EQ(failed[2].category, "ValidationTestThree");
 }
 
+TEST(ValidationManager, missesTheClassOfAMember) {
+  const Ref<ValidationManager> owned = make<ValidationManager>();
+  EXPECT_TRUE(owned->validateClassHasInstanceVariableWithType(screen, "_part", "ValidationTestPart"));
+  Part::staticClass().hide();
+  EXPECT_FALSE(owned->validateClassHasInstanceVariableWithType(screen, "_part", "ValidationTestPart"));
+  EXPECT_EQ(owned->failedChecks().at(0).found, "no class ValidationTestPart");
+}
+
+// Checks are off: what installation left out is told all the same.
+TEST(ValidationManager, tellsWhatIsLeftToTheHost) {
+  static constexpr auto answer = [](Object&, const Method&, double seconds) { return seconds > 1; };
+  Class& changed = Class::add("ValidationTestChanged", &Screen::staticClass(), nullptr);
+  changed.addMethod(registration::record<bool, double>(reply.selector(), answer));
+  registerNumbered<5>("ValidationTestFive", "ValidationTestChanged");
+  const Ref<ValidationManager> owned = make<ValidationManager>();
+  ValidationManager& m = *owned;
+  startWith(m, false, [](ValidationManager& manager) {
+    manager.installSafeCategoryCanInteractWithTargetClass("ValidationTestFive", true);
+  });
+  EXPECT_TRUE(m.installationRequests().at(0).installed);
+  ASSERT_EQ(m.failedChecks().size(), 1u);
+  const ContractCheck left = m.failedChecks()[0];
+  EXPECT_EQ(left.category, "ValidationTestFive");
+  EXPECT_EQ(left.description(),
+            "ValidationTestChanged takes override of instance method validationTestReply");
+  EXPECT_EQ(left.expected, "@");
+  EXPECT_EQ(left.found, "B d, left to the host");
+}
+
 TEST(ValidationManager, installsWithoutChecksWhenTheyAreOff) {
   registerNumbered<4>("ValidationTestFour", subScreen);
   const Ref<ValidationManager> owned = make<ValidationManager>();
@@ -188,6 +227,25 @@ TEST(Reports, keepWhatWasPostedAndBroken) {
   EXPECT_EQ(failedAssertions()[0].line, 52);
   forgetReports();
   EXPECT_TRUE(postedNotifications().empty());
+}
+
+TEST(Reports, keepTheLastOnesAndCountAll) {
+  forgetReports();
+  Ref<String> first = string("first");
+  const Weak<String> weak = first;
+  postNotification(LayoutChangedNotification, std::move(first));
+  for (int i = 0; i < int(keptReports) + 10; ++i) {
+    postNotification(LayoutChangedNotification);
+    assertion(false, "broken", "source", i, "function");
+  }
+  EXPECT_EQ(postedNotifications().size(), keptReports);
+  EXPECT_EQ(postedNotificationCount(), keptReports + 11);
+  EXPECT_FALSE(weak) << "what is dropped is let go";
+  EXPECT_EQ(failedAssertions().size(), keptReports);
+  EXPECT_EQ(failedAssertions().front().line, 10) << "the oldest go first";
+  EXPECT_EQ(failedAssertionCount(), keptReports + 10);
+  forgetReports();
+  EXPECT_EQ(postedNotificationCount(), 0u);
 }
 
 }  // namespace

@@ -64,5 +64,32 @@ TEST(ContractReport, ChecksOfTheWholeBundleNameTheirScreens) {
             std::string::npos);
 }
 
+double hostsOwn(Object&, const Method&, bool) {
+  return 0;
+}
+Ref<Object> categorys(Object&, const Method&) {
+  return nullptr;
+}
+
+TEST(ContractReport, TellsWhatIsLeftToTheHost) {
+  const Selector selector = Selector::intern("testsChangedMethod");
+  Class& host = Class::add("Tests.ChangedHost", &Object::staticClass(), nullptr);
+  host.addMethod(registration::record<double, bool>(selector, &hostsOwn));
+  const Override override{registration::record<Ref<Object>>(selector, &categorys)};
+  registerCategory("MonthWeekViewAccessibility", "Tests.ChangedHost", [](ValidationManager&) {},
+                   {&override, 1});
+  const Ref<ValidationManager> manager = make<ValidationManager>();
+  manager->installSafeCategoryCanInteractWithTargetClass("MonthWeekViewAccessibility", true);
+  EXPECT_EQ(ContractReport(*manager).text(),
+            "\n"
+            "FAILED  Tests.ChangedHost takes override of instance method testsChangedMethod: expected @, "
+            "found d B, "
+            "left to the host\n"
+            "          relied on by MonthWeekViewAccessibility\n"
+            "          screens: Month calendar\n"
+            "0 checks passed, 1 failed; 1 of 1 category installed\n"
+            "Screens that lose speech: Month calendar\n");
+}
+
 }  // namespace
 }  // namespace ax::reader

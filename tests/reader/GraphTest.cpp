@@ -1,12 +1,17 @@
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <cmath>
 #include <limits>
 #include <stdexcept>
 
+#include "platform/foundation/Date.h"
+#include "platform/foundation/Environment.h"
 #include "platform/runtime/ClassBuilder.h"
 #include "platform/toolkit/DataSeriesMessages.h"
+#include "platform/toolkit/TableViewCell.h"
 #include "reader/graph/ChartDescription.h"
+#include "reader/snapshot/Charts.h"
 #include "tests/reader/ScreenPieces.h"
 
 namespace ax::reader::testing {
@@ -105,7 +110,23 @@ TEST(Graph, DescribesASeriesWithItsElements) {
                    "  Horizontal axis: Time, from 0 to 24, 2 values", "    0.5; 12", "    At 0%: 0 o'clock",
                    "    At 25%: 6 o'clock", "    At 50%: 12 o'clock", "    At 75%: 18 o'clock",
                    "  Vertical axis: Lowest: 0, 2 values", "    3; 4.25", "  1 element",
-                   "    Noon, 3 calories, at 15 by 26, 7 wide, 8 high"}));
+                   "    Noon, 3 calories, left 15, top 26, width 7, height 8"}));
+}
+
+TEST(Graph, NamesTheUnitOfAnAxis) {
+  const Ref<View> screen = view<Series>({}, {10, 20, 200, 100});
+  const Snapshot snapshot = takeSnapshot(screen);
+  Node chart = *charts(snapshot).at(0);
+  const std::pair<const char*, const char*> units[] = {
+      {"ml/kg/min", "Unit: milliliters per kilogram per minute, "},
+      {"steps", "Unit: steps, "},
+      {"count", ""}};
+  for (const auto& [label, told] : units) {
+    chart.series->axes[1].unitLabel = AttributedText{label};
+    const std::vector<std::string> lines = describeChart(snapshot, chart);
+    const std::string expected = std::string("  Vertical axis: ") + told + "Lowest: 0, 2 values";
+    EXPECT_NE(std::ranges::find(lines, expected), lines.end()) << label;
+  }
 }
 
 TEST(Graph, AsksConsecutiveSlices) {
@@ -117,7 +138,7 @@ TEST(Graph, AsksConsecutiveSlices) {
   EXPECT_EQ(series.slices[1].start, series.slices[0].end);
   EXPECT_EQ(series.slices[1].end, 900);
   EXPECT_EQ(describeChart(snapshot, *charts(snapshot).at(0)),
-            (Lines{"Chart without a title", "  2 slices, 7 minutes, 30 seconds",
+            (Lines{"Chart without a title", "  2 slices, 7 minutes, 30 seconds per slice",
                    "    Slice 1, from 0 minutes to 7 minutes, 30 seconds, 0 calories",
                    "    Slice 2, from 7 minutes, 30 seconds to 15 minutes, No data in the chart"}));
 
@@ -125,18 +146,60 @@ TEST(Graph, AsksConsecutiveSlices) {
   EXPECT_TRUE(charts(takeSnapshot(chart)).empty());
 }
 
-TEST(Graph, TellsTheLengthOfASliceInHoursOnlyWhenTheyAreWhole) {
+// Slices of a certain time: two of an hour and a half from 23:15, over the night in which clocks go forward.
+class TimedSlices : public Slices {
+ public:
+  static Class& staticClass() {
+    static Class& result = ClassBuilder<TimedSlices>("GraphTestTimedSlices", Slices::staticClass())
+                               .method<&TimedSlices::dateInterval>("dateInterval")
+                               .build();
+    return result;
+  }
+  Ref<DateInterval> dateInterval() { return make<DateInterval>(date(start), date(start + 10800)); }
+
+  static constexpr double start = 1772943300;  // 2026-03-07T23:15 in New York
+};
+
+TEST(Graph, TellsTheTimeOfDayOfASliceWhereTheChartHasOne) {
+  setEnvironment({.timeZone = "America/New_York"});
+  const Ref<TimedSlices> chart = view<TimedSlices>({});
+  chart->secondsPerSlice = 5400;
+  const Snapshot snapshot = takeSnapshot(chart);
+  const auto lines = describeChart(snapshot, *charts(snapshot).at(0));
+  EXPECT_EQ(lines.at(2), "    Slice 1, from 11:15\u202fPM to 12:45\u202fAM, 0 calories");
+  EXPECT_EQ(lines.at(3), "    Slice 2, from 12:45\u202fAM to 3:15\u202fAM, No data in the chart");
+  EXPECT_EQ(chartAsJson(snapshot, *charts(snapshot)[0])["slices"][1]["to"], "2026-03-08T03:15:00-04:00");
+  setEnvironment({});
+}
+
+TEST(Graph, NamesASliceChartByItsLabelItsCellOrItsKind) {
+  const auto heading = [](const Ref<View>& screen) {
+    const Snapshot snapshot = takeSnapshot(screen);
+    return describeChart(snapshot, *charts(snapshot).at(0)).at(0);
+  };
+  const Ref<Slices> chart = view<Slices>({});
+  const Ref<TableViewCell> cell = make<TableViewCell>();
+  cell->setFrame({0, 0, 320, 200});
+  cell->contentView()->addSubview(view({chart}));
+  EXPECT_EQ(heading(cell), "Chart without a title");
+  cell->contentView()->addSubview(label("Stairs"));
+  EXPECT_EQ(heading(cell), "Chart: Stairs");
+  cell->setTextLabel(label("Floors"));
+  EXPECT_EQ(heading(cell), "Chart: Floors");
+  messages::setAccessibilityLabel(chart, string("Flights"));
+  EXPECT_EQ(heading(cell), "Chart: Flights");
+}
+
+TEST(Graph, TellsTheLengthOfASlice) {
   const Ref<Slices> chart = view<Slices>({});
   const auto length = [&chart] {
     const Snapshot snapshot = takeSnapshot(chart);
     return describeChart(snapshot, *charts(snapshot).at(0)).at(1);
   };
   chart->secondsPerSlice = 3 * 3600;
-  chart->hoursPerSlice = 3;
   EXPECT_EQ(length(), "  2 slices, 3 hours per slice");
   chart->secondsPerSlice = 5400;
-  chart->hoursPerSlice = 1;
-  EXPECT_EQ(length(), "  2 slices, 1 hour, 30 minutes");
+  EXPECT_EQ(length(), "  2 slices, 1 hour, 30 minutes per slice");
 }
 
 TEST(Graph, BoundsWhatABrokenHostCounts) {

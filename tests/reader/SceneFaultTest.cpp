@@ -33,9 +33,10 @@ TEST(SceneFault, JsonIsReadStrictly) {
       {"{\"a\": 1,\n\"a\": 2}", "line 2, column 3", "\"a\" twice"},
       {std::string(100000, '['), "line 1, column 101", "at most 100 levels"},
   });
-  EXPECT_EQ(faultOf("[]").text(),
-            "axvelto: test.json: a value of type array, expected an object with the keys format, title, "
-            "environment, host, days, screen, objects, steps");
+  EXPECT_EQ(
+      faultOf("[]").text(),
+      "axvelto: test.json: a value of type array, expected an object with the keys format, title, names, "
+      "environment, host, days, screen, objects, steps, expect");
 }
 
 TEST(SceneFault, TheFrameIsChecked) {
@@ -133,7 +134,8 @@ TEST(SceneFault, StepsAreChecked) {
        "\"later\""},
       {screen + R"([{"ask": "log", "of": "p", "as": "p"}])", "/steps/0/as", "taken"},
       {screen + R"([{"ask": "leap", "of": "p"}])", "/steps/0", "unknown method \"leap\""},
-      {screen + R"([{"read": "_leap", "of": "p"}])", "/steps/0", "unknown member \"_leap\""},
+      {screen + R"([{"same": ["p", "AXVeltoGlue"]}])", "/steps/0/same/1",
+       "nothing is called \"AXVeltoGlue\""},
       {screen + R"([{"ask": "setNote:", "of": "p"}])", "/steps/0", "1 under \"with\""},
       {screen + R"([{"ask": "setNote:", "of": "p", "with": [1]}])", "/steps/0/with", "another class"},
       {screen + R"([{"ask": "valueAt:for:", "of": "p", "with": ["1", ""]}])", "/steps/0/with/0",

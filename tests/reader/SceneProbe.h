@@ -5,8 +5,8 @@
 
 #include "platform/foundation/AttributedString.h"
 #include "platform/toolkit/View.h"
-#include "reader/Fault.h"
 #include "reader/scene/SceneRun.h"
+#include "reader/text/Fault.h"
 
 namespace ax::reader {
 

@@ -2,6 +2,7 @@
 
 #include "platform/foundation/Environment.h"
 #include "platform/runtime/ClassBuilder.h"
+#include "platform/runtime/ScriptedAnswers.h"
 #include "tests/reader/SceneProbe.h"
 
 namespace ax::reader {
@@ -186,6 +187,36 @@ TEST(SceneRun, AHostWithoutMembersStillCarriesTheScene) {
   const Ref<Object> kept = standing.run.objectWithId("g");
   ASSERT_TRUE(kept);
   EXPECT_EQ(cast<Frail>(kept)->detail()->text(), "kept");
+}
+
+TEST(SceneRun, AHostThatKeepsNoDaysIsNotedAndStopsNothing) {
+  Class& cache = *Class::named("ActivitySummaryCache");
+  const Ref<Object> shared = cache.safeValueForKey("sharedInstance");
+  const auto answer = [&](const ScriptedAnswer& given) {
+    ASSERT_TRUE(setScriptedAnswer(cache, Selector::find("sharedInstance"), given));
+  };
+  answer([](auto) -> Ref<Object> { throw std::runtime_error("no room"); });
+  const StandingScene standing(R"("days": {"2026-03-07": {"move": 1}}, "screen": {"class": "View"})");
+  answer([shared](auto) { return shared; });
+  EXPECT_EQ(standing.run.hostFaults(), Replies{"ActivitySummaryCache, keeping a day: no room"});
+  EXPECT_NE(standing.run.screen(), nullptr);
+}
+
+TEST(SceneRun, LetsGoOfObjectsThatHoldThemselves) {
+  Weak<Object> listed, own, answered;
+  {
+    const StandingScene standing(R"("objects": [
+        {"class": "View", "id": "l", "set": {"accessibilityElements": [{"ref": "l"}]}},
+        {"class": "Tests.SceneProbe", "id": "o", "set": {"_anything": {"ref": "o"}}},
+        {"class": "View", "id": "a", "answers": {"accessibilityElements": [{"ref": "a"}]}}])");
+    listed = standing.run.objectWithId("l");
+    own = standing.run.objectWithId("o");
+    answered = standing.run.objectWithId("a");
+    EXPECT_TRUE(listed && own && answered);
+  }
+  EXPECT_EQ(listed.lock(), nullptr);
+  EXPECT_EQ(own.lock(), nullptr);
+  EXPECT_EQ(answered.lock(), nullptr);
 }
 
 }  // namespace

@@ -46,6 +46,16 @@ TEST(SceneStep, ResultsAreTargetsAndSoAreTheirItems) {
   EXPECT_EQ((Replies{replies[7], replies[8], replies[9]}), (Replies{"true", "false", "true"}));
 }
 
+// The module's classes are known once it is open, and what a scene reads need not be there.
+TEST(SceneStep, AsksThePrincipalClassAndReadsWhatThereIsNot) {
+  host::linkHost();
+  const std::string scene = R"("objects": [{"class": "Label", "id": "label"}], "steps": [
+      {"same": ["AXVeltoGlue", "AXVeltoGlue"]}, {"ask": "accessibilityBundles", "of": "AXVeltoGlue"},
+      {"read": "_leap", "of": "AXVeltoGlue"}, {"read": "_leap", "of": "label"}, {"read": "text", "of": "label"}])";
+  EXPECT_EQ(repliesOf(scene, {.modulePath = tour::modulePath()}),
+            (Replies{"true", "null", "null", "null", "null"}));
+}
+
 // A raised result is nil, and a nil target answers nil to everything.
 TEST(SceneStep, NothingComesOfNil) {
   EXPECT_EQ(

@@ -11,6 +11,7 @@
 #include "platform/foundation/Value.h"
 #include "platform/health/Quantity.h"
 #include "reader/scene/Reply.h"
+#include "reader/text/TraitNames.h"
 #include "tests/reader/SceneProbe.h"
 
 namespace ax::reader {

@@ -3,7 +3,8 @@
 #include <random>
 
 #include "platform/foundation/Number.h"
-#include "reader/transcript/SpokenTime.h"
+#include "reader/speech/SpokenLine.h"
+#include "reader/speech/SpokenTime.h"
 #include "reader/transcript/Transcript.h"
 #include "tests/formatting/RegionScope.h"
 #include "tests/reader/ScreenPieces.h"
@@ -26,11 +27,11 @@ struct Language {
 
 constexpr Language languages[] = {
     {"en_US", "5 minutes, 1 second", "1 hour, 1 minute, 2 seconds", "61 minutes, 2 seconds"},
-    {"de_DE", "5 Minuten, 1 Sekunde", "1 Stunde, 1 Minute und 2 Sekunden", "61 Minuten, 2 Sekunden"},
-    {"fr_FR", "5 minutes et 1 seconde", "1 heure, 1 minute et 2 secondes", "61 minutes, 2 secondes"},
-    {"es_ES", "5 minutos y 1 segundo", "1 hora, 1 minuto y 2 segundos", "61 minutos, 2 segundos"},
-    {"ja_JP", "5 分 1 秒", "1 時間 1 分 2 秒", "61分、2秒"},
-    {"ar_EG", "٥ دقائق وثانية", "ساعة، ودقيقة، وثانيتان", "٦١ دقيقة، ثانيتان"},
+    {"de_DE", "5 Minuten und 1 Sekunde", "1 Stunde, 1 Minute und 2 Sekunden", "61 Minuten und 2 Sekunden"},
+    {"fr_FR", "5 minutes et 1 seconde", "1 heure, 1 minute et 2 secondes", "61 minutes et 2 secondes"},
+    {"es_ES", "5 minutos y 1 segundo", "1 hora, 1 minuto y 2 segundos", "61 minutos y 2 segundos"},
+    {"ja_JP", "5分1秒", "1時間1分2秒", "61分2秒"},
+    {"ar_EG", "٥ دقائق وثانية واحدة", "ساعة واحدة ودقيقة واحدة وثانيتان", "٦١ دقيقة وثانيتان"},
 };
 
 TEST(SpokenTimeLanguages, SpeakInWholeWords) {

@@ -5,7 +5,8 @@
 #include "platform/foundation/Environment.h"
 #include "platform/foundation/Number.h"
 #include "platform/runtime/ClassBuilder.h"
-#include "reader/transcript/SpokenTime.h"
+#include "reader/speech/SpokenLine.h"
+#include "reader/speech/SpokenTime.h"
 #include "tests/formatting/RegionScope.h"
 #include "tests/reader/ScreenPieces.h"
 

@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include <cstdio>
 #include <string>
 #include <string_view>
 #include <variant>
@@ -19,7 +20,7 @@ WorkoutFile readWell(std::string_view bytes) {
   WorkoutFileResult result = readWorkoutFile(bytes, "test");
   if (const auto* fault = std::get_if<WorkoutFileFault>(&result)) {
     ADD_FAILURE() << fault->what << " at " << fault->place;
-    return {{WorkoutActivity{}}};
+    return {{WorkoutActivity{}}, std::nullopt};
   }
   return std::get<WorkoutFile>(std::move(result));
 }
@@ -97,7 +98,7 @@ TEST(TcxFile, ReadsLapsPausesAndPrefixedElements) {
   EXPECT_EQ(run.duration, 100);
   EXPECT_EQ(run.activeSeconds, 50.5);
   EXPECT_EQ(run.metres, 150.25);
-  EXPECT_EQ(run.kilocalories, 4);
+  EXPECT_EQ(run.measures.kilocalories, 4);
   ASSERT_EQ(run.points.size(), 4U);
   EXPECT_EQ(run.points[1].time, seven + 10.5);
   EXPECT_EQ(run.points[0].heartRate, 95);
@@ -107,7 +108,7 @@ TEST(TcxFile, ReadsLapsPausesAndPrefixedElements) {
   EXPECT_EQ(run.laps[1].start, seven + 70);
   EXPECT_EQ(run.laps[1].points.first, 2U);
   EXPECT_EQ(run.laps[1].points.count, 2U);
-  EXPECT_EQ(run.laps[1].kilocalories, std::nullopt);
+  EXPECT_EQ(run.laps[1].told.kilocalories, std::nullopt);
   ASSERT_EQ(run.segments.size(), 2U) << "one pause, inside the second lap";
   EXPECT_EQ(run.segments[0].count, 3U);
   EXPECT_EQ(run.segments[1].count, 1U);
@@ -165,6 +166,42 @@ TEST(TcxFile, MeasuresLapsThatCountFromZeroAgain) {
   EXPECT_EQ(run.laps[0].metres, 400);
   EXPECT_EQ(run.laps[1].metres, 150);
   EXPECT_EQ(run.laps[2].metres, 100);
+}
+
+TEST(TcxFile, TakesTheFiguresOfItsLaps) {
+  const auto lap = [](const char* seconds, const char* figures) {
+    return "<Lap StartTime='2026-03-08T07:00:00Z'><TotalTimeSeconds>" + std::string(seconds) +
+           "</TotalTimeSeconds>" + figures + "<Track>" +
+           tcxPoint(0, "<HeartRateBpm><Value>90</Value></HeartRateBpm>") + "</Track></Lap>";
+  };
+  const auto run = readOne(inTcx(
+      "<Activity Sport='Running'>" +
+      lap("300",
+          "<AverageHeartRateBpm><Value>120</Value></AverageHeartRateBpm><MaximumHeartRateBpm><Value>150</"
+          "Value>"
+          "</MaximumHeartRateBpm>") +
+      lap("100",
+          "<AverageHeartRateBpm><Value>160</Value></AverageHeartRateBpm><Intensity>Resting</Intensity>") +
+      "</Activity>"));
+  EXPECT_EQ(run.measures.averageHeartRate, 130);
+  EXPECT_EQ(run.measures.maximumHeartRate, 150);
+  EXPECT_FALSE(run.laps[0].isRest);
+  EXPECT_TRUE(run.laps[1].isRest);
+}
+
+TEST(TcxFile, BeginsTheDistanceOfEachActivityAtZero) {
+  const auto activity = [](int from, int to) {
+    const auto at = [](int metres) {
+      return "<DistanceMeters>" + std::to_string(metres) + "</DistanceMeters>";
+    };
+    return "<Activity><Lap><Track>" + tcxPoint(0, at(from)) + tcxPoint(9, at(to)) +
+           "</Track></Lap></Activity>";
+  };
+  const WorkoutFile file = readWell(inTcx(activity(0, 500) + activity(500, 800) + activity(5, 70)));
+  ASSERT_EQ(file.activities.size(), 3U);
+  EXPECT_EQ(file.activities[1].laps[0].metres, 300);
+  EXPECT_EQ(file.activities[1].points[0].distance, 0);
+  EXPECT_EQ(file.activities[2].laps[0].metres, 70) << "this one counts anew";
 }
 
 TEST(TcxFile, TakesTimesInAnyOrder) {
@@ -235,6 +272,43 @@ TEST(GpxFile, CountsTheWholeSpanWhenEverySegmentIsOnePoint) {
   EXPECT_EQ(walk.activeSeconds, 600);
 }
 
+// A hundredth of a thousandth of a degree is 1.1 m.
+TEST(GpxFile, LeavesOutTheTimeInWhichNobodyMovedAndNothingWasWritten) {
+  const auto at = [](const char* latitude, const char* clock, const std::string& more = "") {
+    return gpxPoint(latitude, "2026-03-08T07:" + std::string(clock) + "Z", more);
+  };
+  const auto ride =
+      readOne(inGpx("<trk><trkseg>" + at("50.00000", "00:00") + at("50.00040", "00:10") +
+                    at("50.00080", "00:20") + at("50.00081", "05:00") +  // stood at a light
+                    at("50.00120", "05:10") + at("50.00400", "06:10") +  // went on through a tunnel
+                    at("50.00440", "06:20") + "</trkseg></trk>"));
+  EXPECT_EQ(ride.activeSeconds, 100);
+  EXPECT_EQ(ride.duration, 380);
+}
+
+TEST(GpxFile, WeighsHeartRatesByTimeAndClimbsByWhatIsMoreThanNoise) {
+  const auto hr = [](const char* rate, const std::string& altitude) {
+    return "<ele>" + altitude + "</ele><extensions><hr>" + rate +
+           "</hr><cad>80</cad><power>200</power></extensions>";
+  };
+  std::string points;
+  for (int second = 0; second < 600; ++second) {
+    char time[32];
+    std::snprintf(time, sizeof time, "2026-03-08T07:%02d:%02d-05:00", second / 60, second % 60);
+    // Ten minutes to and fro by a meter, in the second half up by 60 meters.
+    const double height = 100 + second % 2 + (second < 300 ? 0 : (second - 300) * 0.2);
+    if (second < 300 || second % 30 == 0)
+      points += gpxPoint("50", time, hr(second < 300 ? "100" : "160", std::to_string(height)));
+  }
+  const auto walk = readOne(inGpx("<trk><trkseg>" + points + "</trkseg></trk>"));
+  EXPECT_NEAR(walk.measures.averageHeartRate.value_or(0), 128.4, 1) << "not the 102 of the points";
+  EXPECT_EQ(walk.measures.maximumHeartRate, 160);
+  EXPECT_EQ(walk.measures.averageCadence, 80);
+  EXPECT_EQ(walk.measures.averagePower, 200);
+  EXPECT_NEAR(walk.measures.elevationGain.value_or(0), 54, 2);
+  EXPECT_EQ(walk.secondsEastOfUtc, -5 * 3600);
+}
+
 TEST(WorkoutFileReader, UnderstandsTheEncodingsThatFilesComeIn) {
   const std::string start = "<?xml version='1.0'?>" + inGpx("<trk><name>Caf");
   const std::string cut = start.substr(0, start.size() - std::string("</gpx>").size());
@@ -248,6 +322,14 @@ TEST(WorkoutFileReader, UnderstandsTheEncodingsThatFilesComeIn) {
        {utf8, latin1, utf16, "\xEF\xBB\xBF" + utf8, " \r\n\t" + utf8, "\n\xEF\xBB\xBF" + utf8}) {
     EXPECT_EQ(readOne(bytes).title, "Caf\xC3\xA9") << bytes;
   }
+  const auto declaring = [&](const std::string& encoding, const std::string& end) {
+    return "<?xml version='1.0' encoding='" + encoding + "'?>" + cut.substr(cut.find("?>") + 2) + end + rest;
+  };
+  EXPECT_EQ(readOne(declaring("KOI8-R", "\xC1")).title, "Caf\xD0\xB0");
+  EXPECT_EQ(readOne(declaring("windows-1252", "\x80")).title, "Caf\xE2\x82\xAC");
+  EXPECT_EQ(readOne(declaring("UTF-8", "\xE9 \xC3\xA9")).title, "Caf\xEF\xBF\xBD \xC3\xA9") << "one bad byte";
+  EXPECT_EQ(readOne(cut + "\xE9 \xC3\xA9" + rest).title, "Caf\xEF\xBF\xBD \xC3\xA9");
+  EXPECT_EQ(readOne(declaring("no such", "\xC3\xA9")).title, "Caf\xC3\xA9");
   EXPECT_EQ(readOne(cut + "&#xD800;" + rest).title, "") << "half a character is no text";
 }
 
@@ -257,7 +339,7 @@ struct FaultCase {
 
 TEST(WorkoutFileReader, TellsWhatIsWrongWithAFileAndWhere) {
   const FaultCase cases[] = {
-      {"", "there is no element", "line 1, column 1", "an XML document"},
+      {" ", "there is no element", "line 1, column 1", "an XML document"},
       {"<?xml version='1.0'?>\n <k:kml xmlns:k='u'/>", "the root element is kml", "line 2, column 3",
        "TrainingCenterDatabase or gpx"},
       {"<gpx>\n  <trk>\n", "the file is cut off", "line 2, column 8", "all elements closed"},
@@ -284,6 +366,39 @@ TEST(WorkoutFileReader, TellsWhatIsWrongWithAFileAndWhere) {
     EXPECT_EQ(fault->place, each.place) << each.bytes;
     EXPECT_EQ(fault->expected, each.expected) << each.bytes;
   }
+}
+
+TEST(WorkoutFileReader, BoundsWhatElementsMayTake) {
+  std::string deep;
+  for (int i = 0; i < 101; ++i) deep += "<a>";
+  const WorkoutFileResult nested = readWorkoutFile(deep, "deep");
+  ASSERT_TRUE(std::holds_alternative<WorkoutFileFault>(nested));
+  EXPECT_EQ(std::get<WorkoutFileFault>(nested).what, "elements nested more than 100 deep");
+  EXPECT_EQ(std::get<WorkoutFileFault>(nested).place, "line 1, column 302");
+
+  std::string many = "<gpx>";
+  while (many.size() < 1100000) many += "<a/>";
+  const WorkoutFileResult result = readWorkoutFile(many + "</gpx>", "many");
+  ASSERT_TRUE(std::holds_alternative<WorkoutFileFault>(result));
+  EXPECT_EQ(std::get<WorkoutFileFault>(result).what, "more elements than a workout of this size has");
+
+  const std::string marks = "<!-- <a><a> --><?a <a>?><gpx a='<>'><![CDATA[" + deep + "]]>";
+  EXPECT_EQ(
+      readOne(marks + "<trk><trkseg>" + gpxPoint("50", "2026-03-08T07:00:00Z") + "</trkseg></trk></gpx>")
+          .start,
+      seven);
+}
+
+TEST(WorkoutFileReader, ReadsADamagedFileAsFarAsItGoesWhenAsked) {
+  const std::string cut = "<gpx><trk><trkseg>" + gpxPoint("50", "2026-03-08T07:00:00Z") +
+                          gpxPoint("50.001", "2026-03-08T07:01:00Z");
+  const WorkoutFileResult result = readWorkoutFile(cut, "cut.gpx", {.readsDamaged = true});
+  const auto* file = std::get_if<WorkoutFile>(&result);
+  ASSERT_TRUE(file);
+  EXPECT_EQ(file->activities[0].duration, 60);
+  ASSERT_TRUE(file->damage);
+  EXPECT_EQ(file->damage->file, "cut.gpx");
+  EXPECT_EQ(file->damage->what, "the file is cut off");
 }
 
 TEST(WorkoutFileReader, RefusesAFileCutAnywhere) {

@@ -73,7 +73,7 @@ std::string faultOf(const Json& scene) {
 }
 
 TEST(WorkoutScene, HasEveryRowOfAFullWorkout) {
-  const Json scene = workoutScene(fileOf(tcx(run())), {.locale = "de_DE", .timeZone = "Asia/Tokyo"});
+  const Json scene = sceneOfFile(fileOf(tcx(run())), {.locale = "de_DE", .timeZone = "Asia/Tokyo"});
   EXPECT_EQ(faultOf(scene), "");
   EXPECT_EQ(rowsOf(scene),
             (std::vector<std::string>{
@@ -91,18 +91,18 @@ TEST(WorkoutScene, HasEveryRowOfAFullWorkout) {
 
   const std::vector<Json> splits = all(scene, "CHWorkoutSplit");
   ASSERT_EQ(splits.size(), 2u);
-  EXPECT_EQ(splits[1],
-            Json::parse(R"({"index": 2, "duration": 600.0, "distance": {"quantity": [1.609, "km"]}})"));
+  EXPECT_EQ(splits[1], Json::parse(R"({"index": 2, "duration": 600.0, "activityType": 11, "isRest": false,
+                            "distance": {"quantity": [1.609, "km"]}})"));
 
-  const std::vector<Json> figures = all(scene, "CHWorkoutDetailTwoValueTableViewCell");
-  EXPECT_EQ(figures[1]["value1"]["quantity"][0], 131.0) << "the average";
-  EXPECT_EQ(figures[1]["value2"]["quantity"][0], 162.0) << "the maximum";
+  EXPECT_EQ(figure(scene, "figure.average.heart.rate")["quantity"][0], 131.0);
+  EXPECT_EQ(figure(scene, "figure.maximum.heart.rate")["quantity"][0], 162.0);
+  EXPECT_EQ(figure(scene, "figure.started")["date"], "2026-04-01T08:50:00+09:00");
 }
 
 TEST(WorkoutScene, CountsInTheUnitOfTheRegion) {
   const WorkoutFile file = fileOf(tcx(run()));
   const auto unitWith = [&](const WorkoutSceneOptions& options) {
-    return all(workoutScene(file, options), "Workout")[0]["totalDistance"]["quantity"][1].get<std::string>();
+    return all(sceneOfFile(file, options), "Workout")[0]["totalDistance"]["quantity"][1].get<std::string>();
   };
   for (const char* locale : {"en_US", "en_GB", "es_US", "zh_Hant_US", "en_US@calendar=gregorian"}) {
     EXPECT_EQ(unitWith({.locale = locale}), "mi") << locale;
@@ -114,18 +114,18 @@ TEST(WorkoutScene, CountsInTheUnitOfTheRegion) {
 }
 
 TEST(WorkoutScene, LeavesOutWhatTheFileDoesNotTell) {
-  const Json scene = workoutScene(fileOf(tcx(bareActivity("Other", "2026-03-08T07:00:00Z"))));
+  const Json scene = sceneOfFile(fileOf(tcx(bareActivity("Other", "2026-03-08T07:00:00Z"))));
   EXPECT_EQ(faultOf(scene), "");
   EXPECT_EQ(rowsOf(scene),
             (std::vector<std::string>{"CHWorkoutSummaryTableViewCell", "CHWorkoutDetailTwoValueTableViewCell",
                                       "CHWorkoutDetailHeartRateChartTableViewCell"}));
-  EXPECT_TRUE(all(scene, "CHWorkoutDetailTwoValueTableViewCell")[0]["value2"].is_null());
+  EXPECT_EQ(all(scene, "CHWorkoutDetailTwoValueTableViewCell")[0]["value2"], "") << "an odd one stands alone";
   const Json workout = all(scene, "Workout")[0];
   for (const char* key : {"totalDistance", "totalEnergyBurned", "sourceRevision"}) {
     EXPECT_FALSE(workout.contains(key)) << key;
   }
 
-  const Json ride = workoutScene(
+  const Json ride = sceneOfFile(
       fileOf("<gpx><trk><type>cycling</type><trkseg><trkpt lat='10' "
              "lon='20'><time>2026-03-08T07:00:00Z</time></trkpt>"
              "<trkpt lat='10.1' lon='20'><time>2026-03-08T07:30:00Z</time></trkpt></trkseg></trk></gpx>"));
@@ -134,17 +134,37 @@ TEST(WorkoutScene, LeavesOutWhatTheFileDoesNotTell) {
   EXPECT_EQ(all(ride, "_CHWorkoutDetailMapView").size(), 1u);
 }
 
-TEST(WorkoutScene, ShowsTheFirstActivityWithPointsAndListsTheOthers) {
-  const Json scene = workoutScene(fileOf(tcx(activity("Biking", lap("2026-03-07T07:00:00Z", 60, 500, "")) +
-                                             run() + bareActivity("Other", "2026-03-09T07:00:00Z"))));
-  EXPECT_EQ(faultOf(scene), "");
-  EXPECT_EQ(scene["title"], "Over \"the hill\"");
-  EXPECT_EQ(scene["screen"]["set"]["title"]["localized"], "workout.running");
-  const std::vector<Json> listed = all(scene, "CHWorkoutsListTableViewCell");
-  ASSERT_EQ(listed.size(), 2u);
-  EXPECT_EQ(listed[0]["workout"]["set"]["startDate"]["date"], "2026-03-09T07:00:00+00:00")
-      << "the latest first";
-  EXPECT_EQ(all(scene, "CHWorkoutListTableHeaderView")[0]["numberOfWorkouts"], 2);
+TEST(WorkoutScene, SeveralWorkoutsMakeAListAndEachAScreen) {
+  const WorkoutFile file = fileOf(tcx(activity("Biking", lap("2026-03-07T07:00:00Z", 60, 500, "")) + run() +
+                                      bareActivity("Other", "2026-03-09T07:00:00Z")));
+  const Json list = sceneOfFile(file);
+  EXPECT_EQ(faultOf(list), "");
+  ASSERT_EQ(all(list, "CHWorkoutsListTableViewCell").size(), 3u);
+  EXPECT_EQ(all(list, "CHWorkoutListTableHeaderView")[0]["numberOfWorkouts"], 3);
+  const Json bare = workoutScene(file.activities[0]);
+  EXPECT_EQ(faultOf(bare), "") << "of a workout that only its laps tell of";
+  EXPECT_EQ(bare["screen"]["set"]["title"]["localized"], "workout.cycling");
+}
+
+TEST(WorkoutScene, ThinsOutMoreReadingsThanAChartShows) {
+  WorkoutActivity ride = fileOf(tcx(run())).activities.front();
+  ride.points.clear();
+  for (int i = 0; i < 50000; ++i) {
+    TrackPoint point;
+    point.time = ride.start + i * ride.duration / 50000;
+    point.heartRate = static_cast<float>(i == 777 ? 40 : i == 40000 ? 220 : 100 + i % 7);
+    ride.points.push_back(point);
+  }
+  const std::vector<Json> readings = all(workoutScene(ride), "HeartRateSummaryReading");
+  EXPECT_LE(readings.size(), 16000u);
+  const auto has = [&](double rate) {
+    return std::ranges::count_if(readings,
+                                 [=](const Json& each) { return each["quantity"]["quantity"][0] == rate; });
+  };
+  EXPECT_EQ(has(40), 1);
+  EXPECT_EQ(has(220), 1);
+  EXPECT_TRUE(std::ranges::is_sorted(
+      readings, {}, [](const Json& each) { return each["date"]["date"].get<std::string>(); }));
 }
 
 // Heart rates that go up and down; one each ten seconds of 800.
@@ -163,7 +183,7 @@ std::string steadyRun() {
 }
 
 TEST(WorkoutScene, HasTheFilesHeartRateInEachSliceOfTheChart) {
-  const Scene scene = readScene(workoutScene(fileOf(tcx(steadyRun()))).dump(), "steady run");
+  const Scene scene = readScene(sceneOfFile(fileOf(tcx(steadyRun()))).dump(), "steady run");
   const SceneRun run(scene, {.modulePath = tour::modulePath()});
   const Ref<Object> chart = run.objectWithId("heart-rate");
   ASSERT_EQ(messages::_accessibilityNumberOfSlices(chart), 8u);
@@ -182,8 +202,10 @@ TEST(WorkoutScene, HasTheFilesHeartRateInEachSliceOfTheChart) {
 }
 
 TEST(WorkoutListScene, GroupsByTheMonthOfTheTimeZone) {
-  const std::vector<WorkoutFile> files = {fileOf(tcx(bareActivity("Other", "2026-03-08T07:00:00Z"))),
-                                          fileOf(tcx(run() + bareActivity("Other", "2025-04-08T07:00:00Z")))};
+  const std::vector<WorkoutActivity> files =
+      fileOf(tcx(bareActivity("Other", "2026-03-08T07:00:00Z") + run() +
+                 bareActivity("Other", "2025-04-08T07:00:00Z")))
+          .activities;
   const auto countsIn = [&](const std::string& zone) {
     const Json scene = workoutListScene(files, {.timeZone = zone});
     EXPECT_EQ(faultOf(scene), "");
@@ -203,9 +225,9 @@ TEST(WorkoutListScene, GroupsByTheMonthOfTheTimeZone) {
 
 TEST(WorkoutScene, LeavesTheRegionOfTheProcessAlone) {
   const formatting::Region before = formatting::currentRegion();
-  workoutScene(fileOf(tcx(run())), {.locale = "ja_JP", .timeZone = "Asia/Tokyo"});
+  sceneOfFile(fileOf(tcx(run())), {.locale = "ja_JP", .timeZone = "Asia/Tokyo"});
   EXPECT_EQ(formatting::currentRegion(), before);
-  const Json scene = workoutScene(fileOf(tcx(run())), {.locale = "nowhere", .timeZone = "Mars/Olympus"});
+  const Json scene = sceneOfFile(fileOf(tcx(run())), {.locale = "nowhere", .timeZone = "Mars/Olympus"});
   EXPECT_EQ(scene["environment"]["timeZone"], "UTC");
   EXPECT_EQ(faultOf(scene), "");
 }

@@ -47,8 +47,8 @@ TEST(WorkoutTimes, FollowTheClocksOfTheZone) {
        "2026-06-01T00:10:00-04:00"},
   };
   for (const auto& [from, to, start, end] : workouts) {
-    const Json scene = workoutScene(fileOf(gpx(track(point(from) + point(to)))),
-                                    {.locale = "en_US", .timeZone = "America/New_York"});
+    const Json scene = sceneOfFile(fileOf(gpx(track(point(from) + point(to)))),
+                                   {.locale = "en_US", .timeZone = "America/New_York"});
     const Json workout = all(scene, "Workout").at(0);
     EXPECT_EQ(workout["startDate"]["date"], start);
     EXPECT_EQ(workout["endDate"]["date"], end);
@@ -62,7 +62,7 @@ TEST(WorkoutTimes, FollowTheClocksOfTheZone) {
 TEST(WorkoutTimes, OverMidnightCountWhereTheyBegin) {
   const std::string night = track(point("2026-03-31T23:50:00Z") + point("2026-04-01T00:10:00Z"));
   const std::string morning = track(point("2026-04-01T07:00:00Z") + point("2026-04-01T07:10:00Z"));
-  const Json scene = workoutListScene({fileOf(gpx(night)), fileOf(gpx(morning))}, {.timeZone = "UTC"});
+  const Json scene = workoutListScene(fileOf(gpx(night + morning)).activities, {.timeZone = "UTC"});
   const std::vector<Json> months = all(scene, "CHWorkoutListTableHeaderView");
   ASSERT_EQ(months.size(), 2u);
   EXPECT_EQ(months[0]["month"]["date"], "2026-04-01T07:00:00+00:00");
@@ -75,27 +75,49 @@ TEST(WorkoutTimes, OverMidnightCountWhereTheyBegin) {
 TEST(WorkoutTimes, TracksOfOneFileAreWorkoutsOfTheirOwn) {
   const std::string first = track(point("2026-03-08T07:00:00Z") + point("2026-03-08T07:10:00Z"), "First");
   const std::string second = track(point("2026-03-09T07:00:00Z") + point("2026-03-09T07:30:00Z"), "Second");
-  const Json scene = workoutScene(fileOf(gpx(first + second)));
-  EXPECT_EQ(scene["title"], "First");
-  EXPECT_EQ(all(scene, "CHWorkoutsListTableViewCell").size(), 1u);
-  EXPECT_EQ(all(scene, "Workout").front()["duration"], 600.0);
-  EXPECT_TRUE(all(scene, "CHWorkoutDetailSplitTableViewCell").empty());
-  const std::string text = spoken(scene);
+  const WorkoutFile file = fileOf(gpx(first + second));
+  const Json list = sceneOfFile(file);
+  EXPECT_EQ(all(list, "CHWorkoutsListTableViewCell").size(), 2u);
+  const std::string text = spoken(list);
   EXPECT_NE(text.find("10 minutes"), std::string::npos) << text;
   EXPECT_NE(text.find("30 minutes"), std::string::npos) << text;
+  const Json scene = workoutScene(file.activities[1]);
+  EXPECT_EQ(scene["title"], "Second");
+  EXPECT_EQ(all(scene, "Workout").front()["duration"], 1800.0);
+}
+
+// A run in the evening of New York is none of the next day, nor one beside it that was begun in Berlin.
+TEST(WorkoutTimes, AreToldByTheClockOfTheFile) {
+  const WorkoutFile evening =
+      fileOf(gpx(track(point("2026-03-08T21:44:00-05:00") + point("2026-03-08T22:00:00-05:00", 50.01))));
+  EXPECT_NE(spoken(sceneOfFile(evening)).find("Sunday, March 8, 2026 at 9:44"), std::string::npos)
+      << spoken(sceneOfFile(evening));
+  EXPECT_EQ(sceneOfFile(evening)["environment"]["timeZone"], "GMT-05:00");
+  EXPECT_EQ(sceneOfFile(evening, {.timeZone = "Europe/Berlin"})["environment"]["timeZone"], "Europe/Berlin");
+  const WorkoutFile night =
+      fileOf(gpx(track(point("2026-03-07T23:30:00+01:00") + point("2026-03-07T23:50:00+01:00", 50.01))));
+  const std::string list = spoken(workoutListScene({evening.activities.front(), night.activities.front()}));
+  EXPECT_NE(list.find("Saturday, March 7"), std::string::npos) << list;
+  EXPECT_NE(list.find("Sunday, March 8"), std::string::npos) << list;
 }
 
 TEST(WorkoutTimes, UnknownHeartRatesCountNeitherAsBeatsNorAsNothing) {
   std::mt19937 random(11);
   for (int run = 0; run < 20; ++run) {
     std::string points;
-    double sum = 0, highest = 0;
+    double sum = 0, highest = 0, seconds = 0, last = 0;
+    int lastSecond = -1;
     std::size_t count = 0;
     for (int i = 0; i < 30; ++i) {
       const int rate = 60 + int(random() % 120);
       const bool isKnown = random() % 3 != 0;
       if (isKnown) {
-        sum += rate;
+        if (lastSecond >= 0) {
+          sum += (i - lastSecond) * (rate + last) / 2;
+          seconds += i - lastSecond;
+        }
+        last = rate;
+        lastSecond = i;
         highest = std::max<double>(highest, rate);
         ++count;
       }
@@ -103,15 +125,14 @@ TEST(WorkoutTimes, UnknownHeartRatesCountNeitherAsBeatsNorAsNothing) {
                 (isKnown ? "<HeartRateBpm><Value>" + std::to_string(rate) + "</Value></HeartRateBpm>" : "") +
                 "</Trackpoint>";
     }
-    const Json scene = workoutScene(
+    const Json scene = sceneOfFile(
         fileOf("<TrainingCenterDatabase><Activities><Activity Sport='Running'><Lap "
                "StartTime='2026-03-08T07:00:10Z'><TotalTimeSeconds>30</TotalTimeSeconds><DistanceMeters>100"
                "</DistanceMeters><Track>" +
                points + "</Track></Lap></Activity></Activities></TrainingCenterDatabase>"));
     EXPECT_EQ(all(scene, "HeartRateSummaryReading").size(), count);
-    const Json figures = all(scene, "CHWorkoutDetailTwoValueTableViewCell").at(1);
-    EXPECT_NEAR(figures["value1"]["quantity"][0].get<double>(), sum / double(count), 1e-4);
-    EXPECT_EQ(figures["value2"]["quantity"][0], highest);
+    EXPECT_NEAR(figure(scene, "figure.average.heart.rate")["quantity"][0].get<double>(), sum / seconds, 1e-4);
+    EXPECT_EQ(figure(scene, "figure.maximum.heart.rate")["quantity"][0], highest);
     EXPECT_TRUE(all(scene, "_CHWorkoutDetailMapView").empty()) << "no place, no map";
   }
 }
@@ -123,7 +144,7 @@ TEST(WorkoutTimes, DistancesAreSpokenInTheUnitsOfTheRegion) {
   const std::pair<const char*, const char*> regions[] = {
       {"en_US", "6.91 miles"}, {"en_CA", "11.12 kilometers"}, {"de_DE", "11,12 Kilometer"}};
   for (const auto& [locale, words] : regions) {
-    const std::string text = spoken(workoutScene(file, {.locale = locale}));
+    const std::string text = spoken(sceneOfFile(file, {.locale = locale}));
     EXPECT_NE(text.find(words), std::string::npos) << text;
   }
 }
