@@ -76,7 +76,7 @@ TEST_F(WorkoutFiguresTest, FollowTheLanguage) {
   } languages[] = {{"de_DE", "1.234,5 km", "1.234,5 Kilometer"},
                    {"fr_FR", "1 234,5 km", "1 234,5 kilomètres"},
                    {"es_ES", "1234,5 km", "1234,5 kilómetros"},
-                   {"ja_JP", "1,234.5 km", "1,234.5 キロメートル"}};
+                   {"ja_JP", "1,234.5km", "1,234.5キロメートル"}};
   for (const auto& [locale, text, words] : languages) {
     const EnvironmentScope language(Environment{.locale = locale});
     EXPECT_EQ(shown(amount(1234.5, "km")), text);
@@ -135,8 +135,12 @@ TEST_F(WorkoutFiguresTest, AddUpInTheUnitOfTheFirst) {
   EXPECT_NEAR(totals.distance.total->value(), 13, 1e-9);
   EXPECT_EQ(totals.distance.count, 3u);
   EXPECT_EQ(totals.energy.count, 1u);
-  EXPECT_EQ(totals.pacedSeconds, 3000) << "neither the ride nor the one without a distance";
-  EXPECT_NEAR(totals.pacedDistance.total->value(), 3, 1e-9);
+  EXPECT_EQ(totals.pacedDistance.total, nullptr) << "a run and a ride have no pace in common";
+  const WorkoutTotals runs(array({SomeWorkout{.seconds = 600}.made(),
+                                  SomeWorkout{.seconds = 1000, .distance = 2, .unit = "mi"}.made(),
+                                  SomeWorkout{.seconds = 2000, .distance = 1.609344}.made()}));
+  EXPECT_EQ(runs.pacedSeconds, 3000) << "without the one that has no distance";
+  EXPECT_NEAR(runs.pacedDistance.total->value(), 3, 1e-9);
   const WorkoutTotals none(nullptr);
   EXPECT_EQ(none.count, 0u);
   EXPECT_EQ(none.distance.total, nullptr);

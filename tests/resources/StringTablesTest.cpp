@@ -8,13 +8,20 @@
 #include <unicode/uchar.h>
 #include <unicode/ures.h>
 
+#include <cmath>
 #include <filesystem>
 #include <map>
 #include <memory>
 #include <ostream>
 #include <set>
 #include <string>
+#include <utility>
 #include <vector>
+
+#include "platform/formatting/MessagePattern.h"
+#include "tests/formatting/RegionScope.h"
+
+namespace ax {
 
 namespace {
 
@@ -35,13 +42,15 @@ const std::vector<TablePlace> places = {{"Accessibility", "lib/AXVelto/resources
                                         {"Reader", "share/axvelto/Reader"}};
 
 const std::vector<std::string> languages = {"root", "de", "fr", "es", "ja", "ar"};  // the root is English
+const std::map<std::string, const char*> locales = {{"root", "en_US"}, {"de", "de_DE"}, {"fr", "fr_FR"},
+                                                    {"es", "es_ES"},   {"ja", "ja_JP"}, {"ar", "ar_EG"}};
 
 // Texts that are rightly the same in English and in another language.
 const std::map<std::string, std::set<std::string>> sameAsEnglish = {
-    {"de", {"Frost", "Name", "Tornado", "Trends", "Yoga"}},
+    {"de", {"Frost", "Name", "Tornado", "Trends", "Yoga", "minus {0}"}},
     {"fr",
      {"Blizzard", "Date", "Distance", "Message", "Messages", "Total", "Yoga", "calories", "image",
-      "kilocalorie", "kilocalories", "kilojoules", "mile", "miles", "minutes", "yards"}},
+      "kilocalorie", "kilocalories", "kilojoules", "mile", "miles", "minutes", "watt", "watts", "yards"}},
     {"es", {"Tornado", "Total", "Yoga"}}};
 
 std::string utf8(const UnicodeString& text) {
@@ -93,6 +102,8 @@ std::map<int, bool> argumentsOf(const UnicodeString& text) {
     EXPECT_EQ(pattern->getPartType(i + 1), UMSGPAT_PART_TYPE_ARG_NUMBER) << utf8(text);
     bool& isCounted = arguments[pattern->getPart(i + 1).getValue()];
     isCounted |= pattern->getPart(i).getArgType() == UMSGPAT_ARG_TYPE_PLURAL;
+    if (utf8(pattern->getSubstring(pattern->getPart(i + 2))) != "unit") continue;
+    arguments.emplace(std::stoi(utf8(pattern->getSubstring(pattern->getPart(i + 3)))), false);
   }
   return arguments;
 }
@@ -138,7 +149,7 @@ bool isAbbreviation(const Table& table, const std::string& key) {
 }
 
 bool hasWordOfThreeLetters(UnicodeString text) {
-  for (const char* argument : {"{0}", "{1}"}) text.findAndReplace(argument, " ");
+  for (const char* argument : {"{0, unit, 1}", "{0}", "{1}"}) text.findAndReplace(argument, " ");
   int run = 0;
   for (int32_t i = 0; i < text.length(); ++i) {
     run = u_isalpha(text[i]) ? run + 1 : 0;
@@ -172,19 +183,40 @@ void expectSpeakable(const UnicodeString& text) {
   }
 }
 
-std::string format(const Table& table, const std::string& language, const std::string& key,
-                   const std::vector<icu::Formattable>& arguments) {
+// What ICU's own messages, which follow CLDR's rules, make of a pattern whose arguments are all `number`.
+std::string filledByIcu(const UnicodeString& pattern, const char* locale, double number) {
   UErrorCode status = U_ZERO_ERROR;
-  const icu::MessageFormat message(table.at(key), localeOf(language), status);
+  const icu::MessageFormat message(pattern, icu::Locale(locale), status);
+  const std::vector<icu::Formattable> arguments(4, icu::Formattable(number));
   UnicodeString result;
   icu::FieldPosition ignored(icu::FieldPosition::DONT_CARE);
   message.format(arguments.data(), static_cast<int32_t>(arguments.size()), result, ignored, status);
-  EXPECT_TRUE(U_SUCCESS(status)) << key << ": " << u_errorName(status);
+  EXPECT_TRUE(U_SUCCESS(status)) << u_errorName(status);
   return utf8(result);
 }
 
-icu::Formattable text(const char* value) {
-  return icu::Formattable(UnicodeString::fromUTF8(value));
+// ICU drops the sign of a number that Arabic says without a figure, and writes a hyphen for the others.
+std::string asIcuHasIt(std::string text) {
+  for (const auto& [ours, theirs] : {std::pair<std::string, const char*>("ناقص ", ""), {"−", "-"}}) {
+    for (std::size_t at = text.find(ours); at != std::string::npos; at = text.find(ours)) {
+      text.replace(at, ours.size(), theirs);
+    }
+  }
+  return text;
+}
+
+std::string filledWith(const UnicodeString& pattern, const formatting::MessageArgument& argument) {
+  return formatting::formatMessage(utf8(pattern), std::vector<formatting::MessageArgument>(4, argument));
+}
+
+// Whether the pattern has an argument of one of these types.
+bool hasArgument(const UnicodeString& text, const std::set<UMessagePatternArgType>& types) {
+  const auto pattern = parse(text);
+  for (int32_t i = 0; i < pattern->countParts(); ++i) {
+    if (pattern->getPartType(i) != UMSGPAT_PART_TYPE_ARG_START) continue;
+    if (types.contains(pattern->getPart(i).getArgType())) return true;
+  }
+  return false;
 }
 
 class StringTables : public testing::TestWithParam<TablePlace> {
@@ -211,7 +243,12 @@ TEST_P(StringTables, HoldTheSameKeysAndArgumentsInEveryLanguage) {
   everyText([this](const std::string&, const std::string& key, const UnicodeString& value) {
     const auto original = english.find(key);
     if (original == english.end()) return;
-    EXPECT_EQ(argumentsOf(value), argumentsOf(original->second));
+    std::map<int, bool> arguments = argumentsOf(value);
+    for (const auto& [number, isCounted] : argumentsOf(original->second)) {
+      const auto found = arguments.extract(number);
+      EXPECT_TRUE(found && found.mapped() >= isCounted) << "argument " << number;
+    }
+    EXPECT_TRUE(arguments.empty()) << "argument " << arguments.begin()->first;
   });
 }
 
@@ -253,20 +290,78 @@ TEST_P(StringTables, AreFitToBeSpoken) {
   });
 }
 
+TEST_P(StringTables, AgreeWithEveryNumberAsTheirLanguageHasIt) {
+  everyText([](const std::string& language, const std::string&, const UnicodeString& value) {
+    EXPECT_FALSE(hasArgument(value, {UMSGPAT_ARG_TYPE_SELECT, UMSGPAT_ARG_TYPE_CHOICE}))
+        << "the form depends on a text";
+    if (!hasArgument(value, {UMSGPAT_ARG_TYPE_PLURAL})) return;
+    const char* const locale = locales.at(language);
+    const RegionScope scope(locale);
+    for (const double number :
+         {0.0, 1.0, 2.0, 3.0, 5.0, 10.0, 11.0, 21.0, 100.0, 103.0, 1.5, 0.5, -1.0, 1e6}) {
+      const std::string written = filledWith(value, formatting::decimalNumber(number, 2));
+      EXPECT_EQ(filledWith(value, number), written) << number;
+      const auto alone = formatting::filledMessage(
+          "{0}", std::vector<formatting::MessageArgument>{formatting::decimalNumber(number, 2)});
+      EXPECT_EQ(filledWith(value, alone), written) << number;
+      EXPECT_EQ(asIcuHasIt(written), filledByIcu(value, locale, number)) << number;
+    }
+  });
+}
+
+// A table's patterns with numbers alone, and every pattern around one of them, by pattern and by unit.
+TEST_P(StringTables, SayNoValueAloneHoweverPatternsNest) {
+  using Arguments = std::vector<formatting::MessageArgument>;
+  everyText([](const std::string& language, const std::string&, const UnicodeString& value) {
+    const std::map<int, bool> arguments = argumentsOf(value);
+    if (arguments.empty()) return;
+    const RegionScope scope(locales.at(language));
+    const std::string none = formatting::noValueText();
+    const std::string pattern = utf8(value);
+    const formatting::CountedNoun unit{"x", arguments.size() == 1 ? pattern : "{0}"};
+    for (const double number : {std::nan(""), HUGE_VAL, -HUGE_VAL}) {
+      EXPECT_EQ(filledWith(value, number), none);
+      EXPECT_EQ(formatting::formatMessage("{0, unit, 1}", {number, unit}), none);
+      for (const Arguments& pair : {Arguments{number, 500.0}, Arguments{349.0, number}}) {
+        const auto fraction = formatting::filledMessage("{0} / {1}", pair);
+        EXPECT_EQ(filledWith(value, fraction), none);
+        const auto inside = formatting::filledMessage(pattern, Arguments(4, fraction));
+        EXPECT_EQ(formatting::formatMessage("{0, plural, other {# x}}", {inside}), none);
+      }
+    }
+  });
+}
+
+// English shows best where a number meets a noun: every other place there takes a name or a percentage.
+TEST_P(StringTables, LeaveNoNounBesideANumberThatItDoesNotAgreeWith) {
+  static const std::set<std::string> withoutNumber = {"achievement.badge.format", "weather.humidity"};
+  for (const auto& [key, value] : english) {
+    for (int32_t end = value.indexOf(u'}'); end >= 0; end = value.indexOf(u'}', end + 1)) {
+      const bool isPlain = end >= 2 && value[end - 2] == u'{' && value[end + 1] == u' ';
+      if (!isPlain || withoutNumber.contains(key)) continue;
+      const bool isBeforePlace = value[end + 2] == u'{';
+      const std::vector<std::string> words = wordsOf(value.tempSubString(end + 2));
+      EXPECT_TRUE(isBeforePlace || std::set<std::string>({"of", "to", "per"}).contains(words.front()))
+          << key << ": " << utf8(value);
+    }
+  }
+}
+
 INSTANTIATE_TEST_SUITE_P(All, StringTables, testing::ValuesIn(places),
                          [](const auto& place) { return place.param.name; });
 
 TEST(AccessibilityTable, TakesTheArgumentsThatTheCategoriesGive) {
   using Arguments = std::map<int, bool>;
   const Arguments none, oneText = {{0, false}}, twoTexts = {{0, false}, {1, false}}, count = {{0, true}};
-  const std::map<std::string, Arguments> expected = {{"calories.format", oneText},
-                                                     {"calories.format.zero", oneText},
-                                                     {"heart.rate.graph.single", oneText},
-                                                     {"achievement.badge.format", oneText},
-                                                     {"minutes.format.out.of", twoTexts},
+  const Arguments amountOfGoal = {{0, false}, {1, true}};
+  const std::map<std::string, Arguments> expected = {{"achievement.badge.format", oneText},
                                                      {"quantity.fraction.format.without.units", twoTexts},
-                                                     {"heart.rate.graph.range", twoTexts},
                                                      {"trends.value.with.unit", twoTexts},
+                                                     {"minutes.format.out.of", amountOfGoal},
+                                                     {"heart.rate.graph.range", amountOfGoal},
+                                                     {"heart.rate.graph.single", count},
+                                                     {"calories.format", count},
+                                                     {"calories.format.zero", count},
                                                      {"minutes.format", count},
                                                      {"badge.format", count}};
   for (const auto& [key, value] : load(places[0], "root")) {
@@ -275,15 +370,26 @@ TEST(AccessibilityTable, TakesTheArgumentsThatTheCategoriesGive) {
   }
 }
 
-TEST(AccessibilityTable, SpeaksAmountsInTheirNumber) {
-  const Table en = load(places[0], "root"), fr = load(places[0], "fr"), ar = load(places[0], "ar");
-  EXPECT_EQ(format(en, "root", "calories.format", {text("1")}), "1 calorie");
-  EXPECT_EQ(format(en, "root", "calories.format", {text("1 of 500")}), "1 of 500 calories");
-  EXPECT_EQ(format(fr, "fr", "calories.format.zero", {text("0")}), "0 calorie");
-  EXPECT_EQ(format(fr, "fr", "calories.format.zero", {text("0 sur 500")}), "0 sur 500 calories");
-  EXPECT_EQ(format(fr, "fr", "minutes.format", {2000000}), "2\u202f000\u202f000 de minutes");
-  EXPECT_EQ(format(ar, "ar", "minutes.format", {2}), "دقيقتان");
-  EXPECT_EQ(format(ar, "ar", "calories.format", {text("١")}), "سعرة حرارية واحدة");
+TEST(AccessibilityTable, SpeaksAnAmountOfAGoal) {
+  const struct {
+    const char* language;
+    double goal;
+    const char* text;
+  } cases[] = {{"root", 1, "349 of 1 calorie"},
+               {"root", 500, "349 of 500 calories"},
+               {"fr", 0, "349 sur 0 calorie"},
+               {"de", 500, "349 von 500 Kalorien"},
+               {"ja", 500, "500カロリーのうち349カロリー"},
+               {"ar", 103, "٣٤٩ من ١٠٣ سعرات حرارية"},
+               {"ar", 2, "٣٤٩ من ٢ سعرة حرارية"}};
+  for (const auto& c : cases) {
+    const RegionScope scope(locales.at(c.language));
+    const Table table = load(places[0], c.language);
+    const auto fraction = formatting::filledMessage(
+        utf8(table.at("quantity.fraction.format.without.units")),
+        std::vector<formatting::MessageArgument>{formatting::decimalNumber(349, 0), c.goal});
+    EXPECT_EQ(filledWith(table.at("calories.format"), fraction), c.text);
+  }
 }
 
 TEST(PlatformTable, TellsFortyEightWeatherConditionsApart) {
@@ -299,3 +405,5 @@ TEST(PlatformTable, TellsFortyEightWeatherConditionsApart) {
 }
 
 }  // namespace
+
+}  // namespace ax

@@ -6,9 +6,13 @@
 
 namespace ax::tour {
 
+std::filesystem::path samplesFolder() {
+  return AXVELTO_SAMPLES;
+}
+
 std::vector<std::filesystem::path> sampleScenes() {
   std::vector<std::filesystem::path> scenes;
-  for (const auto& entry : std::filesystem::directory_iterator(AXVELTO_SAMPLES)) {
+  for (const auto& entry : std::filesystem::directory_iterator(samplesFolder())) {
     if (entry.path().extension() == ".json") scenes.push_back(entry.path());
   }
   std::sort(scenes.begin(), scenes.end());

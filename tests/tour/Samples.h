@@ -10,6 +10,7 @@
 
 namespace ax::tour {
 
+std::filesystem::path samplesFolder();
 // The sample scenes of the house, sorted by name.
 std::vector<std::filesystem::path> sampleScenes();
 std::string fileText(const std::filesystem::path& file);
