@@ -70,6 +70,8 @@ std::vector<Class*> Class::all() {
 }
 
 const Method& Class::lookUpSlowly(Selector selector) const {
+  static constexpr Method ofNoName = {};
+  if (!selector) return ofNoName;
   const Method* known = methodCache_.find(selector);
   return known != nullptr ? *known : findMethod(selector);
 }
@@ -104,6 +106,8 @@ const InstanceVariable* Class::instanceVariableEvenIfHidden(Selector selector) c
 }
 
 const KeyReader& Class::readerForKeySlowly(Key key) const {
+  static constexpr KeyReader ofNoName = {};
+  if (!key) return ofNoName;
   const KeyReader* known = keyCache_.find(key);
   return known != nullptr ? *known : findReader(key);
 }

@@ -69,14 +69,14 @@ class Class final : public Object {
   Ref<Object> instantiate() const { return factory_ == nullptr ? nullptr : factory_(); }
 
   // The entry that answers a message; one without a function when the class lacks it. Never fails.
-  const Method& lookUp(Selector selector) const { return lookUp(selector, placeOf(selector)); }
-  // The same for a sender that keeps the selector's place.
-  const Method& lookUp(Selector selector, std::size_t place) const {
-    const Method& method = firstMethods_.at(place);
+  const Method& lookUp(Selector selector) const {
+    const Method& method = firstAnswer(placeOf(selector));
     if (method.selector == selector) [[likely]]
       return method;
     return lookUpSlowly(selector);
   }
+  // For a sender that keeps the selector's place: its entry, or that of another selector, which is never nil.
+  const Method& firstAnswer(std::size_t place) const { return firstMethods_.at(place); }
   static std::size_t placeOf(Selector selector) { return FirstMethods::placeOf(selector); }
   // Whether it is known that this entry answers its message: false also before the first look-up.
   bool isKnownToAnswerWith(const Method& method) const {

@@ -37,7 +37,9 @@ class FirstTable {
     (std::make_index_sequence<Size>());
   }
 
-  static constexpr Record none = {};
+  // Of a name that nobody asks for, the nil selector included: messages that are not resolved have that one.
+  static constexpr SelectorRecord nobody = {};
+  static constexpr Record none = {.selector = Selector(&nobody)};
   std::array<std::atomic<const Record*>, Size> places_ = empty();
 };
 

@@ -19,6 +19,57 @@ class Receiver {
   Object* object_ = nullptr;
 };
 
+// What a message is without its C++ type: constant data, to which the runtime adds its own at the first use,
+// on whichever thread. Until then its selector is nil, which no entry in a class's table has.
+class MessageRecord {
+ public:
+  Selector selector() const {
+    const SelectorRecord* record = record_.load(std::memory_order_acquire);
+    if (record == nullptr) [[unlikely]]
+      return resolve();
+    return Selector(record);
+  }
+  const Signature& signature() const {
+    (void)selector();
+    return *signature_.load(std::memory_order_relaxed);
+  }
+
+  MessageRecord(const MessageRecord&) = delete;
+  MessageRecord& operator=(const MessageRecord&) = delete;
+
+ protected:
+  constexpr MessageRecord(std::string_view name, const Signature& (*makeSignature)(),
+                          const void* (*findResult)())
+      : name_(name), makeSignature_(makeSignature), findResult_(findResult) {}
+
+  const Method& answerOf(const Object& object) const {
+    const Selector selector(record_.load(std::memory_order_acquire));
+    const Method& first = object.isa().firstAnswer(place_.load(std::memory_order_relaxed));
+    return first.selector == selector ? first : answerSlowly(object);
+  }
+  bool hasTypeOf(const Method& method) const {
+    if (method.signature == signature_.load(std::memory_order_relaxed)) [[likely]]
+      return true;
+    return method.signature == &signature();
+  }
+  const void* result() const { return result_.load(std::memory_order_relaxed); }
+
+ private:
+  static constexpr Signature unresolved = {};
+
+  Selector resolve() const;
+  const Method& answerSlowly(const Object& object) const;
+
+  std::string_view name_;
+  const Signature& (*makeSignature_)();
+  const void* (*findResult_)();
+  // Published with the record, the last of them.
+  mutable std::atomic<const SelectorRecord*> record_ = nullptr;
+  mutable std::atomic<const Signature*> signature_ = &unresolved;
+  mutable std::atomic<const void*> result_ = nullptr;  // methods that return the same C++ type are believed
+  mutable std::atomic<std::size_t> place_ = 0;         // the selector's, in the classes' tables
+};
+
 template <class Type>
 class Message;
 
@@ -28,46 +79,34 @@ class Message;
 //   Ref<String> label = accessibilityLabel(view);
 //
 // Sent to nil, to an object whose class lacks the message, or to one that registered it with another type,
-// it yields nil, NO or 0. What a method raises passes through.
+// it yields nil, NO or 0. What a method raises passes through. The name must outlive the message.
 template <class R, class... A>
-class Message<R(A...)> {
+class Message<R(A...)> : public MessageRecord {
  public:
-  explicit Message(std::string_view name)
-      : selector_(Selector::intern(name)),
-        signature_(&signatureOf<R, A...>()),
-        result_(identityOf<std::remove_cvref_t<R>>()),
-        place_(Class::placeOf(selector_)) {}
-
-  Selector selector() const { return selector_; }
-  const Signature& signature() const { return *signature_; }
+  constexpr explicit Message(std::string_view name)
+      : MessageRecord(name, &signatureOf<R, A...>, &identityOf<std::remove_cvref_t<R>>) {}
 
   R operator()(Receiver receiver, A... arguments) const {
     Object* object = receiver.get();
     if (object == nullptr) return R();
-    return call(*object, object->isa().lookUp(selector_, place_), std::move(arguments)...);
+    return call(*object, answerOf(*object), std::move(arguments)...);
   }
 
   // Calls one entry directly, as a call to super does. An entry without a function has no signature either.
   R call(Object& object, const Method& method, A... arguments) const {
-    if (method.signature != signature_) [[unlikely]]
+    if (!hasTypeOf(method)) [[unlikely]]
       return R();
     using Function = CanonicalType<R> (*)(Object&, const Method&, CanonicalType<A>...);
     const auto function = reinterpret_cast<Function>(method.function);
     if constexpr (std::is_same_v<R, CanonicalType<R>>) {
       return function(object, method, std::move(arguments)...);
     } else {
-      Ref<Object> result = function(object, method, std::move(arguments)...);
-      if (method.result != result_) [[unlikely]]
-        return cast<typename R::Target>(std::move(result));
-      return R::adopt(static_cast<typename R::Target*>(result.leak()));
+      Ref<Object> found = function(object, method, std::move(arguments)...);
+      if (method.result != result()) [[unlikely]]
+        return cast<typename R::Target>(std::move(found));
+      return R::adopt(static_cast<typename R::Target*>(found.leak()));
     }
   }
-
- private:
-  Selector selector_;
-  const Signature* signature_;
-  const void* result_;  // methods that return the same C++ type are believed
-  std::size_t place_;   // the selector's, in the classes' tables
 };
 
 // Whether an object's class answers the message with the message's own type.

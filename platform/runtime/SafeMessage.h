@@ -12,7 +12,7 @@ class SafeMessage;
 template <class R, class... A>
 class SafeMessage<R(A...)> {
  public:
-  explicit SafeMessage(std::string_view name) : message_(name) {}
+  constexpr explicit SafeMessage(std::string_view name) : message_(name) {}
 
   R operator()(Receiver receiver, A... arguments) const {
     try {

@@ -159,4 +159,10 @@ Selector Selector::find(std::string_view name) {
   return Selector(names().find(name, hashText(name)));
 }
 
+Selector LiteralSelector::find() const {
+  const Selector found = Selector::intern(name_);
+  record_.store(found.record(), std::memory_order_release);
+  return found;
+}
+
 }  // namespace ax

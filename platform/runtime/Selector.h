@@ -13,9 +13,9 @@ struct Method;
 // The one record of an interned name. Records stand in an arena, 64 bytes apart, and live as long as the
 // process; their addresses serve as hashes.
 struct alignas(64) SelectorRecord {
-  std::string_view name;
-  std::uint64_t textHash;
-  const Method* missing;  // what a class answers that lacks this message
+  std::string_view name = {};
+  std::uint64_t textHash = 0;
+  const Method* missing = nullptr;  // what a class answers that lacks this message
   // The class that is found by this name: null until there is one, and once it is hidden.
   mutable std::atomic<Class*> namedClass = nullptr;
 };
@@ -27,7 +27,7 @@ static_assert(sizeof(SelectorRecord) == 64, "Selector::hash() counts the records
 class Selector {
  public:
   Selector() = default;
-  explicit Selector(const SelectorRecord* record) : record_(record) {}
+  constexpr explicit Selector(const SelectorRecord* record) : record_(record) {}
   static Selector intern(std::string_view name);
   // The selector of a name that somebody has interned before, or a nil one; makes nothing.
   static Selector find(std::string_view name);
@@ -61,13 +61,32 @@ struct LiteralText {
   constexpr std::string_view view() const { return {characters, N - 1}; }
 };
 
+// The selector of a name that is written in the code: constant data until its first use, on whichever thread.
+class LiteralSelector {
+ public:
+  constexpr explicit LiteralSelector(std::string_view name) : name_(name) {}
+
+  Selector get() const {
+    const SelectorRecord* record = record_.load(std::memory_order_acquire);
+    return record != nullptr ? Selector(record) : find();
+  }
+
+ private:
+  Selector find() const;
+
+  std::string_view name_;
+  mutable std::atomic<const SelectorRecord*> record_ = nullptr;
+};
+
+template <LiteralText Text>
+inline constinit const LiteralSelector literalSelector{Text.view()};
+
 inline namespace literals {
 
 // "_titleLabel"_key: interned at the first use of that literal, a load from then on.
 template <LiteralText Text>
 Selector operator""_key() {
-  static const Selector selector = Selector::intern(Text.view());
-  return selector;
+  return literalSelector<Text>.get();
 }
 
 }  // namespace literals

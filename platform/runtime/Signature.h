@@ -28,7 +28,7 @@ using CanonicalType = typename Canonical<std::remove_cvref_t<T>>::type;
 // What is known of a method's type. One record per canonical C++ type, alive as long as the process.
 struct Signature {
   // Type codes: the result first, then the arguments.
-  std::vector<std::string_view> encodings;
+  std::span<const std::string_view> encodings;
   // Calls a method of this type with boxed arguments. Arguments that are missing or of the wrong kind arrive
   // as nil, NO or 0. A void result is nil.
   Ref<Object> (*invoke)(Object&, const Method&, std::span<const Ref<Object>>);
@@ -84,10 +84,11 @@ struct SignatureMaker {
     if constexpr (!std::is_void_v<R>) return unbox<R>(answer);
   }
 
+  static constexpr std::string_view encodings[] = {encodingOf<R>(), encodingOf<A>()...};
+
   static const Signature& signature() {
-    static const Signature& result = internSignature(
-        typeid(R(A...)),
-        {{encodingOf<R>(), encodingOf<A>()...}, &invoke, reinterpret_cast<GenericFunction>(&scripted)});
+    static const Signature& result =
+        internSignature(typeid(R(A...)), {encodings, &invoke, reinterpret_cast<GenericFunction>(&scripted)});
     return result;
   }
 };

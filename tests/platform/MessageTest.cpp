@@ -2,7 +2,10 @@
 
 #include <gtest/gtest.h>
 
+#include <array>
+#include <atomic>
 #include <stdexcept>
+#include <thread>
 
 #include "platform/foundation/Number.h"
 #include "platform/foundation/String.h"
@@ -84,6 +87,37 @@ TEST(Message, narrowsObjectsToItsOwnType) {
 TEST(Message, letsThroughWhatMethodsRaise) {
   const Ref<Adder> adder = make<Adder>();
   EXPECT_THROW(raise(adder), std::runtime_error);
+}
+
+// Nobody has sent these before, and their receivers live on the threads that send.
+TEST(Message, findsItsSelectorOnTheThreadThatSendsFirst) {
+  static constinit const Message<std::int64_t(std::int64_t)> first{"MessageTestAdd:"};
+  static constinit const Message<Ref<String>()> unanswered{"MessageTestNeverRegistered"};
+  Adder::staticClass();
+  std::atomic<int> ready = 0;
+  std::atomic<int> wrong = 0;
+  std::array<std::thread, 4> threads;
+  for (std::thread& thread : threads) {
+    thread = std::thread([&] {
+      const Ref<Adder> adder = make<Adder>();
+      for (++ready; ready < 4;) std::this_thread::yield();
+      if (first(adder, 2) != 2 || first.call(*adder, adder->isa().lookUp("MessageTestAdd:"_key), 3) != 5)
+        ++wrong;
+      if (unanswered(adder) || "MessageTestNeverRegistered"_key != unanswered.selector()) ++wrong;
+    });
+  }
+  for (std::thread& thread : threads) thread.join();
+  EXPECT_EQ(wrong, 0);
+}
+
+TEST(Message, thatNobodyUsedIsOfNoMethodsType) {
+  const Ref<Adder> adder = make<Adder>();
+  const Message<std::int64_t(std::int64_t)> calledFirst{"MessageTestAdd:"};
+  const Message<std::int64_t(std::int64_t)> calledWithNothing{"MessageTestAdd:"};
+  EXPECT_EQ(calledFirst.call(*adder, adder->isa().lookUp(add.selector()), 4), 4);
+  EXPECT_EQ(calledWithNothing.call(*adder, adder->isa().lookUp(kind.selector()), 4), 0);
+  EXPECT_EQ(adder->isa().lookUp(Selector()).function, nullptr) << "the nil selector answers nothing";
+  EXPECT_FALSE(adder->isa().readerForKey(Selector()).isReadable());
 }
 
 TEST(Message, keepsItsObjectsCounted) {
