@@ -1,5 +1,6 @@
 #include <gtest/gtest.h>
 
+#include <fstream>
 #include <set>
 
 #include "host/core/HostApp.h"
@@ -77,10 +78,32 @@ std::string faultWithout(const ContractCheck& row) {
   return reported == (categoryIsGone ? 0 : 1) ? "" : "reported " + std::to_string(reported) + " times";
 }
 
+// In the form of checks.txt: each category in the order of installation, and under it what it checks.
+std::string contractTable(const std::vector<ContractCheck>& rows) {
+  std::string text = "(start-up)\n";
+  const auto append = [&](std::string_view category) {
+    for (const ContractCheck& row : rows) {
+      if (row.category != category) continue;
+      const bool hasType = row.kind == CheckKind::instanceVariable || row.kind == CheckKind::instanceMethod ||
+                           row.kind == CheckKind::classMethod;
+      text += "  " + row.description() + (hasType ? ": " + row.expected : "") + "\n";
+    }
+  };
+  append("");
+  for (const InstallationRequest& request : ValidationManager::sharedInstance()->installationRequests()) {
+    text += request.category + "\n";
+    append(request.category);
+  }
+  return text;
+}
+
 }  // namespace
 
 TEST(ContractRows, AHealthyHostHoldsThemAll) {
-  rowsOfHealthyHost();
+  const std::vector<ContractCheck> rows = rowsOfHealthyHost();
+  std::ifstream table(tour::samplesFolder().parent_path() / "tests/contract/checks.txt");
+  const std::string expected{std::istreambuf_iterator<char>(table), {}};
+  EXPECT_EQ(contractTable(rows), expected);
   const ContractReport report = ContractReport::ofProcess();
   for (const ContractFinding& finding : report.findings()) {
     EXPECT_TRUE(finding.passed) << finding.check << ": expected " << finding.expected << ", found "
