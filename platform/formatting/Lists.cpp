@@ -1,15 +1,16 @@
 #include "platform/formatting/Lists.h"
 
+#include "platform/formatting/MessagePattern.h"
+#include "platform/formatting/PlatformWords.h"
 #include "platform/formatting/Region.h"
 
 namespace ax::formatting {
 
 std::string_view listSeparator() {
   static std::uint64_t generation = 0;
-  static std::string_view separator;
+  static std::string& separator = *new std::string;
   if (generation != regionGeneration()) {
-    const std::string language = currentLanguage();
-    separator = language == "ar" ? "، " : language == "ja" ? "、" : ", ";
+    separator = formatMessage(platformWord("list.pair"), std::vector<MessageArgument>(2, std::string()));
     generation = regionGeneration();
   }
   return separator;

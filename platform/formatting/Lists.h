@@ -5,8 +5,8 @@
 
 namespace ax::formatting {
 
-// Between two spoken parts in the current language: ", " or that language's own. Main thread only;
-// the text itself lasts for ever.
+// Between two spoken parts in the current language: ", " or that language's own. The text
+// lasts until the language changes. Main thread only.
 std::string_view listSeparator();
 
 }  // namespace ax::formatting
