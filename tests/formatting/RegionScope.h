@@ -6,7 +6,7 @@
 
 // Sets the region for one block of a test and puts the default back.
 struct RegionScope {
-  explicit RegionScope(const char* locale, const char* timeZone = "UTC") {
+  explicit RegionScope(const std::string& locale, const char* timeZone = "UTC") {
     ax::formatting::setCurrentRegion({locale, timeZone});
   }
   ~RegionScope() { ax::formatting::setCurrentRegion({"en_US", "UTC"}); }

@@ -190,9 +190,9 @@ void expectSpeakable(const UnicodeString& text) {
 }
 
 // What ICU's own messages, which follow CLDR's rules, make of a pattern whose arguments are all `number`.
-std::string filledByIcu(const UnicodeString& pattern, const char* locale, double number) {
+std::string filledByIcu(const UnicodeString& pattern, const std::string& locale, double number) {
   UErrorCode status = U_ZERO_ERROR;
-  const icu::MessageFormat message(pattern, icu::Locale(locale), status);
+  const icu::MessageFormat message(pattern, icu::Locale(locale.c_str()), status);
   const std::vector<icu::Formattable> arguments(4, icu::Formattable(number));
   UnicodeString result;
   icu::FieldPosition ignored(icu::FieldPosition::DONT_CARE);
