@@ -4,6 +4,7 @@
 
 #include "apps/axvelto/Command.h"
 #include "apps/axvelto/Output.h"
+#include "apps/axvelto/Progress.h"
 #include "apps/shared/Input.h"
 #include "apps/shared/Presentation.h"
 #include "platform/formatting/Region.h"
@@ -98,7 +99,10 @@ ExitCode run(const Arguments& arguments) {
   const std::set<std::string> without = rulesToLeaveOut(arguments);
   const bool isAll = arguments.locale == allLocales;
   reader::AuditReport report;
+  const Progress progress("Screen");
+  std::size_t done = 0;
   for (const std::string& file : arguments.files) {
+    progress.show(++done, arguments.files.size());
     report.add(auditOf(file, arguments, isAll ? spokenLocales() : std::vector{arguments.locale}), without);
   }
   if (arguments.asJson) {

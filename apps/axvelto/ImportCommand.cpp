@@ -1,11 +1,10 @@
-#include <unistd.h>
-
 #include <algorithm>
 #include <filesystem>
 #include <iostream>
 
 #include "apps/axvelto/Command.h"
 #include "apps/axvelto/Output.h"
+#include "apps/axvelto/Progress.h"
 #include "apps/shared/Input.h"
 #include "apps/shared/Workouts.h"
 
@@ -50,28 +49,12 @@ std::vector<std::string> filesBelow(const std::string& folder) {
   return files;
 }
 
-// How far it is, on one line of a terminal.
-class Progress {
- public:
-  explicit Progress(std::size_t count) : count_(count), isShown_(count > 1 && isatty(STDERR_FILENO) != 0) {}
-  void tell(std::size_t done) const {
-    if (isShown_) std::cerr << "\r\033[K" << done << " / " << count_ << std::flush;
-  }
-  void clear() const {
-    if (isShown_) std::cerr << "\r\033[K" << std::flush;
-  }
-
- private:
-  std::size_t count_;
-  bool isShown_;
-};
-
 // Answers whether all could be read. What cannot be is told, and the others go on.
 bool addAll(const std::vector<std::string>& files, const Arguments& arguments, Workouts& workouts) {
   bool isWhole = true;
-  const Progress progress(files.size());
+  const Progress progress("Reading");
   for (std::size_t i = 0; i < files.size(); ++i) {
-    progress.tell(i);
+    if (files.size() > 1) progress.show(i, files.size());
     try {
       const auto add = [&](const std::string& name, std::string_view bytes) { workouts.add(name, bytes); };
       isWhole = forEachUnpacked(files[i], arguments, add) && isWhole;
@@ -82,7 +65,6 @@ bool addAll(const std::vector<std::string>& files, const Arguments& arguments, W
       std::cerr << fault.text() << '\n';
     }
   }
-  progress.clear();
   return isWhole;
 }
 

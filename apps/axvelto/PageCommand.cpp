@@ -2,6 +2,7 @@
 #include <iostream>
 
 #include "apps/axvelto/Command.h"
+#include "apps/axvelto/Progress.h"
 #include "apps/shared/Presentation.h"
 #include "reader/page/Page.h"
 #include "reader/picture/ScreenPicture.h"
@@ -42,9 +43,11 @@ ExitCode drawPicture(const Arguments& arguments) {
 ExitCode run(const Arguments& arguments) {
   if (arguments.output.ends_with(".svg")) return drawPicture(arguments);
   reader::Page page;
-  for (const std::string& file : arguments.files) {
+  const Progress progress("Screen");
+  for (std::size_t i = 0; i < arguments.files.size(); ++i) {
+    progress.show(i + 1, arguments.files.size());
     Arguments one = arguments;
-    one.files = {file};
+    one.files = {arguments.files[i]};
     Presentation presentation(one);
     page.add(presentation.snapshot(), presentation.run().title());
   }

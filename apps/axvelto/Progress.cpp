@@ -16,6 +16,10 @@ constexpr std::string_view clearLine = "\r\x1B[K";
 Progress::Progress(std::string what) : what_(std::move(what)), isShown_(isatty(STDERR_FILENO) == 1) {}
 
 Progress::~Progress() {
+  clear();
+}
+
+void Progress::clear() const {
   if (isShown_) std::cerr << clearLine << std::flush;
 }
 

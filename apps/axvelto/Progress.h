@@ -15,6 +15,8 @@ class Progress {
   Progress& operator=(const Progress&) = delete;
 
   void show(std::size_t done, std::size_t all) const;
+  // Before another line is written there.
+  void clear() const;
 
  private:
   std::string what_;

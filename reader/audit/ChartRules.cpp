@@ -1,5 +1,6 @@
 #include "reader/audit/AuditRule.h"
 #include "reader/snapshot/Charts.h"
+#include "reader/speech/ChartWords.h"
 
 // Charts.
 namespace ax::reader {
@@ -12,10 +13,7 @@ bool isEmpty(const std::optional<AttributedText>& text) {
 
 // A heading inside a chart, or right above it, names it as a title does.
 bool isNamed(const AuditScreen& screen, const Node& chart) {
-  if (!isEmpty(chart.label) || !isEmpty(chart.series->name)) return true;
-  for (const Node* element : elementsOfChart(screen.snapshot, chart)) {
-    if (element->role == Role::header) return true;
-  }
+  if (!nameOfChart(screen.snapshot, chart).empty()) return true;
   const Node* before = nullptr;
   for (const Node& node : screen.snapshot.nodes()) {
     if (node.id >= chart.id) break;

@@ -3,8 +3,8 @@
 #include "platform/formatting/Dates.h"
 #include "platform/formatting/Durations.h"
 #include "platform/formatting/Numbers.h"
-#include "platform/health/Unit.h"
 #include "reader/snapshot/Charts.h"
+#include "reader/speech/ChartWords.h"
 #include "reader/speech/SpokenLine.h"
 #include "reader/speech/SpokenTime.h"
 #include "reader/text/ReaderStrings.h"
@@ -19,45 +19,12 @@ constexpr std::string_view axisKeys[] = {"chart.axis.x", "chart.axis.y"};
 constexpr std::string_view once = "  ";
 constexpr std::string_view twice = "    ";
 
-std::string number(double value) {
-  return formatting::decimalString(value, 2);
-}
-
-std::string words(const std::optional<AttributedText>& text) {
-  return text ? withSpokenTimes(*text) : std::string();
-}
-
-// A chart may give a unit as its sign; it is told by its name where it has one.
-std::string unitName(const std::optional<AttributedText>& label) {
-  const std::string text = words(label);
-  const Ref<Unit> unit = Unit::unitFromString(text);
-  return unit ? unit->description() : text;
-}
-
-std::string named(std::string_view key, const std::string& text) {
-  return text.empty() ? std::string() : readerText(key, {text});
-}
-
 void add(Lines& lines, std::string_view indent, const std::string& text) {
   if (!text.empty()) lines.push_back(std::string(indent) + text);
 }
 
 std::string count(std::string_view key, std::size_t number) {
   return readerText(key, {static_cast<std::int64_t>(number)});
-}
-
-std::string heading(const Node& chart) {
-  std::string name = words(chart.series->name);
-  if (name.empty()) name = words(chart.label);
-  return name.empty() ? readerText("chart.untitled") : readerText("chart.title", {name});
-}
-
-std::string range(const DataSeriesAxis& axis) {
-  if (axis.minimum && axis.maximum) {
-    return readerText("chart.range", {number(*axis.minimum), number(*axis.maximum)});
-  }
-  if (axis.minimum) return readerText("chart.lowest", {number(*axis.minimum)});
-  return axis.maximum ? readerText("chart.highest", {number(*axis.maximum)}) : std::string();
 }
 
 // Kept apart by a mark that is no decimal sign in any language.
@@ -69,13 +36,14 @@ std::string separatedFigures(const Lines& figures) {
 
 void addAxis(const DataSeriesAxis& axis, std::string_view key, Lines& lines) {
   add(lines, once,
-      readerText(key, {joined({words(axis.title), named("chart.unit", unitName(axis.unitLabel)), range(axis),
+      readerText(key, {joined({withSpokenTimes(axis.title), unitOf(axis), rangeOf(axis.minimum, axis.maximum),
                                count("chart.values", axis.values.size())})}));
   Lines values;
-  for (const double value : axis.values) values.push_back(number(value));
+  for (const double value : axis.values) values.push_back(spokenFigure(value));
   add(lines, twice, separatedFigures(values));
   for (const auto& [position, text] : axis.positions) {
-    add(lines, twice, readerText("chart.position", {formatting::percentString(position), words(text)}));
+    add(lines, twice,
+        readerText("chart.position", {formatting::percentString(position), withSpokenTimes(text)}));
   }
 }
 
@@ -95,8 +63,8 @@ void addElements(const std::vector<const Node*>& elements, Lines& lines) {
     const Rect& frame = element->frame;
     add(lines, twice,
         joined({spokenLine(*element),
-                readerText("chart.frame",
-                           {number(frame.x), number(frame.y), number(frame.width), number(frame.height)})}));
+                readerText("chart.frame", {spokenFigure(frame.x), spokenFigure(frame.y),
+                                           spokenFigure(frame.width), spokenFigure(frame.height)})}));
   }
 }
 
@@ -125,7 +93,7 @@ std::string spokenSpan(const DataSlice& slice) {
 std::string describeSlice(const DataSeries& series, std::size_t index) {
   if (index >= series.slices.size()) return "";
   const DataSlice& slice = series.slices[index];
-  const std::string quantity = words(slice.quantity);
+  const std::string quantity = withSpokenTimes(slice.quantity);
   return joined({readerText("chart.slice", {static_cast<std::int64_t>(index) + 1, spokenSpan(slice)}),
                  quantity.empty() ? readerText("chart.no.data") : quantity});
 }
@@ -133,7 +101,7 @@ std::string describeSlice(const DataSeries& series, std::size_t index) {
 std::vector<std::string> describeChart(const Snapshot& snapshot, const Node& chart) {
   const DataSeries& series = *chart.series;
   const auto elements = elementsOfChart(snapshot, chart);
-  Lines lines = {heading(chart)};
+  Lines lines = {headingOf(snapshot, chart)};
   addSeries(series, lines);
   addElements(elements, lines);
   addSlices(series, lines);

@@ -5,6 +5,8 @@
 #include "reader/graph/ChartDescription.h"
 #include "reader/page/ElementLine.h"
 #include "reader/picture/ScreenPicture.h"
+#include "reader/speech/ChartWords.h"
+#include "reader/speech/SpokenTime.h"
 #include "reader/text/ReaderStrings.h"
 
 namespace ax::reader {
@@ -24,11 +26,16 @@ std::string countText(std::string_view key, std::size_t count) {
 
 }  // namespace
 
-void openChartFigure(Markup& html, const Node& chart, const std::string& id) {
+std::string captionOf(const Snapshot& snapshot, const Node& chart) {
+  const std::string name = nameOfChart(snapshot, chart);
+  return name.empty() ? readerText("chart.untitled") : name;
+}
+
+void openChartFigure(Markup& html, const Snapshot& snapshot, const Node& chart, const std::string& id) {
   html.open("figure", {{"class", "chart"}, {"aria-labelledby", id + "-caption"}});
   html.element("span", {{"class", "role"}, {"aria-hidden", "true"}}, readerText("role.chart"));
-  html.element("figcaption", {{"id", id + "-caption"}}, captionOf(chart));
-  html.raw(chartPicture(*chart.series, readerText("chart.title", {captionOf(chart)})));
+  html.element("figcaption", {{"id", id + "-caption"}}, captionOf(snapshot, chart));
+  html.raw(chartPicture(snapshot, chart, headingOf(snapshot, chart)));
 }
 
 void addSliceTable(Markup& html, const DataSeries& series) {
@@ -38,7 +45,7 @@ void addSliceTable(Markup& html, const DataSeries& series) {
   for (const DataSlice& slice : series.slices) {
     const bool isTold = slice.quantity && !slice.quantity->text.empty();
     html.open("tr").element("th", {{"scope", "row"}}, spokenSpan(slice));
-    html.element("td", {}, isTold ? slice.quantity->text : readerText("chart.no.data")).close();
+    html.element("td", {}, isTold ? withSpokenTimes(slice.quantity) : readerText("chart.no.data")).close();
   }
   html.close().close();
 }
@@ -54,7 +61,7 @@ ChartTable::ChartTable(Markup& html, const std::vector<const Node*>& rows)
 
 void ChartTable::addCells(const Node& row) {
   html_.element("th", {{"scope", "row"}}, nameOf(row));
-  if (hasValues_) html_.element("td", {}, row.value ? row.value->text : std::string());
+  if (hasValues_) html_.element("td", {}, withSpokenTimes(row.value));
 }
 
 void ChartTable::close() {

@@ -4,12 +4,15 @@
 #include <vector>
 
 #include "reader/picture/Markup.h"
-#include "reader/snapshot/Node.h"
+#include "reader/snapshot/Snapshot.h"
 
 namespace ax::reader {
 
+// What a chart is called in its figure; never empty.
+std::string captionOf(const Snapshot& snapshot, const Node& chart);
+
 // Opens the figure of a chart with its name and its picture; the caller closes it. `id` is free for it.
-void openChartFigure(Markup& html, const Node& chart, const std::string& id);
+void openChartFigure(Markup& html, const Snapshot& snapshot, const Node& chart, const std::string& id);
 
 // The times and quantities of a chart's slices as a table; nothing for a chart without.
 void addSliceTable(Markup& html, const DataSeries& series);

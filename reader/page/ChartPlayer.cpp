@@ -1,6 +1,6 @@
 #include "reader/page/ChartPlayer.h"
 
-#include "reader/page/ElementLine.h"
+#include "reader/page/ChartFigure.h"
 #include "reader/sound/ChartSound.h"
 #include "reader/sound/SoundFile.h"
 #include "reader/text/ReaderStrings.h"
@@ -34,7 +34,7 @@ void addChartPlayer(Markup& html, const Snapshot& snapshot, const Node& chart) {
   const std::string file = soundFileOf(chartSound(snapshot, chart), SoundFormat::opus);
   html.open("audio", {{"controls", true},
                       {"preload", "metadata"},
-                      {"aria-label", readerText("page.sound", {captionOf(chart)})},
+                      {"aria-label", readerText("page.sound", {captionOf(snapshot, chart)})},
                       {"src", "data:audio/ogg;codecs=opus;base64," + base64(file)}});
   html.close();
 }

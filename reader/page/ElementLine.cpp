@@ -1,5 +1,6 @@
 #include "reader/page/ElementLine.h"
 
+#include "reader/speech/SpokenTime.h"
 #include "reader/text/ReaderStrings.h"
 
 namespace ax::reader {
@@ -8,10 +9,6 @@ namespace {
 
 std::optional<std::string> attributeOf(bool isSet, const char* value) {
   return isSet ? std::optional<std::string>(value) : std::nullopt;
-}
-
-std::string textOf(const std::optional<AttributedText>& text) {
-  return text ? text->text : std::string();
 }
 
 bool isLink(const Node& node) {
@@ -34,21 +31,21 @@ class LineWriter {
       : html_(html),
         node_(node),
         id_(id),
-        heading_("h" + std::to_string(headingLevel)),
-        hint_(attributeOf(!textOf(node.hint).empty(), "")) {
+        heading_(std::to_string(headingLevel).insert(0, 1, 'h')),
+        hint_(attributeOf(!withSpokenTimes(node.hint).empty(), "")) {
     if (hint_) hint_ = id + "-hint";
   }
 
   void write() {
     addRoleWord();
     addNamed();
-    const std::string value = textOf(node_.value);
+    const std::string value = withSpokenTimes(node_.value);
     const bool isTold = node_.role == Role::adjustable;  // by the slider
     if (!value.empty()) {
       html_.element("span", {{"class", "value"}, {"aria-hidden", attributeOf(isTold, "true")}}, value);
     }
     addStateWords(html_, node_);
-    if (hint_) html_.element("span", {{"class", "hint"}, {"id", hint_}}, textOf(node_.hint));
+    if (hint_) html_.element("span", {{"class", "hint"}, {"id", hint_}}, withSpokenTimes(node_.hint));
   }
 
  private:
@@ -132,7 +129,7 @@ class LineWriter {
                           {"max", "0"},
                           {"value", "0"},
                           {"disabled", node_.states.disabled},
-                          {"aria-valuetext", textOf(node_.value)},
+                          {"aria-valuetext", withSpokenTimes(node_.value)},
                           {"aria-describedby", hint_}});
   }
 
@@ -146,13 +143,8 @@ class LineWriter {
 }  // namespace
 
 std::string nameOf(const Node& node) {
-  const std::string label = textOf(node.label);
-  return label.empty() && node.series ? textOf(node.series->name) : label;
-}
-
-std::string captionOf(const Node& chart) {
-  const std::string name = nameOf(chart);
-  return name.empty() ? readerText("chart.untitled") : name;
+  const std::string label = withSpokenTimes(node.label);
+  return label.empty() && node.series ? withSpokenTimes(node.series->name) : label;
 }
 
 void addStateWords(Markup& html, const Node& node) {

@@ -68,7 +68,7 @@ class ListWriter {
   }
 
   void writeChart(const Node& chart) {
-    openChartFigure(html_, chart, idOf(chart));
+    openChartFigure(html_, snapshot_, chart, idOf(chart));
     if (place_.hasSound) addChartPlayer(html_, snapshot_, chart);
     std::vector<NodeId> lines;
     std::vector<const Node*> rows;

@@ -67,7 +67,8 @@ std::string Page::html() const {
     html.open("ol");
     for (std::size_t i = 0; i < screens_.size(); ++i) {
       html.open("li", {{"lang", screens_[i].language}, {"dir", screens_[i].direction}});
-      html.element("a", {{"href", "#" + idOf(i + 1)}}, screens_[i].title).close();
+      const std::string id = idOf(i + 1);
+      html.element("a", {{"href", "#" + id}}, screens_[i].title).close();
     }
     html.close().close();
   }

@@ -5,6 +5,7 @@
 
 #include "reader/picture/ChartValues.h"
 #include "reader/snapshot/Charts.h"
+#include "reader/snapshot/ShownSeries.h"
 
 namespace ax::reader {
 
@@ -89,7 +90,7 @@ ChartDrawing drawChartOnScreen(const Snapshot& snapshot, const Node& chart) {
   const std::vector<Rect> frames = framesOfValues(snapshot, chart);
   Rect plot = frames.empty() ? chart.frame : frames.front();
   for (const Rect& frame : frames) plot = plot.unionWith(frame);
-  ChartDrawing drawing = drawChart(*chart.series, plot);
+  ChartDrawing drawing = drawChart(shownSeries(snapshot, chart), plot);
   if (drawing.bars.size() != frames.size()) return drawing;
   for (std::size_t i = 0; i < frames.size(); ++i) {
     drawing.bars[i].width = frames[i].width * filled;

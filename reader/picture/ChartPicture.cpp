@@ -7,6 +7,8 @@
 #include "reader/picture/ChartValues.h"
 #include "reader/picture/PictureStyle.h"
 #include "reader/picture/ScreenPicture.h"
+#include "reader/snapshot/ShownSeries.h"
+#include "reader/speech/ChartWords.h"
 #include "reader/text/ReaderStrings.h"
 
 namespace ax::reader {
@@ -25,10 +27,10 @@ std::string textOf(const std::optional<AttributedText>& text) {
   return text ? text->text : std::string();
 }
 
-// "Heart rate, beats per minute"; a unit that is the title itself is not said again.
+// "Heart rate, beats per minute"; a title that is the unit itself is not said again.
 std::string titleOf(const DataSeriesAxis& axis) {
-  const std::string title = textOf(axis.title), unit = textOf(axis.unitLabel);
-  return joined({title, unit == title ? std::string() : unit});
+  const std::string title = textOf(axis.title), unit = unitName(axis);
+  return joined({title == textOf(axis.unitLabel) || title == unit ? std::string() : title, unit});
 }
 
 struct Tick {
@@ -88,8 +90,8 @@ class ChartDrawingWithAxes {
 
   // Faintly, the end of the vertical axis.
   void addGuide(const Rect& plot) {
-    const std::string line =
-        "M" + markupNumber(plot.x) + " " + markupNumber(plot.y) + "H" + markupNumber(plot.maxX());
+    const std::string line = std::string("M") + markupNumber(plot.x) + " " + markupNumber(plot.y) + "H" +
+                             markupNumber(plot.maxX());
     svg_.empty("path",
                {{"class", "guide"}, {"d", line}, {"stroke", colours::outline}, {"stroke-width", 0.5}});
   }
@@ -115,7 +117,10 @@ class ChartDrawingWithAxes {
     if (!series_.hasAxes) return;
     const double start = isRightToLeft_ ? plot.maxX() : edge;
     addText(start, fontSize + edge, isRightToLeft_ ? 1 : -1, titleOf(series_.axes[1]));
-    addText(plot.center().x, whole.height - 2 * edge, 0, titleOf(series_.axes[0]));
+    // Its ends are times or days, not figures of a unit, where the chart tells them.
+    const bool hasFigures = series_.axes[0].positions.empty();
+    addText(plot.center().x, whole.height - 2 * edge, 0,
+            hasFigures ? titleOf(series_.axes[0]) : textOf(series_.axes[0].title));
     if (values_.values.empty()) return;
     constexpr double middle = 0.36 * fontSize;
     addText(plot.x - edge, plot.y + middle, 1, highest());
@@ -137,6 +142,10 @@ class ChartDrawingWithAxes {
 };
 
 }  // namespace
+
+std::string chartPicture(const Snapshot& snapshot, const Node& chart, const std::string& name) {
+  return chartPicture(shownSeries(snapshot, chart), name);
+}
 
 std::string chartPicture(const DataSeries& series, const std::string& name) {
   return ChartDrawingWithAxes(series).svg(name);

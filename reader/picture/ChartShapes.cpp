@@ -54,7 +54,7 @@ void addChartShapes(Markup& svg, const ChartDrawing& drawing) {
   const Rect& plot = drawing.plot;
   for (const Rect& bar : drawing.bars) addBar(svg, bar);
   for (const std::vector<Point>& line : drawing.lines) addLine(svg, line);
-  const std::string axes = "M" + markupNumber(plot.x) + " " + markupNumber(plot.y) + "V" +
+  const std::string axes = std::string("M") + markupNumber(plot.x) + " " + markupNumber(plot.y) + "V" +
                            markupNumber(plot.maxY()) + "H" + markupNumber(plot.maxX());
   svg.empty("path", {{"class", "axis"}, {"d", axes}, {"fill", "none"}, {"stroke", colours::ink}});
 }

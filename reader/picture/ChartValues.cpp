@@ -12,13 +12,14 @@ namespace {
 // The kind of series that is drawn as bars; others are lines.
 constexpr std::int64_t barSeries = 2;
 
+// Also what is no number, since bars keep its place free.
 std::vector<ChartValue> pointsOf(const DataSeries& series) {
   const auto& [x, y] = series.axes;
   std::vector<ChartValue> points;
   bool isAfterGap = false;
   for (std::size_t i = 0; i < std::min(x.values.size(), y.values.size()); ++i) {
     const double at = x.values[i], value = y.values[i];
-    if (std::isfinite(at) && std::isfinite(value)) points.push_back({at, at, value, value, isAfterGap});
+    if (std::isfinite(at)) points.push_back({at, at, value, value, isAfterGap});
     isAfterGap = !std::isfinite(value);
   }
   std::ranges::stable_sort(points, {}, &ChartValue::start);
@@ -100,6 +101,7 @@ ChartValues chartValues(const DataSeries& series) {
   chart.values = pointsOf(series);
   chart.areBars = series.type == barSeries;
   if (chart.areBars) widenToBars(chart.values);
+  std::erase_if(chart.values, [](const ChartValue& value) { return !std::isfinite(value.high); });
   if (chart.values.empty()) {
     chart.values = rangesOf(series);
     chart.areBars = true;

@@ -13,7 +13,8 @@ namespace ax::reader {
 // unit is one point of the screen. The title names the picture.
 std::string screenPicture(const Snapshot& snapshot, const ReadingOrder& order, const std::string& title);
 
-// One chart, larger, with its axes, their titles and ends. `name` names the picture.
+// One chart of a snapshot, larger, with its axes, their titles and ends. `name` names the picture.
+std::string chartPicture(const Snapshot& snapshot, const Node& chart, const std::string& name);
 std::string chartPicture(const DataSeries& series, const std::string& name);
 
 }  // namespace ax::reader

@@ -3,8 +3,8 @@
 #include <algorithm>
 #include <cmath>
 
-#include "reader/sound/ShownBars.h"
-#include "reader/sound/SliceValues.h"
+#include "reader/snapshot/ShownSeries.h"
+#include "reader/speech/SliceQuantity.h"
 
 namespace ax::reader {
 
@@ -27,15 +27,14 @@ double fraction(double number, double from, double to) {
   return std::clamp((number / 2 - from / 2) / (to / 2 - from / 2), 0.0, 1.0);
 }
 
-std::vector<Point> pointsOf(const Snapshot& snapshot, const Node& chart) {
-  const auto& [horizontal, vertical] = chart.series->axes;
+Points pointsOf(const DataSeries& series) {
+  const auto& [horizontal, vertical] = series.axes;
   const bool hasPlaces = horizontal.values.size() == vertical.values.size() &&
                          std::ranges::all_of(horizontal.values, [](double x) { return std::isfinite(x); });
-  const std::vector<bool> gaps = valuesWithoutBar(snapshot, chart);
   Points points;
   for (std::size_t i = 0; i < vertical.values.size(); ++i) {
     points.push_back({hasPlaces ? horizontal.values[i] : double(i), vertical.values[i]});
-    if (gaps[i] || !isFinite(points.back().value)) points.back().value.reset();
+    if (!isFinite(points.back().value)) points.back().value.reset();
   }
   std::ranges::stable_sort(points, {}, &Point::x);
   return points;
@@ -90,7 +89,7 @@ Points averagedPoints(const Points& points) {
 
 // Two points for each slice; of many slices, for each of the spans that hold them.
 Points slicePoints(const DataSeries& series) {
-  const std::vector<std::optional<ValueRange>> values = sliceValues(series);
+  const std::vector<std::optional<SliceQuantity>> values = sliceQuantities(series);
   Points lows, highs;
   for (std::size_t i = 0; i < values.size(); ++i) {
     const double middle = (series.slices[i].start + series.slices[i].end) / 2;
@@ -145,7 +144,7 @@ ChartNotes notesOfChart(const Snapshot& snapshot, const Node& chart) {
   const DataSeries& series = *chart.series;
   if (playsSlices(series)) return notesOfSlices(series);
   ChartNotes notes;
-  const Points values = pointsOf(snapshot, chart);
+  const Points values = pointsOf(shownSeries(snapshot, chart));
   if (values.empty()) return notes;
   const bool isAveraged = values.size() > mostNotes;
   if (isAveraged) notes.averaged = values.size();

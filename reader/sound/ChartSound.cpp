@@ -8,6 +8,7 @@
 #include "reader/sound/Speech.h"
 #include "reader/sound/Tone.h"
 #include "reader/speech/ChartWords.h"
+#include "reader/speech/SpokenTime.h"
 #include "reader/text/ReaderStrings.h"
 
 namespace ax::reader {
@@ -29,16 +30,18 @@ std::string counted(std::string_view key, std::size_t count) {
 std::string horizontalAxis(const DataSeriesAxis& axis) {
   const auto& places = axis.positions;
   const bool isDescribed = places.size() > 1 && places.front().position == 0 && places.back().position == 1;
-  const std::string range =
-      isDescribed ? readerText("chart.range", {chartText(places.front().text), chartText(places.back().text)})
-                  : rangeOf(axis.minimum, axis.maximum);
-  return readerText("chart.axis.x",
-                    {joined({chartText(axis.title), isDescribed ? std::string() : unitOf(axis), range})});
+  const std::string range = isDescribed ? readerText("chart.range", {withSpokenTimes(places.front().text),
+                                                                     withSpokenTimes(places.back().text)})
+                                        : rangeOf(axis.minimum, axis.maximum);
+  return readerText(
+      "chart.axis.x",
+      {joined({withSpokenTimes(axis.title), isDescribed ? std::string() : unitOf(axis), range})});
 }
 
 std::string verticalAxis(const DataSeriesAxis& axis, const ChartNotes& notes) {
-  return readerText("chart.axis.y",
-                    {joined({chartText(axis.title), unitOf(axis), rangeOf(notes.minimum, notes.maximum)})});
+  return readerText(
+      "chart.axis.y",
+      {joined({withSpokenTimes(axis.title), unitOf(axis), rangeOf(notes.minimum, notes.maximum)})});
 }
 
 Lines sliceLines(const DataSeries& series, const ChartNotes& notes) {
@@ -48,9 +51,9 @@ Lines sliceLines(const DataSeries& series, const ChartNotes& notes) {
           readerText("chart.axis.y", {rangeOf(notes.minimum, notes.maximum)})};
 }
 
-Lines linesOf(const Node& chart, const ChartNotes& notes) {
+Lines linesOf(const Snapshot& snapshot, const Node& chart, const ChartNotes& notes) {
   const DataSeries& series = *chart.series;
-  Lines lines = {headingOf(chart)};
+  Lines lines = {headingOf(snapshot, chart)};
   if (notes.notes.empty()) {
     lines.push_back(readerText("chart.no.data"));
   } else if (playsSlices(series)) {
@@ -84,7 +87,7 @@ Sound soundOf(const ChartNotes& notes) {
 }  // namespace
 
 Lines introductionOfChart(const Snapshot& snapshot, const Node& chart) {
-  return linesOf(chart, notesOfChart(snapshot, chart));
+  return linesOf(snapshot, chart, notesOfChart(snapshot, chart));
 }
 
 Sound notesSound(const Snapshot& snapshot, const Node& chart) {
@@ -94,7 +97,7 @@ Sound notesSound(const Snapshot& snapshot, const Node& chart) {
 Sound chartSound(const Snapshot& snapshot, const Node& chart) {
   const ChartNotes notes = notesOfChart(snapshot, chart);
   Sound sound;
-  for (const std::string& line : linesOf(chart, notes)) {
+  for (const std::string& line : linesOf(snapshot, chart, notes)) {
     const std::optional<Sound> spoken = spokenSound(line, formatting::currentRegion().locale);
     if (!spoken) break;
     sound.add(*spoken);

@@ -18,7 +18,7 @@ std::size_t digitAt(std::string_view text, std::size_t at) {
 }
 
 std::size_t separatorAt(std::string_view text, std::size_t at) {
-  constexpr std::string_view separators[] = {".", ",", "\u066B", "\u066C", "\u00A0", "\u202F"};
+  constexpr std::string_view separators[] = {".", ",", "\u066B", "\u066C", "\u00A0", "\u202F", "\u2019"};
   for (const std::string_view separator : separators) {
     if (text.substr(at).starts_with(separator)) return separator.size();
   }
@@ -56,8 +56,8 @@ std::optional<double> durationOf(std::string_view text, std::vector<double> numb
   for (const double hours : numbers) {
     for (const double minutes : numbers) {
       for (const double seconds : numbers) {
-        const double all = hours * 3600 + minutes * 60 + seconds;
-        if (formatting::spokenDuration(all) == text) return all;
+        const double all = hours * 60 + minutes + seconds / 60;
+        if (formatting::spokenDuration(all * 60) == text) return all;
       }
     }
   }

@@ -8,7 +8,7 @@
 namespace ax::reader {
 
 // What the text of a slice tells in numbers: "106 to 136 beats per minute" is a range, "45 minutes" one value
-// twice. Times are in seconds.
+// twice. Times are in minutes.
 struct SliceQuantity {
   double low;
   double high;

@@ -70,4 +70,8 @@ std::string withSpokenTimes(const AttributedText& text) {
   return spoken + text.text.substr(done);
 }
 
+std::string withSpokenTimes(const std::optional<AttributedText>& text) {
+  return text ? withSpokenTimes(*text) : std::string();
+}
+
 }  // namespace ax::reader

@@ -16,5 +16,7 @@ std::optional<double> secondsFromText(std::string_view text);
 // The text with every range that is marked as a duration in words. What is no time stays as it is, and so
 // does a range that overlaps an earlier one.
 std::string withSpokenTimes(const AttributedText& text);
+// Empty for nil.
+std::string withSpokenTimes(const std::optional<AttributedText>& text);
 
 }  // namespace ax::reader

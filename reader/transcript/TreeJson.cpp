@@ -1,5 +1,6 @@
 #include "reader/transcript/TreeJson.h"
 
+#include "reader/speech/SpokenTime.h"
 #include "reader/text/TextJson.h"
 #include "reader/text/TraitNames.h"
 
@@ -31,15 +32,23 @@ void addUnlessEmpty(Json& object, const char* key, Json value) {
   if (!value.empty()) object[key] = std::move(value);
 }
 
+// With what is spoken instead where that differs.
+Json spokenTextAsJson(const std::optional<AttributedText>& text) {
+  Json json = textAsJson(text);
+  const std::string spoken = withSpokenTimes(text);
+  if (text && spoken != text->text) json["spoken"] = spoken;
+  return json;
+}
+
 Json nodesAsJson(const Snapshot& snapshot, const std::vector<NodeId>& ids);
 
 Json nodeAsJson(const Snapshot& snapshot, const Node& node) {
   Json json = {{"class", node.className}, {"id", node.objectId.empty() ? Json() : Json(node.objectId)}};
   json["role"] = roleName(node.role);
   json["isElement"] = node.isElement;
-  json["label"] = textAsJson(node.label);
-  json["value"] = textAsJson(node.value);
-  json["hint"] = textAsJson(node.hint);
+  json["label"] = spokenTextAsJson(node.label);
+  json["value"] = spokenTextAsJson(node.value);
+  json["hint"] = spokenTextAsJson(node.hint);
   json["traits"] = traitNames(node.traits);
   addUnlessEmpty(json, "states", stateNames(node.states));
   addUnlessEmpty(json, "actions", actionNames(node.actions));

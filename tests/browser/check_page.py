@@ -41,17 +41,22 @@ def command(program, *arguments):
 
 def text_of(text):
     if isinstance(text, dict):
-        text = text["string"]
+        text = text.get("spoken", text["string"])
     return " ".join((text or "").split())
 
 
-def expected(nodes, chart_names):
+def heading_in(chart):
+    headings = [each for each in chart.get("children", []) if each["role"] == "header"]
+    return text_of(headings[0]["label"]) if headings else ""
+
+
+def expected(nodes, chart_names, untitled):
     """The elements in order, each as what a browser is to say of it."""
     found = []
     for node in nodes:
         name = text_of(node["label"])
         if node["role"] == "chart":
-            name = chart_names.pop(0) or name
+            name = chart_names.pop(0) or name or heading_in(node) or untitled
         found.append({"role": ROLES.get(node["role"], "text"), "name": name, "hint": text_of(node["hint"]),
                       "value": text_of(node["value"])})
         if node["role"] == "header" and "button" in node["traits"]:
@@ -59,7 +64,7 @@ def expected(nodes, chart_names):
             found[-1]["value"] = ""
             found.append({"role": "button", "name": name, "hint": text_of(node["hint"]),
                           "value": text_of(node["value"])})
-        found += expected(node.get("children", []), chart_names)
+        found += expected(node.get("children", []), chart_names, untitled)
     return found
 
 
@@ -203,7 +208,7 @@ class Check:
         charts = json.loads(command(self.program, "graph", sample, "--locale", locale, "--json"))["charts"]
         untitled = {"en_US": "Chart without a title", "de_DE": "Diagramm ohne Titel",
                     "ar_EG": "مخطط بياني بلا عنوان"}[locale]
-        return expected(elements, [text_of(chart["name"]) or untitled for chart in charts])
+        return expected(elements, [text_of(chart["name"]) for chart in charts], untitled)
 
     def compare(self, where, wanted, said):
         for i in range(max(len(wanted), len(said))):

@@ -188,6 +188,11 @@ TEST(Graph, NamesASliceChartByItsLabelItsCellOrItsKind) {
   EXPECT_EQ(heading(cell), "Chart: Floors");
   messages::setAccessibilityLabel(chart, string("Flights"));
   EXPECT_EQ(heading(cell), "Chart: Flights");
+
+  const Ref<Label> title = label("Stairs of the week");
+  messages::setAccessibilityTraits(title, TraitHeader);
+  const Ref<Slices> headed = view<Slices>({label("first"), title});
+  EXPECT_EQ(heading(headed), "Chart: Stairs of the week");
 }
 
 TEST(Graph, TellsTheLengthOfASlice) {

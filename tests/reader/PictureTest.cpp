@@ -164,6 +164,20 @@ TEST(ChartDrawing, DrawsBarsOfTheirHeight) {
   EXPECT_TRUE(drawChart(bars({}, {}), plot).bars.empty());
 }
 
+TEST(ChartDrawing, ShowsNothingWhereTheChartHasNoBar) {
+  const Snapshot screen = takeSnapshot(view({label("a", {0, 0, 10, 80}), label("b", {20, 0, 10, 80})}));
+  Node chart;
+  chart.frame = {0, 0, 30, 80};
+  for (const Node& bar : screen.nodes()) chart.children.push_back(bar.id);
+  const auto drawn = [&](std::vector<double> values) {
+    chart.series = bars({0, 1, 2}, std::move(values));
+    return drawChartOnScreen(screen, chart).bars;
+  };
+  ASSERT_EQ(drawn({2, 0, 4}).size(), 2u);
+  EXPECT_NEAR(drawn({2, 0, 4})[1].x, 21, 1e-9) << "over its own element";
+  EXPECT_EQ(drawn({2, 1, 4}).size(), 3u) << "a value is no gap";
+}
+
 TEST(ChartDrawing, SetsBarsOfOneDaySideBySide) {
   const ChartDrawing drawing = drawChart(bars({0, 0.1, 1, 1.1, 2, 2.1}, {1, 2, 1, 2, 1, 2}), plot);
   ASSERT_EQ(drawing.bars.size(), 6u);

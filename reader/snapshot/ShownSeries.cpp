@@ -1,7 +1,8 @@
-#include "reader/sound/ShownBars.h"
+#include "reader/snapshot/ShownSeries.h"
 
 #include <algorithm>
 #include <cmath>
+#include <limits>
 
 #include "reader/snapshot/Charts.h"
 
@@ -53,8 +54,7 @@ bool areZero(const std::vector<double>& values, const std::vector<bool>& chosen)
   return true;
 }
 
-}  // namespace
-
+// One flag for each value; all false where bars and values cannot be matched.
 std::vector<bool> valuesWithoutBar(const Snapshot& snapshot, const Node& chart) {
   const std::vector<double>& values = chart.series->axes[1].values;
   const std::vector<bool> none(values.size());
@@ -71,6 +71,17 @@ std::vector<bool> valuesWithoutBar(const Snapshot& snapshot, const Node& chart) 
     if (areZero(values, missing)) return missing;
   }
   return none;
+}
+
+}  // namespace
+
+DataSeries shownSeries(const Snapshot& snapshot, const Node& chart) {
+  DataSeries series = *chart.series;
+  const std::vector<bool> gaps = valuesWithoutBar(snapshot, chart);
+  for (std::size_t i = 0; i < gaps.size(); ++i) {
+    if (gaps[i]) series.axes[1].values[i] = std::numeric_limits<double>::quiet_NaN();
+  }
+  return series;
 }
 
 }  // namespace ax::reader
