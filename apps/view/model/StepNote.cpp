@@ -3,11 +3,11 @@
 #include <algorithm>
 #include <cmath>
 
+#include "reader/snapshot/ShownSeries.h"
 #include "reader/sound/ChartNotes.h"
 
 namespace ax::view {
 
-using reader::ChartNote;
 using reader::ChartNotes;
 
 namespace {
@@ -43,24 +43,6 @@ bool areSideBySide(const std::vector<Span>& spans) {
   return !spans.empty();
 }
 
-// Values stand for what follows them, and frames are whole pixels.
-bool holds(const Span& span, double place) {
-  const double inside = place + span.width() / 4;
-  return inside >= span.from && inside < span.to;
-}
-
-std::optional<StepNote> averageIn(const Span& span, const ChartNotes& notes) {
-  double sum = 0;
-  int count = 0;
-  for (const ChartNote& note : notes.notes) {
-    if (!note.value || !holds(span, note.place)) continue;
-    sum += notes.heightOf(*note.value);
-    count += 1;
-  }
-  if (count == 0) return {};
-  return StepNote{sum / count, std::clamp(span.from + span.width() / 2, 0.0, 1.0)};
-}
-
 std::optional<StepNote> noteOfValue(const reader::DataSeries& series, const ChartNotes& notes,
                                     std::size_t at) {
   const auto& [horizontal, vertical] = series.axes;
@@ -75,15 +57,48 @@ std::optional<StepNote> noteOfValue(const reader::DataSeries& series, const Char
   return StepNote{notes.heightOf(value), std::isfinite(place) ? std::clamp(place, 0.0, 1.0) : 0.5};
 }
 
+// That of the values whose part of all bars lies in this one.
+std::optional<StepNote> averageIn(const Span& span, const Span& all, const reader::DataSeries& series,
+                                  const ChartNotes& notes) {
+  const std::size_t values = series.axes[1].values.size();
+  double heights = 0, places = 0;
+  int count = 0;
+  for (std::size_t i = 0; i < values; ++i) {
+    const double middle = std::lerp(all.from, all.to, (double(i) + 0.5) / double(values));
+    if (middle < span.from || middle >= span.to) continue;
+    const std::optional<StepNote> note = noteOfValue(series, notes, i);
+    if (!note) continue;
+    heights += note->height;
+    places += note->place;
+    count += 1;
+  }
+  if (count == 0) return {};
+  return StepNote{heights / count, places / count};
+}
+
+// The values that have a bar, by their indexes.
+std::vector<std::size_t> shownValues(const reader::DataSeries& series) {
+  const std::vector<double>& values = series.axes[1].values;
+  std::vector<std::size_t> shown;
+  for (std::size_t i = 0; i < values.size(); ++i) {
+    if (std::isfinite(values[i])) shown.push_back(i);
+  }
+  return shown;
+}
+
 }  // namespace
 
 std::optional<StepNote> noteOfStep(const ScreenModel& model, const Item& chart,
                                    const std::vector<ChartStep>& steps, std::size_t at) {
-  const reader::DataSeries& series = *chart.node.series;
-  const ChartNotes notes = reader::notesOfChart(model.snapshot(), *model.snapshot().node(chart.node.id));
+  const reader::Node& node = *model.snapshot().node(chart.node.id);
+  const reader::DataSeries series = reader::shownSeries(model.snapshot(), node);
+  const ChartNotes notes = reader::notesOfChart(model.snapshot(), node);
   if (series.axes[1].values.size() == steps.size()) return noteOfValue(series, notes, at);
+  const std::vector<std::size_t> shown = shownValues(series);
+  if (shown.size() == steps.size()) return noteOfValue(series, notes, shown[at]);
   const std::vector<Span> spans = spansOf(model, chart, steps);
-  return areSideBySide(spans) ? averageIn(spans[at], notes) : std::nullopt;
+  if (!areSideBySide(spans)) return {};
+  return averageIn(spans[at], {spans.front().from, spans.back().to}, series, notes);
 }
 
 }  // namespace ax::view
