@@ -1,5 +1,7 @@
 #include "apps/view/window/Caption.h"
 
+#include "apps/view/window/ViewStrings.h"
+
 namespace ax::view {
 
 namespace {
@@ -24,7 +26,7 @@ Caption::Caption() {
 }
 
 void Caption::show(const QString& line) {
-  setText(line);
+  setText(directed(line));
 }
 
 }  // namespace ax::view

@@ -2,6 +2,8 @@
 
 #include <QAccessible>
 
+#include "apps/view/window/ViewStrings.h"
+
 namespace ax::view {
 
 Notice::Notice() {
@@ -12,7 +14,7 @@ Notice::Notice() {
 }
 
 void Notice::announce(const QString& text) {
-  setText(text);
+  setText(directed(text));
   setAccessibleName(text);
   show();
   QAccessibleEvent event(this, QAccessible::ObjectShow);

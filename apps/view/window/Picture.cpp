@@ -1,7 +1,5 @@
 #include "apps/view/window/Picture.h"
 
-#include <QColor>
-
 #include "reader/picture/PictureStyle.h"
 #include "reader/picture/ScreenPicture.h"
 
@@ -16,8 +14,8 @@ struct DarkColour {
   std::string_view dark;
 };
 
-constexpr const char* darkInk = "#eef2f7";
-constexpr DarkColour darkColours[] = {{colours::ground, "#14181f"},  {colours::ink, darkInk},
+constexpr const char *darkInk = "#eef2f7", *darkGround = "#14181f";
+constexpr DarkColour darkColours[] = {{colours::ground, darkGround}, {colours::ink, darkInk},
                                       {colours::outline, "#8b97a7"}, {colours::fill, "#222933"},
                                       {colours::control, "#22375c"}, {colours::data, "#6fb1f5"}};
 
@@ -44,8 +42,9 @@ std::string pictureOf(const ScreenModel& model, const std::string& title, const 
   return isDark(palette) ? darkened(std::move(svg)) : svg;
 }
 
-QColor pictureInk(const QPalette& palette) {
-  return QColor(isDark(palette) ? darkInk : colours::ink);
+PictureColours pictureColours(const QPalette& palette) {
+  if (isDark(palette)) return {QColor(darkInk), QColor(darkGround)};
+  return {QColor(colours::ink), QColor(colours::ground)};
 }
 
 }  // namespace ax::view

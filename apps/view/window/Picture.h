@@ -1,5 +1,6 @@
 #pragma once
 
+#include <QColor>
 #include <QPalette>
 #include <string>
 
@@ -10,7 +11,11 @@ namespace ax::view {
 // The screen as an SVG document, in colours that go with the desktop's.
 std::string pictureOf(const ScreenModel& model, const std::string& title, const QPalette& palette);
 
-// Of texts on that picture.
-QColor pictureInk(const QPalette& palette);
+// Of what is drawn onto that picture.
+struct PictureColours {
+  QColor ink;
+  QColor ground;
+};
+PictureColours pictureColours(const QPalette& palette);
 
 }  // namespace ax::view

@@ -2,6 +2,8 @@
 
 #include <QMouseEvent>
 #include <QPainter>
+#include <QTextLayout>
+#include <algorithm>
 
 namespace ax::view {
 
@@ -12,14 +14,32 @@ constexpr double outlineWidth = 4;
 // In points of the screen.
 constexpr double typeSize = 13, roomForNumber = 28, textMargin = 3, narrowestText = 80;
 
+// A text in lines of this many pixels, the last of which tells where something is left out.
+QString brokenText(const QString& text, const QFont& type, double width, double height) {
+  const QFontMetricsF metrics(type);
+  const auto most = std::max(qsizetype(1), qsizetype(height / metrics.lineSpacing()));
+  QTextLayout layout(text, type);
+  layout.beginLayout();
+  QStringList lines;
+  for (QTextLine line = layout.createLine(); line.isValid(); line = layout.createLine()) {
+    line.setLineWidth(width);
+    const bool isLast = lines.size() + 1 == most;
+    const QString rest = text.mid(line.textStart(), isLast ? -1 : line.textLength()).trimmed();
+    lines << (isLast ? metrics.elidedText(rest, Qt::ElideRight, width) : rest);
+    if (isLast) break;
+  }
+  layout.endLayout();
+  return lines.join('\n');
+}
+
 }  // namespace
 
 ScreenCanvas::ScreenCanvas(ScreenModel& model) : model_(model) {
   setFocusPolicy(Qt::StrongFocus);
 }
 
-void ScreenCanvas::setPicture(const std::string& svg, const QColor& textColour) {
-  textColour_ = textColour;
+void ScreenCanvas::setPicture(const std::string& svg, const PictureColours& colours) {
+  colours_ = colours;
   picture_.load(QByteArray::fromStdString(svg));
   setZoom(zoom_);
 }
@@ -59,14 +79,15 @@ void ScreenCanvas::paintTexts(QPainter& painter, const QRectF& exposed) {
   QFont type = font();
   type.setPixelSize(int(typeSize * zoom_));
   painter.setFont(type);
-  painter.setPen(textColour_);
+  painter.setPen(colours_.ink);
   const double besides = roomForNumber * zoom_, rim = textMargin * zoom_;
   const bool fromTheRight = layoutDirection() == Qt::RightToLeft;
   for (const ItemId id : model_.readingOrder()) {
     const Item& item = *model_.find(id);
     QRectF room = rectOf(item.node.frame);
     if (!room.intersects(exposed) || item.node.frame.width < narrowestText) continue;
-    room.adjust(fromTheRight ? rim : besides, rim, fromTheRight ? -besides : -rim, -rim);
+    const double above = std::clamp((room.height() - painter.fontMetrics().lineSpacing()) / 2, 0.0, rim);
+    room.adjust(fromTheRight ? rim : besides, above, fromTheRight ? -besides : -rim, -above);
     painter.setClipRect(room);
     paintText(painter, room, item);
   }
@@ -75,23 +96,24 @@ void ScreenCanvas::paintTexts(QPainter& painter, const QRectF& exposed) {
 
 // Charts have their name at the top, on ground of its own, since their lines run anywhere.
 void ScreenCanvas::paintText(QPainter& painter, const QRectF& room, const Item& item) {
-  const QString text = QString::fromStdString(item.name);
+  const QString text =
+      brokenText(QString::fromStdString(item.name), painter.font(), room.width(), room.height());
   const bool isChart = item.node.series.has_value();
-  const int flags = int(Qt::AlignLeading | (isChart ? Qt::AlignTop : Qt::AlignVCenter)) | Qt::TextWordWrap;
-  if (isChart) painter.fillRect(painter.boundingRect(room, flags, text), palette().color(QPalette::Base));
+  const int flags = int(Qt::AlignLeading | (isChart ? Qt::AlignTop : Qt::AlignVCenter));
+  if (isChart) painter.fillRect(painter.boundingRect(room, flags, text), colours_.ground);
   painter.drawText(room, flags, text);
 }
 
-// What has no place of its own, such as a title, belongs to the whole. Two colours, so that one of them
-// stands out from any ground.
+// Around the element, not on its number. What has no place of its own, such as a title, belongs to the whole.
+// Two colours, so that one of them stands out from any ground.
 void ScreenCanvas::paintFocus(QPainter& painter) {
   const Item* item = model_.find(model_.focus());
   if (item == nullptr) return;
-  const double inside = outlineWidth / 2 + 2;
+  const double around = outlineWidth, inside = outlineWidth / 2 + 2;
   const bool hasPlace = !item->node.frame.isEmpty();
-  const QRectF frame =
-      hasPlace ? rectOf(item->node.frame) : QRectF(rect()).adjusted(inside, inside, -inside, -inside);
-  painter.setPen(QPen(palette().color(QPalette::Base), outlineWidth + 4));
+  const QRectF frame = hasPlace ? rectOf(item->node.frame).adjusted(-around, -around, around, around)
+                                : QRectF(rect()).adjusted(inside, inside, -inside, -inside);
+  painter.setPen(QPen(colours_.ground, outlineWidth + 4));
   painter.drawRoundedRect(frame, outlineWidth, outlineWidth);
   painter.setPen(QPen(palette().color(QPalette::Highlight), outlineWidth));
   painter.drawRoundedRect(frame, outlineWidth, outlineWidth);

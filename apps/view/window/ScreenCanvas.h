@@ -5,6 +5,7 @@
 #include <functional>
 
 #include "apps/view/model/ScreenModel.h"
+#include "apps/view/window/Picture.h"
 
 namespace ax::view {
 
@@ -14,7 +15,7 @@ class ScreenCanvas : public QWidget {
   explicit ScreenCanvas(ScreenModel& model);
 
   // The SVG document to show. Its view box tells the part of the screen that it shows, in points.
-  void setPicture(const std::string& svg, const QColor& textColour);
+  void setPicture(const std::string& svg, const PictureColours& colours);
   // Pixels for one point.
   void setZoom(double zoom);
   double zoom() const { return zoom_; }
@@ -41,7 +42,7 @@ class ScreenCanvas : public QWidget {
 
   ScreenModel& model_;
   QSvgRenderer picture_;
-  QColor textColour_;
+  PictureColours colours_;
   double zoom_ = 1;
 };
 

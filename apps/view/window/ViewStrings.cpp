@@ -1,5 +1,7 @@
 #include "apps/view/window/ViewStrings.h"
 
+#include <QGuiApplication>
+
 #include "platform/formatting/StringTable.h"
 
 namespace ax::view {
@@ -24,6 +26,11 @@ QString viewText(std::string_view key, std::initializer_list<formatting::Message
   const std::string* pattern = find(key);
   return pattern == nullptr ? QString()
                             : QString::fromStdString(formatting::formatMessage(*pattern, arguments));
+}
+
+QString directed(const QString& text) {
+  constexpr QChar leftToRight(0x200e), rightToLeft(0x200f);
+  return (QGuiApplication::isRightToLeft() ? rightToLeft : leftToRight) + text;
 }
 
 }  // namespace ax::view

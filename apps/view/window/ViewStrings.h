@@ -13,4 +13,7 @@ namespace ax::view {
 QString viewText(std::string_view key);
 QString viewText(std::string_view key, std::initializer_list<formatting::MessageArgument> arguments);
 
+// A text that is shown in the direction of the language, whatever script it begins with.
+QString directed(const QString& text);
+
 }  // namespace ax::view

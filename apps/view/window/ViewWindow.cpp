@@ -74,7 +74,7 @@ ViewWindow::ViewWindow(app::Presentation& presentation, Voice voice)
   resize((canvas_->size() + QSize(beside, beneath)).boundedTo(room).expandedTo({leastWidth, 0}));
   showFocus();
   // Once the window is there.
-  QTimer::singleShot(0, this, [this] { say(caption_->text().toStdString()); });
+  QTimer::singleShot(0, this, [this] { notify({say(focusedLine())}); });
 }
 
 void ViewWindow::layOut() {
@@ -113,7 +113,13 @@ void ViewWindow::listen() {
 }
 
 void ViewWindow::draw() {
-  canvas_->setPicture(pictureOf(model_, presentation_.run().title(), palette()), pictureInk(palette()));
+  canvas_->setPicture(pictureOf(model_, presentation_.run().title(), palette()), pictureColours(palette()));
+}
+
+// The desktop goes from light to dark at nightfall.
+void ViewWindow::changeEvent(QEvent* event) {
+  QMainWindow::changeEvent(event);
+  if (event->type() == QEvent::PaletteChange) draw();
 }
 
 void ViewWindow::focusOn(ItemId item) {
@@ -122,13 +128,16 @@ void ViewWindow::focusOn(ItemId item) {
   notice_->clearAway();
   showFocus();
   tree_.tellFocus();
-  say(caption_->text().toStdString());
+  notify({say(focusedLine())});
+}
+
+std::string ViewWindow::focusedLine() const {
+  return focused() == nullptr ? reader::readerText("screen.empty") : focused()->line;
 }
 
 void ViewWindow::showFocus() {
   const Item* item = focused();
-  const std::string line = item == nullptr ? reader::readerText("screen.empty") : item->line;
-  caption_->show(QString::fromStdString(line));
+  caption_->show(QString::fromStdString(focusedLine()));
   canvas_->update();
   if (item != nullptr) {
     const QRect frame = canvas_->rectOf(item->node.frame).toRect();
@@ -140,20 +149,26 @@ void ViewWindow::showFocus() {
 void ViewWindow::announce(const std::vector<std::string>& lines) {
   if (lines.empty()) return;
   const std::string all = reader::joined(lines);
-  notice_->announce(QString::fromStdString(all));
-  say(all);
+  notify({all, say(all)});
 }
 
-void ViewWindow::say(const std::string& line) {
-  if (voice_ == Voice::none) return;
-  if (const auto spoken = reader::spokenSound(line, formatting::currentRegion().locale)) play(*spoken);
+void ViewWindow::notify(const std::vector<std::string>& lines) {
+  const std::string all = reader::joined(lines);
+  if (!all.empty()) notice_->announce(QString::fromStdString(all));
 }
 
-void ViewWindow::play(const reader::Sound& sound) {
-  if (loudspeaker_.play(sound) || hasToldOfSilence_) return;
+std::string ViewWindow::say(const std::string& line) {
+  if (voice_ == Voice::none) return "";
+  const auto spoken = reader::spokenSound(line, formatting::currentRegion().locale);
+  return spoken ? play(*spoken) : "";
+}
+
+std::string ViewWindow::play(const reader::Sound& sound) {
+  if (loudspeaker_.play(sound) || hasToldOfSilence_) return "";
   hasToldOfSilence_ = true;
-  std::cerr << "axvelto-view: " << viewText("no.sound").toStdString() << '\n';
-  notice_->announce(viewText("no.sound"));
+  std::string told = viewText("no.sound").toStdString();
+  std::cerr << "axvelto-view: " << told << '\n';
+  return told;
 }
 
 void ViewWindow::follow(const Effect& effect) {
@@ -216,13 +231,12 @@ void ViewWindow::stepInChart(int direction) {
     notice_->clearAway();
     showFocus();
     tree_.tellFocus();
-  } else {
-    notice_->announce(QString::fromStdString(step->line));
   }
-  soundStep(element != nullptr ? element->line : step->line);
+  const std::string silence = soundStep(element != nullptr ? element->line : step->line);
+  notify({element != nullptr ? std::string() : step->line, silence});
 }
 
-void ViewWindow::soundStep(const std::string& line) {
+std::string ViewWindow::soundStep(const std::string& line) {
   reader::Sound sound;
   const Item* chart = model_.find(tour_.chart());
   if (const std::optional<StepNote> note = noteOfStep(model_, *chart, tour_.steps(), tour_.at())) {
@@ -231,7 +245,7 @@ void ViewWindow::soundStep(const std::string& line) {
   if (voice_ == Voice::own) {
     if (const auto spoken = reader::spokenSound(line, formatting::currentRegion().locale)) sound.add(*spoken);
   }
-  play(sound);
+  return play(sound);
 }
 
 // A screen reader would talk into an introduction.
@@ -241,7 +255,7 @@ void ViewWindow::playChart() {
   const reader::Node& chart = *model_.snapshot().node(item->node.id);
   const reader::Sound notes = reader::notesSound(model_.snapshot(), chart);
   if (notes.pairs() == 0) return announce({reader::readerText("chart.no.data")});
-  play(voice_ == Voice::own ? reader::chartSound(model_.snapshot(), chart) : notes);
+  notify({play(voice_ == Voice::own ? reader::chartSound(model_.snapshot(), chart) : notes)});
 }
 
 void ViewWindow::askSlice(int slice) {

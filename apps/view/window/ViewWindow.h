@@ -38,6 +38,9 @@ class ViewWindow : public QMainWindow {
   void showKeys();
   void leave();
 
+ protected:
+  void changeEvent(QEvent* event) override;
+
  private:
   void layOut();
   void fillMenus();
@@ -46,12 +49,16 @@ class ViewWindow : public QMainWindow {
   void focusOn(ItemId item);
   void showFocus();
   void follow(const Effect& effect);
-  void say(const std::string& line);
-  void play(const reader::Sound& sound);
-  void soundStep(const std::string& line);
+  // Answer what is to be told of it: once, that no device takes a sound; else nothing.
+  std::string say(const std::string& line);
+  std::string play(const reader::Sound& sound);
+  std::string soundStep(const std::string& line);
+  // One notice in place of the last.
+  void notify(const std::vector<std::string>& lines);
   void announce(const std::vector<std::string>& lines);
   void announce(const QString& line) { announce(std::vector<std::string>{line.toStdString()}); }
   const Item* focused() const { return model_.find(model_.focus()); }
+  std::string focusedLine() const;
 
   app::Presentation& presentation_;
   const Voice voice_;
