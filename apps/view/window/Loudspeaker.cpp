@@ -1,6 +1,5 @@
 #include "apps/view/window/Loudspeaker.h"
 
-#include <QAudioDevice>
 #include <QMediaDevices>
 #include <algorithm>
 #include <cmath>
@@ -37,17 +36,14 @@ Loudspeaker::~Loudspeaker() {
 }
 
 bool Loudspeaker::open() {
-  if (isOpened_) return sink_ != nullptr;
+  if (!isOpened_) device_ = QMediaDevices::defaultAudioOutput();
   isOpened_ = true;
-  const QAudioDevice device = QMediaDevices::defaultAudioOutput();
-  if (!device.isNull() && device.isFormatSupported(soundFormat())) {
-    sink_ = std::make_unique<QAudioSink>(device, soundFormat());
-  }
-  return sink_ != nullptr;
+  return !device_.isNull() && device_.isFormatSupported(soundFormat());
 }
 
 void Loudspeaker::stop() {
   if (sink_) sink_->reset();
+  sink_.reset();
   buffer_.close();
 }
 
@@ -57,6 +53,8 @@ bool Loudspeaker::play(const reader::Sound& sound) {
   if (sound.pairs() == 0) return true;
   buffer_.setData(bytesOf(sound));
   buffer_.open(QIODevice::ReadOnly);
+  // A sink that is started again and again falls silent on some desktops.
+  sink_ = std::make_unique<QAudioSink>(device_, soundFormat());
   sink_->start(&buffer_);
   return sink_->error() == QAudio::NoError;
 }

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <QAudioDevice>
 #include <QAudioSink>
 #include <QBuffer>
 #include <memory>
@@ -22,7 +23,8 @@ class Loudspeaker {
   void stop();
 
   bool isOpened_ = false;  // or tried to
-  std::unique_ptr<QAudioSink> sink_;
+  QAudioDevice device_;
+  std::unique_ptr<QAudioSink> sink_;  // while something sounds
   QBuffer buffer_;
 };
 
