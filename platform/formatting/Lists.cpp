@@ -1,5 +1,7 @@
 #include "platform/formatting/Lists.h"
 
+#include <vector>
+
 #include "platform/formatting/MessagePattern.h"
 #include "platform/formatting/PlatformWords.h"
 #include "platform/formatting/Region.h"
