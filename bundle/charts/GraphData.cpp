@@ -10,7 +10,7 @@ void refreshGraphData(Object& chart, const GraphSource& source) {
   Ref<Array> points = safeArrayForKey(chart, source.member);
   const bool isUsable = points && !points->isEmpty() && points->firstObject()->isKindOf(source.expected);
   chart._accessibilitySetRetainedValueForKey(isUsable ? points : nullptr, source.graphKey);
-  chart._accessibilitySetRetainedValueForKey(nullptr, StorageKeyChildren);
+  chart._accessibilitySetRetainedValueForKey(nullptr, StorageKeyChildren.get());
 }
 
 Ref<AccessibilityElement> chartElement(Object& chart, Rect frame, Ref<String> label, Ref<String> value) {

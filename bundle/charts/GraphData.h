@@ -10,7 +10,7 @@ namespace ax {
 
 namespace messages {
 // The chart's copy of the host's list; nil before the first refresh and when the host has no points.
-inline const Message<Ref<Array>()> _accessibilityGraphData{"_accessibilityGraphData"};
+inline constinit const Message<Ref<Array>()> _accessibilityGraphData{"_accessibilityGraphData"};
 }  // namespace messages
 
 // Where a chart's points come from and under which name it keeps them.
@@ -29,12 +29,12 @@ void refreshGraphData(Object& chart, const GraphSource& source);
 // empty is an answer too and is not made again.
 template <class Fill>
 Ref<Array> chartElements(Object& chart, Fill&& fill) {
-  if (const Ref<Object> cached = chart._accessibilityValueForKey(StorageKeyChildren))
+  if (const Ref<Object> cached = chart._accessibilityValueForKey(StorageKeyChildren.get()))
     return cast<Array>(cached);
   const Ref<MutableArray> elements = make<MutableArray>();
-  chart._accessibilitySetRetainedValueForKey(elements, StorageKeyChildren);
+  chart._accessibilitySetRetainedValueForKey(elements, StorageKeyChildren.get());
   std::forward<Fill>(fill)(*elements);
-  chart._accessibilitySetRetainedValueForKey(elements, StorageKeyChildren);
+  chart._accessibilitySetRetainedValueForKey(elements, StorageKeyChildren.get());
   return elements;
 }
 

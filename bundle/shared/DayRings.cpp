@@ -9,9 +9,10 @@ using namespace ax;
 
 namespace {
 
-const Message<Ref<Object>(std::int64_t)> activitySummaryForCacheIndex{"activitySummaryForCacheIndex:"};
-const SafeMessage<double()> activeEnergyCompletionPercentage{"_activeEnergyCompletionPercentage"};
-const SafeMessage<double()> standHoursCompletionPercentage{"_standHoursCompletionPercentage"};
+constinit const Message<Ref<Object>(std::int64_t)> activitySummaryForCacheIndex{
+    "activitySummaryForCacheIndex:"};
+constinit const SafeMessage<double()> activeEnergyCompletionPercentage{"_activeEnergyCompletionPercentage"};
+constinit const SafeMessage<double()> standHoursCompletionPercentage{"_standHoursCompletionPercentage"};
 
 const Ref<Calendar>& gregorianCalendar() {
   static const auto& calendar =

@@ -9,9 +9,9 @@ namespace ax {
 
 namespace {
 
-const SafeMessage<void(Ref<String>)> setName{"setName:"};
-const SafeMessage<void(bool)> setWheelchairUser{"setWheelchairUser:"};
-const SafeMessage<Ref<String>(Ref<Object>)> titleForAchievement{"titleForAchievement:"};
+constinit const SafeMessage<void(Ref<String>)> setName{"setName:"};
+constinit const SafeMessage<void(bool)> setWheelchairUser{"setWheelchairUser:"};
+constinit const SafeMessage<Ref<String>(Ref<Object>)> titleForAchievement{"titleForAchievement:"};
 
 Ref<Object> makeAchievementLocalizationProvider() {
   const Class* providerClass = safeClassFromString("ODUIAchievementLocalizationProvider"_key);

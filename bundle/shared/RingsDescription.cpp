@@ -10,16 +10,18 @@
 namespace ax {
 
 namespace messages {
-const Message<Ref<String>()> _accessibilityRingsDescription{"_accessibilityRingsDescription"};
-const Message<void(Ref<String>)> _accessibilitySetRingsDescription{"_accessibilitySetRingsDescription:"};
-const Message<Ref<String>(double, double, double, bool)> _veltoUIAccessibilityDescriptionForPercentages{
-    "_veltoUIAccessibilityDescriptionForPercentages:exercisingPercentage:standingPercentage:"
-    "arePercentagesCapped:"};
+constinit const Message<Ref<String>()> _accessibilityRingsDescription{"_accessibilityRingsDescription"};
+constinit const Message<void(Ref<String>)> _accessibilitySetRingsDescription{
+    "_accessibilitySetRingsDescription:"};
+constinit const Message<Ref<String>(double, double, double, bool)>
+    _veltoUIAccessibilityDescriptionForPercentages{
+        "_veltoUIAccessibilityDescriptionForPercentages:exercisingPercentage:standingPercentage:"
+        "arePercentagesCapped:"};
 }  // namespace messages
 
 namespace {
 
-const Message<Ref<String>(double, double, double, bool)> hostDescription{
+constinit const Message<Ref<String>(double, double, double, bool)> hostDescription{
     "accessibilityDescriptionForPercentages:exercisingPercentage:standingPercentage:arePercentagesCapped:"};
 
 const char ringsDescriptionKey = 0;

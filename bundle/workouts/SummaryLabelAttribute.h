@@ -7,7 +7,8 @@
 // attribute, nil for none, and puts it on its total and its average.
 namespace ax::messages {
 
-inline const Message<Ref<String>()> _accessibilityLabelAttribute{"_accessibilityLabelAttribute"};
-inline const Message<void(Ref<String>)> _accessibilitySetLabelAttribute{"_accessibilitySetLabelAttribute:"};
+inline constinit const Message<Ref<String>()> _accessibilityLabelAttribute{"_accessibilityLabelAttribute"};
+inline constinit const Message<void(Ref<String>)> _accessibilitySetLabelAttribute{
+    "_accessibilitySetLabelAttribute:"};
 
 }  // namespace ax::messages

@@ -9,8 +9,8 @@ namespace ax {
 
 namespace {
 
-const Message<Ref<Array>()> accessibilityBundles{"accessibilityBundles"};
-const Message<void()> accessibilityInitializeBundle{"accessibilityInitializeBundle"};
+constinit const Message<Ref<Array>()> accessibilityBundles{"accessibilityBundles"};
+constinit const Message<void()> accessibilityInitializeBundle{"accessibilityInitializeBundle"};
 
 // The modules that have been opened; they stay open.
 std::vector<void*>& openModules() {

@@ -4,7 +4,7 @@
 
 namespace ax {
 
-const Message<Ref<String>()> messages::countedPattern{"countedPattern"};
+constinit const Message<Ref<String>()> messages::countedPattern{"countedPattern"};
 
 Class& UnitName::staticClass() {
   static Class& result = ClassBuilder<UnitName>("UnitName", String::staticClass())

@@ -75,7 +75,7 @@ class Message;
 
 // A typed selector, declared once and used for sending, for registering and for calling super:
 //
-//   inline const Message<Ref<String>()> accessibilityLabel{"accessibilityLabel"};
+//   inline constinit const Message<Ref<String>()> accessibilityLabel{"accessibilityLabel"};
 //   Ref<String> label = accessibilityLabel(view);
 //
 // Sent to nil, to an object whose class lacks the message, or to one that registered it with another type,

@@ -6,7 +6,7 @@
 namespace ax {
 
 // Under this name a view keeps the elements that were built for it.
-inline const Key StorageKeyChildren = Selector::intern("StorageKeyChildren");
+inline constinit const LiteralSelector StorageKeyChildren{"StorageKeyChildren"};
 
 // A free-standing element that stands for a part of a view: a bar of a chart, a day, a summary. The
 // container that lists it owns it; the element knows its container weakly.

@@ -14,35 +14,36 @@ namespace ax::messages {
 // The accessibilityContainerType of a chart that is a data series.
 inline constexpr std::int64_t dataSeriesContainerType = 13;
 
-inline const Message<bool()> _accessibilityDataSeriesSupportsSummarization{
+inline constinit const Message<bool()> _accessibilityDataSeriesSupportsSummarization{
     "_accessibilityDataSeriesSupportsSummarization"};
-inline const Message<bool()> _accessibilityDataSeriesSupportsSonification{
+inline constinit const Message<bool()> _accessibilityDataSeriesSupportsSonification{
     "_accessibilityDataSeriesSupportsSonification"};
-inline const Message<std::int64_t()> _accessibilityDataSeriesType{"_accessibilityDataSeriesType"};
-inline const Message<Ref<String>()> _accessibilityDataSeriesName{"_accessibilityDataSeriesName"};
+inline constinit const Message<std::int64_t()> _accessibilityDataSeriesType{"_accessibilityDataSeriesType"};
+inline constinit const Message<Ref<String>()> _accessibilityDataSeriesName{"_accessibilityDataSeriesName"};
 // Numbers, one per point, in the points' order.
-inline const Message<Ref<Array>(std::int64_t)> _accessibilityDataSeriesValuesForAxis{
+inline constinit const Message<Ref<Array>(std::int64_t)> _accessibilityDataSeriesValuesForAxis{
     "_accessibilityDataSeriesValuesForAxis:"};
-inline const Message<Ref<String>(std::int64_t)> _accessibilityDataSeriesTitleForAxis{
+inline constinit const Message<Ref<String>(std::int64_t)> _accessibilityDataSeriesTitleForAxis{
     "_accessibilityDataSeriesTitleForAxis:"};
-inline const Message<Ref<String>(std::int64_t)> _accessibilityDataSeriesUnitLabelForAxis{
+inline constinit const Message<Ref<String>(std::int64_t)> _accessibilityDataSeriesUnitLabelForAxis{
     "_accessibilityDataSeriesUnitLabelForAxis:"};
-inline const Message<Ref<Number>(std::int64_t)> _accessibilityDataSeriesMinimumValueForAxis{
+inline constinit const Message<Ref<Number>(std::int64_t)> _accessibilityDataSeriesMinimumValueForAxis{
     "_accessibilityDataSeriesMinimumValueForAxis:"};
-inline const Message<Ref<Number>(std::int64_t)> _accessibilityDataSeriesMaximumValueForAxis{
+inline constinit const Message<Ref<Number>(std::int64_t)> _accessibilityDataSeriesMaximumValueForAxis{
     "_accessibilityDataSeriesMaximumValueForAxis:"};
 // The position runs from 0, the start of the axis, to 1, its end.
-inline const Message<Ref<String>(double, std::int64_t)>
+inline constinit const Message<Ref<String>(double, std::int64_t)>
     _accessibilityDataSeriesValueDescriptionForPositionAxis{
         "_accessibilityDataSeriesValueDescriptionForPosition:axis:"};
 
-inline const Message<bool()> _accessibilityShouldUseSlices{"_accessibilityShouldUseSlices"};
-inline const Message<std::uint64_t()> _accessibilityNumberOfSlices{"_accessibilityNumberOfSlices"};
+inline constinit const Message<bool()> _accessibilityShouldUseSlices{"_accessibilityShouldUseSlices"};
+inline constinit const Message<std::uint64_t()> _accessibilityNumberOfSlices{"_accessibilityNumberOfSlices"};
 // In seconds.
-inline const Message<double()> _accessibilityTimeIntervalPerSlice{"_accessibilityTimeIntervalPerSlice"};
-inline const Message<std::uint64_t()> _accessibilityHoursPerSlice{"_accessibilityHoursPerSlice"};
+inline constinit const Message<double()> _accessibilityTimeIntervalPerSlice{
+    "_accessibilityTimeIntervalPerSlice"};
+inline constinit const Message<std::uint64_t()> _accessibilityHoursPerSlice{"_accessibilityHoursPerSlice"};
 // The spoken quantity of the slice with that index, counted from 0.
-inline const Message<Ref<String>(std::uint64_t)> _accessibilityQuantityForSliceAtIndex{
+inline constinit const Message<Ref<String>(std::uint64_t)> _accessibilityQuantityForSliceAtIndex{
     "_accessibilityQuantityForSliceAtIndex:"};
 
 }  // namespace ax::messages

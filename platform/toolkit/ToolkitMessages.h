@@ -21,35 +21,35 @@ class View;
 // Include the class's own header where the answer is used.
 namespace ax::messages {
 
-inline const SafeMessage<Rect()> frame{"frame"};
-inline const SafeMessage<Rect()> bounds{"bounds"};
-inline const SafeMessage<Point()> center{"center"};
-inline const SafeMessage<bool()> isHidden{"isHidden"};
-inline const SafeMessage<Ref<Array>()> subviews{"subviews"};
-inline const SafeMessage<Ref<Layer>()> layer{"layer"};
-inline const SafeMessage<Ref<Array>()> sublayers{"sublayers"};
-inline const SafeMessage<double()> opacity{"opacity"};
-inline const SafeMessage<Ref<String>()> text{"text"};
-inline const SafeMessage<Ref<String>()> title{"title"};
-inline const SafeMessage<Ref<String>()> string{"string"};
-inline const SafeMessage<Ref<Image>()> image{"image"};
-inline const SafeMessage<Ref<View>()> contentView{"contentView"};
-inline const SafeMessage<Ref<Label>()> textLabel{"textLabel"};
-inline const SafeMessage<Ref<ImageView>()> imageView{"imageView"};
-inline const SafeMessage<Ref<View>()> view{"view"};
-inline const SafeMessage<Ref<NavigationItem>()> navigationItem{"navigationItem"};
-inline const SafeMessage<Ref<Array>()> rightBarButtonItems{"rightBarButtonItems"};
-inline const SafeMessage<Selector()> action{"action"};
-inline const SafeMessage<std::int64_t()> currentPage{"currentPage"};
-inline const SafeMessage<void(std::int64_t)> setCurrentPage{"setCurrentPage:"};
-inline const SafeMessage<Point()> contentOffset{"contentOffset"};
-inline const SafeMessage<void(Point)> setContentOffset{"setContentOffset:"};
-inline const SafeMessage<void(Rect)> setAccessibilityFrameInContainerSpace{
+inline constinit const SafeMessage<Rect()> frame{"frame"};
+inline constinit const SafeMessage<Rect()> bounds{"bounds"};
+inline constinit const SafeMessage<Point()> center{"center"};
+inline constinit const SafeMessage<bool()> isHidden{"isHidden"};
+inline constinit const SafeMessage<Ref<Array>()> subviews{"subviews"};
+inline constinit const SafeMessage<Ref<Layer>()> layer{"layer"};
+inline constinit const SafeMessage<Ref<Array>()> sublayers{"sublayers"};
+inline constinit const SafeMessage<double()> opacity{"opacity"};
+inline constinit const SafeMessage<Ref<String>()> text{"text"};
+inline constinit const SafeMessage<Ref<String>()> title{"title"};
+inline constinit const SafeMessage<Ref<String>()> string{"string"};
+inline constinit const SafeMessage<Ref<Image>()> image{"image"};
+inline constinit const SafeMessage<Ref<View>()> contentView{"contentView"};
+inline constinit const SafeMessage<Ref<Label>()> textLabel{"textLabel"};
+inline constinit const SafeMessage<Ref<ImageView>()> imageView{"imageView"};
+inline constinit const SafeMessage<Ref<View>()> view{"view"};
+inline constinit const SafeMessage<Ref<NavigationItem>()> navigationItem{"navigationItem"};
+inline constinit const SafeMessage<Ref<Array>()> rightBarButtonItems{"rightBarButtonItems"};
+inline constinit const SafeMessage<Selector()> action{"action"};
+inline constinit const SafeMessage<std::int64_t()> currentPage{"currentPage"};
+inline constinit const SafeMessage<void(std::int64_t)> setCurrentPage{"setCurrentPage:"};
+inline constinit const SafeMessage<Point()> contentOffset{"contentOffset"};
+inline constinit const SafeMessage<void(Point)> setContentOffset{"setContentOffset:"};
+inline constinit const SafeMessage<void(Rect)> setAccessibilityFrameInContainerSpace{
     "setAccessibilityFrameInContainerSpace:"};
 
-inline const SafeMessage<Ref<String>()> unitString{"unitString"};
+inline constinit const SafeMessage<Ref<String>()> unitString{"unitString"};
 // Of a quantity.
-inline const SafeMessage<double(Ref<Unit>)> doubleValueForUnit{"doubleValueForUnit:"};
-inline const SafeMessage<bool(Ref<Unit>)> isCompatibleWithUnit{"isCompatibleWithUnit:"};
+inline constinit const SafeMessage<double(Ref<Unit>)> doubleValueForUnit{"doubleValueForUnit:"};
+inline constinit const SafeMessage<bool(Ref<Unit>)> isCompatibleWithUnit{"isCompatibleWithUnit:"};
 
 }  // namespace ax::messages

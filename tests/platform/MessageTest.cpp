@@ -91,8 +91,8 @@ TEST(Message, letsThroughWhatMethodsRaise) {
 
 // Nobody has sent these before, and their receivers live on the threads that send.
 TEST(Message, findsItsSelectorOnTheThreadThatSendsFirst) {
-  static constinit const Message<std::int64_t(std::int64_t)> first{"MessageTestAdd:"};
-  static constinit const Message<Ref<String>()> unanswered{"MessageTestNeverRegistered"};
+  static const Message<std::int64_t(std::int64_t)> first{"MessageTestAdd:"};
+  static const Message<Ref<String>()> unanswered{"MessageTestNeverRegistered"};
   Adder::staticClass();
   std::atomic<int> ready = 0;
   std::atomic<int> wrong = 0;
