@@ -39,36 +39,36 @@ class Cell : public View {
 };
 
 template <int N>
-class CellAccessibility : public SafeCategory<CellAccessibility<N>> {
+class CellAccessibility : public SafeCategory {
  public:
-  using SafeCategory<CellAccessibility>::SafeCategory;
-  static std::string name() { return Cell<N>::name() + "Accessibility"; }
-  static void _accessibilityPerformValidations(ValidationManager& manager) {
-    const std::string target = Cell<N>::name();
-    manager.validateClassIsKindOfClass(target, "View");
-    manager.validateClassHasInstanceVariableWithType(target, "_titleLabel", "Label");
-    manager.validateClassHasInstanceVariableWithType(target, "_valueLabel", "Label");
-    manager.validateClassHasInstanceVariableWithType(target, "_isCurrent", "B");
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "reloadWithTitle:", {"v", "@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "completionFraction", {"d"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.isKindOf("View");
+    contract.instanceVariable("_titleLabel", "Label");
+    contract.instanceVariable("_valueLabel", "Label");
+    contract.instanceVariable("_isCurrent", "B");
+    contract.instanceMethod("reloadWithTitle:", {"v", "@"});
+    contract.instanceMethod("completionFraction", {"d"});
   }
   bool isAccessibilityElement() { return true; }
-  Ref<String> accessibilityLabel() { return this->super(messages::accessibilityLabel); }
-  Ref<String> accessibilityValue() { return this->super(messages::accessibilityValue); }
-  Traits accessibilityTraits() { return this->super(messages::accessibilityTraits) | TraitButton; }
-  void layoutSubviews() { this->super(messages::layoutSubviews); }
+  Ref<String> accessibilityLabel() { return super(messages::accessibilityLabel); }
+  Ref<String> accessibilityValue() { return super(messages::accessibilityValue); }
+  Traits accessibilityTraits() { return super(messages::accessibilityTraits) | TraitButton; }
+  void layoutSubviews() { super(messages::layoutSubviews); }
 };
 
 template <int N>
 void registerOne() {
   using C = CellAccessibility<N>;
   Cell<N>::staticClass();
-  const std::array all = {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-                          overrides<&C::accessibilityLabel>(messages::accessibilityLabel),
-                          overrides<&C::accessibilityValue>(messages::accessibilityValue),
-                          overrides<&C::accessibilityTraits>(messages::accessibilityTraits),
-                          overrides<&C::layoutSubviews>(messages::layoutSubviews)};
-  registerCategory(C::name(), Cell<N>::name(), &C::_accessibilityPerformValidations, all);
+  static constexpr std::array all = {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
+                                     overrides<&C::accessibilityLabel>(messages::accessibilityLabel),
+                                     overrides<&C::accessibilityValue>(messages::accessibilityValue),
+                                     overrides<&C::accessibilityTraits>(messages::accessibilityTraits),
+                                     overrides<&C::layoutSubviews>(messages::layoutSubviews)};
+  static const std::string target = Cell<N>::name();
+  static const std::string name = target + "Accessibility";
+  static const CategoryRecord record{name, target, "Bench", &C::_accessibilityPerformValidations, all};
+  registerCategory(record);
 }
 
 template <int... N>

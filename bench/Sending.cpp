@@ -1,3 +1,5 @@
+#include <array>
+
 #include "bench/Sides.h"
 #include "platform/accessibility/CategoryRegistration.h"
 #include "platform/runtime/ClassBuilder.h"
@@ -40,14 +42,12 @@ class Overridden : public Sent {
   }
 };
 
-class Overriding : public SafeCategory<Overriding> {
+class Overriding : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-  static void _accessibilityPerformValidations(ValidationManager&) {}
   std::int64_t advance(std::int64_t by) { return super(::advance, by); }
 };
-const CategoryRegistration<Overriding> registration{
-    "BenchOverriding", "Bench.Overridden", {overrides<&Overriding::advance>(advance)}};
+constexpr std::array rows = {overrides<&Overriding::advance>(advance)};
+constexpr CategoryRecord record{"BenchOverriding", "Bench.Overridden", "Bench", nullptr, rows};
 
 auto sendNothing() {
   return [object = std::make_shared<Plain>()] {
@@ -82,7 +82,8 @@ auto send() {
 }
 
 auto sendToOverride() {
-  graftCategory(*registration.category, Overridden::staticClass());
+  static Class& category = registerCategory(record);
+  graftCategory(category, Overridden::staticClass());
   return send<Overridden>();
 }
 

@@ -6,14 +6,10 @@ namespace ax {
 namespace {
 
 // One badge of the grid, named by the title of its achievement.
-class CHAchievementCollectionViewCellAccessibility
-    : public SafeCategory<CHAchievementCollectionViewCellAccessibility> {
+class CHAchievementCollectionViewCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    manager.validateClassHasInstanceMethodWithFullSignature("CHAchievementCollectionViewCell", "achievement",
-                                                            {"@"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceMethod("achievement", {"@"});
   }
 
   bool isAccessibilityElement() { return true; }
@@ -22,14 +18,8 @@ class CHAchievementCollectionViewCellAccessibility
   }
 };
 
-using C = CHAchievementCollectionViewCellAccessibility;
-
-const CategoryRegistration<C> registration{
-    "CHAchievementCollectionViewCellAccessibility",
-    "CHAchievementCollectionViewCell",
-    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-     overrides<&C::accessibilityLabel>(messages::accessibilityLabel)}};
-
 }  // namespace
+
+AX_CATEGORY(CHAchievementCollectionViewCellAccessibility, "CHAchievementCollectionViewCell")
 
 }  // namespace ax

@@ -11,23 +11,16 @@ constexpr std::string_view initializer =
     "initWithPresentingViewController:detailViewController:shouldPlayFlipInAnimation:initialBadgeFrame:"
     "conversionView:presentAlongsideBlock:dismissAlongsideBlock:completionBlock:";
 
-const Message<Ref<Object>(Ref<Object>, Ref<Object>, bool, Rect, Ref<Object>, Block, Block, Block)>
+constinit const Message<Ref<Object>(Ref<Object>, Ref<Object>, bool, Rect, Ref<Object>, Block, Block, Block)>
     initWithDetail{initializer};
 
 // The flip to the screen of an achievement: from then on the badge is spoken through its container alone.
-class CHAchievementDetailTransitionAnimatorAccessibility
-    : public SafeCategory<CHAchievementDetailTransitionAnimatorAccessibility> {
+class CHAchievementDetailTransitionAnimatorAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "CHAchievementDetailTransitionAnimator";
-    manager.validateClassHasInstanceMethodWithFullSignature(
-        target, initializer, {"@", "@", "@", "B", rectEncoding, "@", "@?", "@?", "@?"});
-    manager.validateClassHasInstanceVariableWithType(target, "_detailViewController",
-                                                     "CHAchievementDetailViewController");
-    manager.validateClassHasInstanceVariableWithType("CHAchievementDetailViewController", "_badgeView",
-                                                     "ODUIBadgeView");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceMethod(initializer, {"@", "@", "@", "B", rectEncoding, "@", "@?", "@?", "@?"});
+    contract.instanceVariable("_detailViewController", "CHAchievementDetailViewController");
+    contract.of("CHAchievementDetailViewController").instanceVariable("_badgeView", "ODUIBadgeView");
   }
 
   Ref<Object> init(Ref<Object> presenting, Ref<Object> detail, bool shouldPlayFlipInAnimation,
@@ -47,14 +40,9 @@ class CHAchievementDetailTransitionAnimatorAccessibility
   }
 };
 
-using C = CHAchievementDetailTransitionAnimatorAccessibility;
-
-const CategoryRegistration<C> registration{
-    "CHAchievementDetailTransitionAnimatorAccessibility",
-    "CHAchievementDetailTransitionAnimator",
-    {overrides<&C::init>(initWithDetail), overrides<&C::_accessibilityLoadAccessibilityInformation>(
-                                              messages::_accessibilityLoadAccessibilityInformation)}};
-
 }  // namespace
+
+AX_CATEGORY(CHAchievementDetailTransitionAnimatorAccessibility, "CHAchievementDetailTransitionAnimator",
+            overrides<&C::init>(initWithDetail))
 
 }  // namespace ax

@@ -7,25 +7,19 @@ namespace ax {
 
 namespace {
 
-const Message<void()> axAnnotateAchievementView{"_axAnnotateAchievementView"};
-const Message<Ref<Object>(Ref<Object>)> titleForAchievement{"titleForAchievement:"};
+constinit const Message<void()> axAnnotateAchievementView{"_axAnnotateAchievementView"};
+constinit const Message<Ref<Object>(Ref<Object>)> titleForAchievement{"titleForAchievement:"};
 
 // The screen of one achievement: the container of the badge speaks for it, and the text speaks all its lines.
-class CHAchievementDetailViewControllerAccessibility
-    : public SafeCategory<CHAchievementDetailViewControllerAccessibility> {
+class CHAchievementDetailViewControllerAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "CHAchievementDetailViewController";
-    manager.validateClassHasInstanceVariableWithType(target, "_achievement", "ACHAchievement");
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "label", {"@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "badgeContainer", {"@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "viewDidLoad", {"v"});
-    manager.validateClassHasInstanceVariableWithType(target, "_locProvider",
-                                                     "ODUIAchievementLocalizationProvider");
-    manager.validateClassHasInstanceMethodWithFullSignature("ODUIAchievementLocalizationProvider",
-                                                            "titleForAchievement:", {"@", "@"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceVariable("_achievement", "ACHAchievement");
+    contract.instanceMethod("label", {"@"});
+    contract.instanceMethod("badgeContainer", {"@"});
+    contract.instanceMethod("viewDidLoad", {"v"});
+    contract.instanceVariable("_locProvider", "ODUIAchievementLocalizationProvider");
+    contract.of("ODUIAchievementLocalizationProvider").instanceMethod("titleForAchievement:", {"@", "@"});
   }
 
   void viewDidLoad() {
@@ -66,16 +60,9 @@ class CHAchievementDetailViewControllerAccessibility
   }
 };
 
-using C = CHAchievementDetailViewControllerAccessibility;
-
-const CategoryRegistration<C> registration{
-    "CHAchievementDetailViewControllerAccessibility",
-    "CHAchievementDetailViewController",
-    {overrides<&C::viewDidLoad>(messages::viewDidLoad),
-     overrides<&C::_accessibilityLoadAccessibilityInformation>(
-         messages::_accessibilityLoadAccessibilityInformation),
-     overrides<&C::_axAnnotateAchievementView>(axAnnotateAchievementView)}};
-
 }  // namespace
+
+AX_CATEGORY(CHAchievementDetailViewControllerAccessibility, "CHAchievementDetailViewController",
+            overrides<&C::_axAnnotateAchievementView>(axAnnotateAchievementView))
 
 }  // namespace ax

@@ -6,15 +6,11 @@ namespace ax {
 namespace {
 
 // A badge with its text: one button, with all lines of the text as its label.
-class CHAchievementsCellContentViewAccessibility
-    : public SafeCategory<CHAchievementsCellContentViewAccessibility> {
+class CHAchievementsCellContentViewAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "CHAchievementsCellContentView";
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "label", {"@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "badgeView", {"@"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceMethod("label", {"@"});
+    contract.instanceMethod("badgeView", {"@"});
   }
 
   bool isAccessibilityElement() { return true; }
@@ -35,16 +31,8 @@ class CHAchievementsCellContentViewAccessibility
   Traits accessibilityTraits() { return super(messages::accessibilityTraits) | TraitButton; }
 };
 
-using C = CHAchievementsCellContentViewAccessibility;
-
-const CategoryRegistration<C> registration{
-    "CHAchievementsCellContentViewAccessibility",
-    "CHAchievementsCellContentView",
-    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-     overrides<&C::accessibilityLabel>(messages::accessibilityLabel),
-     overrides<&C::accessibilityValue>(messages::accessibilityValue),
-     overrides<&C::accessibilityTraits>(messages::accessibilityTraits)}};
-
 }  // namespace
+
+AX_CATEGORY(CHAchievementsCellContentViewAccessibility, "CHAchievementsCellContentView")
 
 }  // namespace ax

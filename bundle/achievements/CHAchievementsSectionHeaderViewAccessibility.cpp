@@ -5,14 +5,10 @@ namespace ax {
 namespace {
 
 // The title over a group of badges, as a header.
-class CHAchievementsSectionHeaderViewAccessibility
-    : public SafeCategory<CHAchievementsSectionHeaderViewAccessibility> {
+class CHAchievementsSectionHeaderViewAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    manager.validateClassHasInstanceMethodWithFullSignature("CHAchievementsSectionHeaderView", "label",
-                                                            {"@"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceMethod("label", {"@"});
   }
 
   bool isAccessibilityElement() { return true; }
@@ -20,15 +16,8 @@ class CHAchievementsSectionHeaderViewAccessibility
   Ref<String> accessibilityLabel() { return _accessibilityStringForLabelKeyValues(self, "label"); }
 };
 
-using C = CHAchievementsSectionHeaderViewAccessibility;
-
-const CategoryRegistration<C> registration{
-    "CHAchievementsSectionHeaderViewAccessibility",
-    "CHAchievementsSectionHeaderView",
-    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-     overrides<&C::accessibilityTraits>(messages::accessibilityTraits),
-     overrides<&C::accessibilityLabel>(messages::accessibilityLabel)}};
-
 }  // namespace
+
+AX_CATEGORY(CHAchievementsSectionHeaderViewAccessibility, "CHAchievementsSectionHeaderView")
 
 }  // namespace ax

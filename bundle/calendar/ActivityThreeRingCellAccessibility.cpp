@@ -7,14 +7,11 @@ namespace ax {
 namespace {
 
 // A day in the list of days: its date, and its rings as its value.
-class ActivityThreeRingCellAccessibility : public SafeCategory<ActivityThreeRingCellAccessibility> {
+class ActivityThreeRingCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "ActivityThreeRingCell";
-    manager.validateClassHasInstanceVariableWithType(target, "_dateLabel", "Label");
-    manager.validateClassHasInstanceVariableWithType(target, "_date", "Date");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceVariable("_dateLabel", "Label");
+    contract.instanceVariable("_date", "Date");
   }
 
   bool isAccessibilityElement() { return true; }
@@ -26,15 +23,8 @@ class ActivityThreeRingCellAccessibility : public SafeCategory<ActivityThreeRing
   }
 };
 
-using C = ActivityThreeRingCellAccessibility;
-
-const CategoryRegistration<C> registration{
-    "ActivityThreeRingCellAccessibility",
-    "ActivityThreeRingCell",
-    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-     overrides<&C::accessibilityLabel>(messages::accessibilityLabel),
-     overrides<&C::accessibilityValue>(messages::accessibilityValue)}};
-
 }  // namespace
+
+AX_CATEGORY(ActivityThreeRingCellAccessibility, "ActivityThreeRingCell")
 
 }  // namespace ax

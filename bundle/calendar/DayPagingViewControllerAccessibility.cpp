@@ -6,12 +6,10 @@ namespace ax {
 namespace {
 
 // The pager of the days: names its button in the navigation bar.
-class DayPagingViewControllerAccessibility : public SafeCategory<DayPagingViewControllerAccessibility> {
+class DayPagingViewControllerAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    manager.validateClassHasInstanceMethodWithFullSignature("DayPagingViewController", "viewDidLoad", {"v"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceMethod("viewDidLoad", {"v"});
   }
 
   void viewDidLoad() {
@@ -20,12 +18,8 @@ class DayPagingViewControllerAccessibility : public SafeCategory<DayPagingViewCo
   }
 };
 
-using C = DayPagingViewControllerAccessibility;
-
-const CategoryRegistration<C> registration{"DayPagingViewControllerAccessibility",
-                                           "DayPagingViewController",
-                                           {overrides<&C::viewDidLoad>(messages::viewDidLoad)}};
-
 }  // namespace
+
+AX_CATEGORY(DayPagingViewControllerAccessibility, "DayPagingViewController")
 
 }  // namespace ax

@@ -13,21 +13,18 @@ constexpr double besideDay = 10;
 constexpr double belowDay = 70;
 
 // A day of the month: its date, and what was done on it.
-class MonthDayCellLayerAccessibility : public SafeCategory<MonthDayCellLayerAccessibility> {
+class MonthDayCellLayerAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "MonthDayCellLayer";
-    manager.validateClassHasClassMethodWithFullSignature("ActivitySummaryCache", "sharedInstance", {"@"});
-    manager.validateClassHasInstanceVariableWithType(target, "_hasWorkout", "B");
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "isFutureDay", {"B"});
-    manager.validateClassHasInstanceMethodWithFullSignature("QSCalendarDayCell", "representsToday", {"B"});
-    manager.validateClassHasInstanceMethodWithFullSignature("QSCalendarDayCell", "date", {"@"});
-    manager.validateClassIsKindOfClass(target, "QSCalendarDayCell");
-    manager.validateClass("MonthWeekView");
-    manager.validateClass("MonthScrollViewController");
-    manager.validateClass("MonthViewController");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.of("ActivitySummaryCache").classMethod("sharedInstance", {"@"});
+    contract.instanceVariable("_hasWorkout", "B");
+    contract.instanceMethod("isFutureDay", {"B"});
+    contract.of("QSCalendarDayCell").instanceMethod("representsToday", {"B"});
+    contract.of("QSCalendarDayCell").instanceMethod("date", {"@"});
+    contract.isKindOf("QSCalendarDayCell");
+    contract.of("MonthWeekView").exists();
+    contract.of("MonthScrollViewController").exists();
+    contract.of("MonthViewController").exists();
   }
 
   bool isAccessibilityElement() { return true; }
@@ -63,16 +60,8 @@ class MonthDayCellLayerAccessibility : public SafeCategory<MonthDayCellLayerAcce
   Ref<Date> date() { return castAsClass<Date>(self.safeValueForKey("date"_key)); }
 };
 
-using C = MonthDayCellLayerAccessibility;
-
-const CategoryRegistration<C> registration{
-    "MonthDayCellLayerAccessibility",
-    "MonthDayCellLayer",
-    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-     overrides<&C::accessibilityLabel>(messages::accessibilityLabel),
-     overrides<&C::accessibilityValue>(messages::accessibilityValue),
-     overrides<&C::accessibilityFrame>(messages::accessibilityFrame)}};
-
 }  // namespace
+
+AX_CATEGORY(MonthDayCellLayerAccessibility, "MonthDayCellLayer")
 
 }  // namespace ax

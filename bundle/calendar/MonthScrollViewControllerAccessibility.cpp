@@ -5,14 +5,11 @@ namespace ax {
 namespace {
 
 // The scrolling part of the month screen.
-class MonthScrollViewControllerAccessibility : public SafeCategory<MonthScrollViewControllerAccessibility> {
+class MonthScrollViewControllerAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "MonthScrollViewController";
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "viewDidLoad", {"v"});
-    manager.validateClassHasInstanceVariableWithType(target, "_scrollView", "ScrollView");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceMethod("viewDidLoad", {"v"});
+    contract.instanceVariable("_scrollView", "ScrollView");
   }
 
   void viewDidLoad() {
@@ -26,14 +23,8 @@ class MonthScrollViewControllerAccessibility : public SafeCategory<MonthScrollVi
   }
 };
 
-using C = MonthScrollViewControllerAccessibility;
-
-const CategoryRegistration<C> registration{"MonthScrollViewControllerAccessibility",
-                                           "MonthScrollViewController",
-                                           {overrides<&C::viewDidLoad>(messages::viewDidLoad),
-                                            overrides<&C::_accessibilityLoadAccessibilityInformation>(
-                                                messages::_accessibilityLoadAccessibilityInformation)}};
-
 }  // namespace
+
+AX_CATEGORY(MonthScrollViewControllerAccessibility, "MonthScrollViewController")
 
 }  // namespace ax

@@ -6,12 +6,10 @@ namespace ax {
 namespace {
 
 // The screen of the months: names its button in the navigation bar.
-class MonthViewControllerAccessibility : public SafeCategory<MonthViewControllerAccessibility> {
+class MonthViewControllerAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    manager.validateClassHasInstanceMethodWithFullSignature("MonthViewController", "viewDidLoad", {"v"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceMethod("viewDidLoad", {"v"});
   }
 
   void viewDidLoad() {
@@ -20,12 +18,8 @@ class MonthViewControllerAccessibility : public SafeCategory<MonthViewController
   }
 };
 
-using C = MonthViewControllerAccessibility;
-
-const CategoryRegistration<C> registration{"MonthViewControllerAccessibility",
-                                           "MonthViewController",
-                                           {overrides<&C::viewDidLoad>(messages::viewDidLoad)}};
-
 }  // namespace
+
+AX_CATEGORY(MonthViewControllerAccessibility, "MonthViewController")
 
 }  // namespace ax

@@ -6,17 +6,14 @@ namespace ax {
 namespace {
 
 // A week of the month: its title, its goal texts while they show, and its days.
-class MonthWeekViewAccessibility : public SafeCategory<MonthWeekViewAccessibility> {
+class MonthWeekViewAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "MonthWeekView";
-    manager.validateClassHasInstanceMethodWithFullSignature("QSCalendarWeekView", "monthTitleView", {"@"});
-    manager.validateClassIsKindOfClass(target, "QSCalendarWeekView");
-    manager.validateClassHasInstanceVariableWithType(target, "_goalPercentChangeTextLabel", "Label");
-    manager.validateClassHasInstanceVariableWithType(target, "_goalTextLabel", "Label");
-    manager.validateClassHasInstanceVariableWithType(target, "_topBorderLineOnDrag", "Layer");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.of("QSCalendarWeekView").instanceMethod("monthTitleView", {"@"});
+    contract.isKindOf("QSCalendarWeekView");
+    contract.instanceVariable("_goalPercentChangeTextLabel", "Label");
+    contract.instanceVariable("_goalTextLabel", "Label");
+    contract.instanceVariable("_topBorderLineOnDrag", "Layer");
   }
 
   Ref<Array> accessibilityElements() {
@@ -62,13 +59,8 @@ class MonthWeekViewAccessibility : public SafeCategory<MonthWeekViewAccessibilit
   }
 };
 
-using C = MonthWeekViewAccessibility;
-
-const CategoryRegistration<C> registration{
-    "MonthWeekViewAccessibility",
-    "MonthWeekView",
-    {overrides<&C::accessibilityElements>(messages::accessibilityElements)}};
-
 }  // namespace
+
+AX_CATEGORY(MonthWeekViewAccessibility, "MonthWeekView")
 
 }  // namespace ax

@@ -6,14 +6,11 @@ namespace ax {
 namespace {
 
 // The week palette: nothing in it speaks but its weekday header.
-class PaletteViewControllerAccessibility : public SafeCategory<PaletteViewControllerAccessibility> {
+class PaletteViewControllerAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "PaletteViewController";
-    manager.validateClassHasInstanceVariableWithType(target, "_paletteView", "PaletteWeekdayHeaderView");
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "viewDidLoad", {"v"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceVariable("_paletteView", "PaletteWeekdayHeaderView");
+    contract.instanceMethod("viewDidLoad", {"v"});
   }
 
   void viewDidLoad() {
@@ -31,14 +28,8 @@ class PaletteViewControllerAccessibility : public SafeCategory<PaletteViewContro
   }
 };
 
-using C = PaletteViewControllerAccessibility;
-
-const CategoryRegistration<C> registration{"PaletteViewControllerAccessibility",
-                                           "PaletteViewController",
-                                           {overrides<&C::viewDidLoad>(messages::viewDidLoad),
-                                            overrides<&C::_accessibilityLoadAccessibilityInformation>(
-                                                messages::_accessibilityLoadAccessibilityInformation)}};
-
 }  // namespace
+
+AX_CATEGORY(PaletteViewControllerAccessibility, "PaletteViewController")
 
 }  // namespace ax

@@ -8,23 +8,21 @@ namespace ax {
 
 namespace {
 
-const Message<Ref<Object>(Ref<Object>)> initWithNavigationPalette{"initWithNavigationPalette:"};
-const Message<void(Ref<Object>)> highlightWeekdayLabel{"highlightWeekdayLabelForDateAndSetDay:"};
+constinit const Message<Ref<Object>(Ref<Object>)> initWithNavigationPalette{"initWithNavigationPalette:"};
+constinit const Message<void(Ref<Object>)> highlightWeekdayLabel{"highlightWeekdayLabelForDateAndSetDay:"};
 
-const Key shownDateKey = Selector::intern("AXDate");
+Key shownDateKey() {
+  return "AXDate"_key;
+}
 
 // The seven weekday labels over the palette: each is named by its weekday, and its value is that day's rings.
 // The host's labels are the elements; a set-up clears their values, and the next question fills them again.
-class PaletteWeekdayHeaderViewAccessibility : public SafeCategory<PaletteWeekdayHeaderViewAccessibility> {
+class PaletteWeekdayHeaderViewAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "PaletteWeekdayHeaderView";
-    manager.validateClassHasInstanceVariableWithType(target, "_weekdayLabels", "MutableArray");
-    manager.validateClassHasInstanceMethodWithFullSignature(
-        target, "highlightWeekdayLabelForDateAndSetDay:", {"v", "@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "layoutSubviews", {"v"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceVariable("_weekdayLabels", "MutableArray");
+    contract.instanceMethod("highlightWeekdayLabelForDateAndSetDay:", {"v", "@"});
+    contract.instanceMethod("layoutSubviews", {"v"});
   }
 
   Ref<Object> initWithNavigationPalette(Ref<Object> palette) {
@@ -41,7 +39,7 @@ class PaletteWeekdayHeaderViewAccessibility : public SafeCategory<PaletteWeekday
   void highlightWeekdayLabelForDateAndSetDay(Ref<Object> date) {
     super(highlightWeekdayLabel, date);
     messages::_accessibilityLoadAccessibilityInformation(self);
-    self._accessibilitySetRetainedValueForKey(date, shownDateKey);
+    self._accessibilitySetRetainedValueForKey(date, shownDateKey());
   }
 
   void _accessibilityLoadAccessibilityInformation() {
@@ -70,7 +68,7 @@ class PaletteWeekdayHeaderViewAccessibility : public SafeCategory<PaletteWeekday
 
  private:
   Ref<Date> shownDate() {
-    Ref<Date> date = castAsClass<Date>(self._accessibilityValueForKey(shownDateKey));
+    Ref<Date> date = castAsClass<Date>(self._accessibilityValueForKey(shownDateKey()));
     return date ? date : Date::now();
   }
 
@@ -96,19 +94,10 @@ class PaletteWeekdayHeaderViewAccessibility : public SafeCategory<PaletteWeekday
   }
 };
 
-using C = PaletteWeekdayHeaderViewAccessibility;
-
-const CategoryRegistration<C> registration{
-    "PaletteWeekdayHeaderViewAccessibility",
-    "PaletteWeekdayHeaderView",
-    {overrides<&C::initWithNavigationPalette>(ax::initWithNavigationPalette),
-     overrides<&C::layoutSubviews>(messages::layoutSubviews),
-     overrides<&C::highlightWeekdayLabelForDateAndSetDay>(highlightWeekdayLabel),
-     overrides<&C::_accessibilityLoadAccessibilityInformation>(
-         messages::_accessibilityLoadAccessibilityInformation),
-     overrides<&C::accessibilityElements>(messages::accessibilityElements),
-     overrides<&C::_accessibilityHitTest>(messages::_accessibilityHitTest)}};
-
 }  // namespace
+
+AX_CATEGORY(PaletteWeekdayHeaderViewAccessibility, "PaletteWeekdayHeaderView",
+            overrides<&C::initWithNavigationPalette>(ax::initWithNavigationPalette),
+            overrides<&C::highlightWeekdayLabelForDateAndSetDay>(highlightWeekdayLabel))
 
 }  // namespace ax

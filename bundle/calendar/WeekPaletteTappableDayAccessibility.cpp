@@ -5,14 +5,11 @@ namespace ax {
 namespace {
 
 // A day of the palette: selected while its circle is full.
-class WeekPaletteTappableDayAccessibility : public SafeCategory<WeekPaletteTappableDayAccessibility> {
+class WeekPaletteTappableDayAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "WeekPaletteTappableDay";
-    manager.validateClassIsKindOfClass(target, "ActivityTappableDay");
-    manager.validateClassHasInstanceVariableWithType(target, "_circle", "Layer");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.isKindOf("ActivityTappableDay");
+    contract.instanceVariable("_circle", "Layer");
   }
 
   Traits accessibilityTraits() {
@@ -24,13 +21,8 @@ class WeekPaletteTappableDayAccessibility : public SafeCategory<WeekPaletteTappa
   Ref<Object> accessibilityPath() { return nullptr; }
 };
 
-using C = WeekPaletteTappableDayAccessibility;
-
-const CategoryRegistration<C> registration{"WeekPaletteTappableDayAccessibility",
-                                           "WeekPaletteTappableDay",
-                                           {overrides<&C::accessibilityTraits>(messages::accessibilityTraits),
-                                            overrides<&C::accessibilityPath>(messages::accessibilityPath)}};
-
 }  // namespace
+
+AX_CATEGORY(WeekPaletteTappableDayAccessibility, "WeekPaletteTappableDay")
 
 }  // namespace ax

@@ -7,13 +7,9 @@ namespace ax {
 namespace {
 
 // The title over a month, shown as a number and spoken by name.
-class VeltoMonthTitleLabelAccessibility : public SafeCategory<VeltoMonthTitleLabelAccessibility> {
+class VeltoMonthTitleLabelAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    manager.validateClassIsKindOfClass("_VeltoMonthTitleLabel", "Label");
-  }
+  static void _accessibilityPerformValidations(const Contract& contract) { contract.isKindOf("Label"); }
 
   Traits accessibilityTraits() { return super(messages::accessibilityTraits) | TraitHeader; }
 
@@ -24,13 +20,8 @@ class VeltoMonthTitleLabelAccessibility : public SafeCategory<VeltoMonthTitleLab
   }
 };
 
-using C = VeltoMonthTitleLabelAccessibility;
-
-const CategoryRegistration<C> registration{"_VeltoMonthTitleLabelAccessibility",
-                                           "_VeltoMonthTitleLabel",
-                                           {overrides<&C::accessibilityTraits>(messages::accessibilityTraits),
-                                            overrides<&C::accessibilityLabel>(messages::accessibilityLabel)}};
-
 }  // namespace
+
+AX_CATEGORY(VeltoMonthTitleLabelAccessibility, "_VeltoMonthTitleLabel")
 
 }  // namespace ax

@@ -17,17 +17,14 @@ double wallClockHours(const Date& day, const Date& moment) {
 }
 
 // The active hours of a day, told in eight slices.
-class ActivityActiveHoursChartAccessibility : public SafeCategory<ActivityActiveHoursChartAccessibility> {
+class ActivityActiveHoursChartAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "ActivityActiveHoursChart";
-    manager.validateClassHasInstanceVariableWithType(target, "_dataPoints", "Array");
-    manager.validateClassHasInstanceVariableWithType(target, "_barSeries", "VLUIChartUniformBarSeries");
-    manager.validateClassHasInstanceVariableWithType("VLUIChartUniformBarSeries", "_minDate", "Date");
-    manager.validateClassHasInstanceMethodWithFullSignature("VLUIChartPointNumeric", "xValue", {"@"});
-    manager.validateClassHasInstanceMethodWithFullSignature("VLUIChartPointNumeric", "yValue", {"@"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceVariable("_dataPoints", "Array");
+    contract.instanceVariable("_barSeries", "VLUIChartUniformBarSeries");
+    contract.of("VLUIChartUniformBarSeries").instanceVariable("_minDate", "Date");
+    contract.of("VLUIChartPointNumeric").instanceMethod("xValue", {"@"});
+    contract.of("VLUIChartPointNumeric").instanceMethod("yValue", {"@"});
   }
 
   bool _accessibilityShouldUseSlices() { return true; }
@@ -66,17 +63,8 @@ class ActivityActiveHoursChartAccessibility : public SafeCategory<ActivityActive
   }
 };
 
-using C = ActivityActiveHoursChartAccessibility;
-
-const CategoryRegistration<C> registration{
-    "ActivityActiveHoursChartAccessibility",
-    "ActivityActiveHoursChart",
-    {overrides<&C::_accessibilityShouldUseSlices>(messages::_accessibilityShouldUseSlices),
-     overrides<&C::_accessibilityNumberOfSlices>(messages::_accessibilityNumberOfSlices),
-     overrides<&C::_accessibilityHoursPerSlice>(messages::_accessibilityHoursPerSlice),
-     overrides<&C::_accessibilityTimeIntervalPerSlice>(messages::_accessibilityTimeIntervalPerSlice),
-     overrides<&C::_accessibilityQuantityForSliceAtIndex>(messages::_accessibilityQuantityForSliceAtIndex)}};
-
 }  // namespace
+
+AX_CATEGORY(ActivityActiveHoursChartAccessibility, "ActivityActiveHoursChart")
 
 }  // namespace ax

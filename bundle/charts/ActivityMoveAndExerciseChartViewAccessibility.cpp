@@ -13,7 +13,7 @@ namespace {
 constexpr std::size_t spanCount = 8;
 constexpr TimeInterval spanLength = 10800;
 
-const Message<void()> accessibilityReloadData{"accessibilityReloadData"};
+constinit const Message<void()> accessibilityReloadData{"accessibilityReloadData"};
 
 Ref<String> calories(float sum) {
   return stringWithFormat(accessibilityLocalizedString("calories.format"), {formatFloat(0, sum)});
@@ -51,18 +51,15 @@ float sumOfSpan(const Array& points, std::size_t span) {
 class ActivityMoveAndExerciseChartViewAccessibility
     : public GraphDataChart<ActivityMoveAndExerciseChartViewAccessibility> {
  public:
-  using GraphDataChart::GraphDataChart;
-
   static GraphSource graphSource() {
     return {"moveAndExerciseChartPoints"_key, "kAXDayViewCellGraphElements"_key, &Value::staticClass()};
   }
 
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "Velto.ActivityMoveAndExerciseChartView";
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "moveAndExerciseChartPoints", {"@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "moveAndExerciseChartMaxYValue", {"@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "moveAndExerciseChartViewType", {"q"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "accessibilityReloadData", {"v"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceMethod("moveAndExerciseChartPoints", {"@"});
+    contract.instanceMethod("moveAndExerciseChartMaxYValue", {"@"});
+    contract.instanceMethod("moveAndExerciseChartViewType", {"q"});
+    contract.instanceMethod("accessibilityReloadData", {"v"});
   }
 
   bool isAccessibilityElement() { return false; }
@@ -117,15 +114,10 @@ class ActivityMoveAndExerciseChartViewAccessibility
   }
 };
 
-using C = ActivityMoveAndExerciseChartViewAccessibility;
-
-const DataSeriesRegistration<C> registration{
-    "ActivityMoveAndExerciseChartViewAccessibility",
-    "Velto.ActivityMoveAndExerciseChartView",
-    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-     overrides<&C::_accessibilityDataSeriesName>(messages::_accessibilityDataSeriesName),
-     overrides<&C::accessibilityReloadData>(accessibilityReloadData)}};
-
 }  // namespace
+
+AX_CATEGORY(ActivityMoveAndExerciseChartViewAccessibility, "Velto.ActivityMoveAndExerciseChartView",
+            overrides<&C::_accessibilityGraphData>(messages::_accessibilityGraphData),
+            overrides<&C::accessibilityReloadData>(accessibilityReloadData))
 
 }  // namespace ax

@@ -15,14 +15,11 @@ constexpr std::uint64_t sliceCount = 8;
 constexpr TimeInterval pointLength = 900;
 
 // The day's energy or minutes, a quarter of an hour per point, told in eight slices.
-class ActivityQuantityChartAccessibility : public SafeCategory<ActivityQuantityChartAccessibility> {
+class ActivityQuantityChartAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "ActivityQuantityChart";
-    manager.validateClassHasInstanceVariableWithType(target, "_dataPoints", "Array");
-    manager.validateClassHasInstanceVariableWithType(target, "_preferredUnit", "Unit");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceVariable("_dataPoints", "Array");
+    contract.instanceVariable("_preferredUnit", "Unit");
   }
 
   bool _accessibilityShouldUseSlices() { return true; }
@@ -61,16 +58,8 @@ class ActivityQuantityChartAccessibility : public SafeCategory<ActivityQuantityC
   }
 };
 
-using C = ActivityQuantityChartAccessibility;
-
-const CategoryRegistration<C> registration{
-    "ActivityQuantityChartAccessibility",
-    "ActivityQuantityChart",
-    {overrides<&C::_accessibilityShouldUseSlices>(messages::_accessibilityShouldUseSlices),
-     overrides<&C::_accessibilityNumberOfSlices>(messages::_accessibilityNumberOfSlices),
-     overrides<&C::_accessibilityTimeIntervalPerSlice>(messages::_accessibilityTimeIntervalPerSlice),
-     overrides<&C::_accessibilityQuantityForSliceAtIndex>(messages::_accessibilityQuantityForSliceAtIndex)}};
-
 }  // namespace
+
+AX_CATEGORY(ActivityQuantityChartAccessibility, "ActivityQuantityChart")
 
 }  // namespace ax

@@ -15,15 +15,12 @@ constexpr TimeInterval hour = 3600;
 // The day's stand hours: one element per hour that the host shows, active or idle.
 class ActivityStandChartViewAccessibility : public GraphDataChart<ActivityStandChartViewAccessibility> {
  public:
-  using GraphDataChart::GraphDataChart;
-
   static GraphSource graphSource() {
     return {"standChartPoints"_key, "kAXDayViewCellGraphElements"_key, &Value::staticClass()};
   }
 
-  static void _accessibilityPerformValidations(Manager& manager) {
-    manager.validateClassHasInstanceMethodWithFullSignature("Velto.ActivityStandChartView",
-                                                            "standChartPoints", {"@"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceMethod("standChartPoints", {"@"});
   }
 
   bool _accessibilityDataSeriesSupportsSummarization() { return false; }
@@ -75,13 +72,9 @@ class ActivityStandChartViewAccessibility : public GraphDataChart<ActivityStandC
   }
 };
 
-using C = ActivityStandChartViewAccessibility;
-
-const DataSeriesRegistration<C> registration{
-    "ActivityStandChartViewAccessibility",
-    "Velto.ActivityStandChartView",
-    {overrides<&C::_accessibilityDataSeriesName>(messages::_accessibilityDataSeriesName)}};
-
 }  // namespace
+
+AX_CATEGORY(ActivityStandChartViewAccessibility, "Velto.ActivityStandChartView",
+            overrides<&C::_accessibilityGraphData>(messages::_accessibilityGraphData))
 
 }  // namespace ax

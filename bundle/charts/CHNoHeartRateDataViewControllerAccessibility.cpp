@@ -5,17 +5,13 @@ namespace ax {
 namespace {
 
 // The screen in place of a heart rate: its link speaks once, as the button.
-class CHNoHeartRateDataViewControllerAccessibility
-    : public SafeCategory<CHNoHeartRateDataViewControllerAccessibility> {
+class CHNoHeartRateDataViewControllerAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "CHNoHeartRateDataViewController";
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "loadView", {"v"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "titleLabel", {"@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "linkLabel", {"@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "linkButton", {"@"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceMethod("loadView", {"v"});
+    contract.instanceMethod("titleLabel", {"@"});
+    contract.instanceMethod("linkLabel", {"@"});
+    contract.instanceMethod("linkButton", {"@"});
   }
 
   void loadView() {
@@ -34,14 +30,8 @@ class CHNoHeartRateDataViewControllerAccessibility
   }
 };
 
-using C = CHNoHeartRateDataViewControllerAccessibility;
-
-const CategoryRegistration<C> registration{
-    "CHNoHeartRateDataViewControllerAccessibility",
-    "CHNoHeartRateDataViewController",
-    {overrides<&C::loadView>(messages::loadView), overrides<&C::_accessibilityLoadAccessibilityInformation>(
-                                                      messages::_accessibilityLoadAccessibilityInformation)}};
-
 }  // namespace
+
+AX_CATEGORY(CHNoHeartRateDataViewControllerAccessibility, "CHNoHeartRateDataViewController")
 
 }  // namespace ax

@@ -6,7 +6,7 @@ namespace ax {
 
 namespace {
 
-const Message<void()> createAndConstraintNoDataOverlay{"_createAndConstraintNoDataOverlay"};
+constinit const Message<void()> createAndConstraintNoDataOverlay{"_createAndConstraintNoDataOverlay"};
 
 // Nil when none of the view's direct subviews is one, or there is no view.
 template <class T>
@@ -25,16 +25,11 @@ Ref<String> labelOfOverlay(const Ref<View>& overlay) {
 }
 
 // The row of a workout's heart rate: what covers it when there is no data is one button.
-class CHWorkoutDetailHeartRateChartTableViewCellAccessibility
-    : public SafeCategory<CHWorkoutDetailHeartRateChartTableViewCellAccessibility> {
+class CHWorkoutDetailHeartRateChartTableViewCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "CHWorkoutDetailHeartRateChartTableViewCell";
-    manager.validateClassHasInstanceVariableWithType(target, "_noDataOverlayView", "View");
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "_createAndConstraintNoDataOverlay",
-                                                            {"v"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceVariable("_noDataOverlayView", "View");
+    contract.instanceMethod("_createAndConstraintNoDataOverlay", {"v"});
   }
 
   void _createAndConstraintNoDataOverlay() {
@@ -55,15 +50,10 @@ class CHWorkoutDetailHeartRateChartTableViewCellAccessibility
   }
 };
 
-using C = CHWorkoutDetailHeartRateChartTableViewCellAccessibility;
-
-const CategoryRegistration<C> registration{
-    "CHWorkoutDetailHeartRateChartTableViewCellAccessibility",
-    "CHWorkoutDetailHeartRateChartTableViewCell",
-    {overrides<&C::_createAndConstraintNoDataOverlay>(createAndConstraintNoDataOverlay),
-     overrides<&C::_accessibilityLoadAccessibilityInformation>(
-         messages::_accessibilityLoadAccessibilityInformation)}};
-
 }  // namespace
+
+AX_CATEGORY(CHWorkoutDetailHeartRateChartTableViewCellAccessibility,
+            "CHWorkoutDetailHeartRateChartTableViewCell",
+            overrides<&C::_createAndConstraintNoDataOverlay>(createAndConstraintNoDataOverlay))
 
 }  // namespace ax

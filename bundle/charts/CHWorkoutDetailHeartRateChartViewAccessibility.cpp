@@ -16,8 +16,8 @@ namespace {
 
 constexpr std::uint64_t sliceCount = 8;
 
-const Message<Ref<DateInterval>()> axDateInterval{"_axDateInterval"};
-const Message<float(Ref<Date>)> decimalForDate{"_decimalForDate:"};
+constinit const Message<Ref<DateInterval>()> axDateInterval{"_axDateInterval"};
+constinit const Message<float(Ref<Date>)> decimalForDate{"_decimalForDate:"};
 
 Ref<String> spokenRate(double rate) {
   return formatFloat(0, static_cast<float>(rate));
@@ -45,20 +45,16 @@ float middleOf(const Ref<Object>& point) {
 }
 
 // A workout's heart rate over the time of day, summed up in equal slices of the workout.
-class CHWorkoutDetailHeartRateChartViewAccessibility
-    : public SafeCategory<CHWorkoutDetailHeartRateChartViewAccessibility> {
+class CHWorkoutDetailHeartRateChartViewAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "CHWorkoutDetailHeartRateChartView";
-    manager.validateClassConformsToProtocol(target, "VLUIChartDataSource");
-    manager.validateClassHasInstanceVariableWithType(target, "_heartRateReadings", "Array");
-    manager.validateClassHasInstanceVariableWithType(target, "_heartRateChartPoints", "Array");
-    manager.validateClassHasInstanceVariableWithType(target, "_chartView", "VLUIChartView");
-    manager.validateClassHasInstanceVariableWithType(target, "_hasAdequateDataForDisplay", "B");
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "_dateInterval", {"@"});
-    manager.validateClassHasInstanceMethodWithFullSignature("Quantity", "ch_beatsPerMinute", {"d"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.conformsTo("VLUIChartDataSource");
+    contract.instanceVariable("_heartRateReadings", "Array");
+    contract.instanceVariable("_heartRateChartPoints", "Array");
+    contract.instanceVariable("_chartView", "VLUIChartView");
+    contract.instanceVariable("_hasAdequateDataForDisplay", "B");
+    contract.instanceMethod("_dateInterval", {"@"});
+    contract.of("Quantity").instanceMethod("ch_beatsPerMinute", {"d"});
   }
 
   Ref<Array> accessibilityElements() {
@@ -173,19 +169,9 @@ class CHWorkoutDetailHeartRateChartViewAccessibility
   }
 };
 
-using C = CHWorkoutDetailHeartRateChartViewAccessibility;
-
-const DataSeriesRegistration<C> registration{
-    "CHWorkoutDetailHeartRateChartViewAccessibility",
-    "CHWorkoutDetailHeartRateChartView",
-    {overrides<&C::_accessibilityDataSeriesName>(messages::_accessibilityDataSeriesName),
-     overrides<&C::_accessibilityShouldUseSlices>(messages::_accessibilityShouldUseSlices),
-     overrides<&C::_accessibilityNumberOfSlices>(messages::_accessibilityNumberOfSlices),
-     overrides<&C::_accessibilityTimeIntervalPerSlice>(messages::_accessibilityTimeIntervalPerSlice),
-     overrides<&C::_accessibilityHoursPerSlice>(messages::_accessibilityHoursPerSlice),
-     overrides<&C::_accessibilityQuantityForSliceAtIndex>(messages::_accessibilityQuantityForSliceAtIndex),
-     overrides<&C::_axDateInterval>(axDateInterval), overrides<&C::_decimalForDate>(decimalForDate)}};
-
 }  // namespace
+
+AX_CATEGORY(CHWorkoutDetailHeartRateChartViewAccessibility, "CHWorkoutDetailHeartRateChartView",
+            overrides<&C::_axDateInterval>(axDateInterval), overrides<&C::_decimalForDate>(decimalForDate))
 
 }  // namespace ax

@@ -5,12 +5,11 @@ namespace ax {
 namespace {
 
 // The day's row with the rings: nothing but the rings.
-class DayViewActivityRingsTableViewCellAccessibility
-    : public SafeCategory<DayViewActivityRingsTableViewCellAccessibility> {
+class DayViewActivityRingsTableViewCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) { manager.validateClass("ARUIRingsView"); }
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.of("ARUIRingsView").exists();
+  }
 
   Ref<Array> accessibilityElements() {
     const Class* ringsClass = safeClassFromString("ARUIRingsView"_key);
@@ -19,13 +18,8 @@ class DayViewActivityRingsTableViewCellAccessibility
   }
 };
 
-using C = DayViewActivityRingsTableViewCellAccessibility;
-
-const CategoryRegistration<C> registration{
-    "DayViewActivityRingsTableViewCellAccessibility",
-    "Velto.DayViewActivityRingsTableViewCell",
-    {overrides<&C::accessibilityElements>(messages::accessibilityElements)}};
-
 }  // namespace
+
+AX_CATEGORY(DayViewActivityRingsTableViewCellAccessibility, "Velto.DayViewActivityRingsTableViewCell")
 
 }  // namespace ax

@@ -6,17 +6,13 @@ namespace ax {
 namespace {
 
 // The day's row with the move or exercise chart: its title and value, the chart, the text below.
-class DayViewMoveAndExerciseChartTableViewCellAccessibility
-    : public SafeCategory<DayViewMoveAndExerciseChartTableViewCellAccessibility> {
+class DayViewMoveAndExerciseChartTableViewCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "Velto.DayViewMoveAndExerciseChartTableViewCell";
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "chartView", {"@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "auxiliaryLabel", {"@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "labelPair", {"@"});
-    manager.validateClass(titleAndValuePairClassName);
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceMethod("chartView", {"@"});
+    contract.instanceMethod("auxiliaryLabel", {"@"});
+    contract.instanceMethod("labelPair", {"@"});
+    contract.of(titleAndValuePairClassName).exists();
   }
 
   Ref<Array> accessibilityElements() {
@@ -26,13 +22,9 @@ class DayViewMoveAndExerciseChartTableViewCellAccessibility
   }
 };
 
-using C = DayViewMoveAndExerciseChartTableViewCellAccessibility;
-
-const CategoryRegistration<C> registration{
-    "DayViewMoveAndExerciseChartTableViewCellAccessibility",
-    "Velto.DayViewMoveAndExerciseChartTableViewCell",
-    {overrides<&C::accessibilityElements>(messages::accessibilityElements)}};
-
 }  // namespace
+
+AX_CATEGORY(DayViewMoveAndExerciseChartTableViewCellAccessibility,
+            "Velto.DayViewMoveAndExerciseChartTableViewCell")
 
 }  // namespace ax

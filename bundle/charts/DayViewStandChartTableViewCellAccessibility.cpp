@@ -6,16 +6,12 @@ namespace ax {
 namespace {
 
 // The day's row with the stand chart: its title and value, the chart, the idle hours.
-class DayViewStandChartTableViewCellAccessibility
-    : public SafeCategory<DayViewStandChartTableViewCellAccessibility> {
+class DayViewStandChartTableViewCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "Velto.DayViewStandChartTableViewCell";
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "chartView", {"@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "idleHoursLabel", {"@"});
-    manager.validateClass(titleAndValuePairClassName);
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceMethod("chartView", {"@"});
+    contract.instanceMethod("idleHoursLabel", {"@"});
+    contract.of(titleAndValuePairClassName).exists();
   }
 
   Ref<Array> accessibilityElements() {
@@ -34,13 +30,8 @@ class DayViewStandChartTableViewCellAccessibility
   }
 };
 
-using C = DayViewStandChartTableViewCellAccessibility;
-
-const CategoryRegistration<C> registration{
-    "DayViewStandChartTableViewCellAccessibility",
-    "Velto.DayViewStandChartTableViewCell",
-    {overrides<&C::accessibilityElements>(messages::accessibilityElements)}};
-
 }  // namespace
+
+AX_CATEGORY(DayViewStandChartTableViewCellAccessibility, "Velto.DayViewStandChartTableViewCell")
 
 }  // namespace ax

@@ -10,15 +10,14 @@ namespace ax {
 
 namespace {
 
-const Message<Ref<Quantity>(std::int32_t)> accessibilityQuantityForIndex{"accessibilityQuantityForIndex:"};
-const Message<Ref<DateInterval>(std::int32_t)> accessibilityDateIntervalForIndex{
+constinit const Message<Ref<Quantity>(std::int32_t)> accessibilityQuantityForIndex{
+    "accessibilityQuantityForIndex:"};
+constinit const Message<Ref<DateInterval>(std::int32_t)> accessibilityDateIntervalForIndex{
     "accessibilityDateIntervalForIndex:"};
 
 // A trend over time: the title as a header, then one element per bar that has a figure.
 class TrendDetailChartViewAccessibility : public TrendChart<TrendDetailChartViewAccessibility> {
  public:
-  using TrendChart::TrendChart;
-
   static GraphSource graphSource() {
     return {"barStops"_key, "kAXTrendDetailGraphElements"_key, &Number::staticClass()};
   }
@@ -26,16 +25,14 @@ class TrendDetailChartViewAccessibility : public TrendChart<TrendDetailChartView
     return {"kAXTrendDetailGraphCachedMin"_key, "kAXTrendDetailGraphCachedMax"_key};
   }
 
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "Velto.TrendDetailChartView";
-    constexpr auto method = &Manager::validateClassHasInstanceMethodWithFullSignature;
-    (manager.*method)(target, "accessibilityDateIntervalForIndex:", {"@", "i"});
-    (manager.*method)(target, "accessibilityQuantityForIndex:", {"@", "i"});
-    (manager.*method)(target, "layoutSubviews", {"v"});
-    (manager.*method)(target, "titleLabel", {"@"});
-    (manager.*method)(target, "chartMaxLabel", {"@"});
-    (manager.*method)(target, "accessibilityUnit", {"@"});
-    (manager.*method)(target, "barStops", {"@"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceMethod("accessibilityDateIntervalForIndex:", {"@", "i"});
+    contract.instanceMethod("accessibilityQuantityForIndex:", {"@", "i"});
+    contract.instanceMethod("layoutSubviews", {"v"});
+    contract.instanceMethod("titleLabel", {"@"});
+    contract.instanceMethod("chartMaxLabel", {"@"});
+    contract.instanceMethod("accessibilityUnit", {"@"});
+    contract.instanceMethod("barStops", {"@"});
   }
 
   Ref<String> _accessibilityDataSeriesName() { return nullptr; }
@@ -143,16 +140,9 @@ class TrendDetailChartViewAccessibility : public TrendChart<TrendDetailChartView
   }
 };
 
-using C = TrendDetailChartViewAccessibility;
-
-const DataSeriesRegistration<C> registration{
-    "TrendDetailChartViewAccessibility",
-    "Velto.TrendDetailChartView",
-    {overrides<&C::_accessibilityDataSeriesName>(messages::_accessibilityDataSeriesName),
-     overrides<&C::_accessibilityDataSeriesValueDescriptionForPositionAxis>(
-         messages::_accessibilityDataSeriesValueDescriptionForPositionAxis),
-     overrides<&C::layoutSubviews>(messages::layoutSubviews)}};
-
 }  // namespace
+
+AX_CATEGORY(TrendDetailChartViewAccessibility, "Velto.TrendDetailChartView",
+            overrides<&C::_accessibilityGraphData>(messages::_accessibilityGraphData))
 
 }  // namespace ax

@@ -11,21 +11,20 @@ namespace {
 
 constexpr std::size_t daysOfWeek = 7;
 
-const Message<Ref<Quantity>(std::int32_t)> quantity365ForIndex{"accessibiliytQuantity365ForIndex:"};
-const Message<Ref<Quantity>(std::int32_t)> quantity90ForIndex{"accessibiliytQuantity90ForIndex:"};
-const Message<Ref<Object>(std::int32_t)> accessibilityDayForStopIndex{"accessibilityDayForStopIndex:"};
-const Message<std::int32_t()> intValue{"intValue"};
-const Message<Ref<String>(std::int64_t, Ref<DateFormatter>)> axLabelForIndex{
+constinit const Message<Ref<Quantity>(std::int32_t)> quantity365ForIndex{"accessibiliytQuantity365ForIndex:"};
+constinit const Message<Ref<Quantity>(std::int32_t)> quantity90ForIndex{"accessibiliytQuantity90ForIndex:"};
+constinit const Message<Ref<Object>(std::int32_t)> accessibilityDayForStopIndex{
+    "accessibilityDayForStopIndex:"};
+constinit const Message<std::int32_t()> intValue{"intValue"};
+constinit const Message<Ref<String>(std::int64_t, Ref<DateFormatter>)> axLabelForIndex{
     "_axLabelForIndex:withFormatter:"};
-const Message<Ref<String>(std::int64_t, Ref<DateFormatter>)> axDayStringForIndex{
+constinit const Message<Ref<String>(std::int64_t, Ref<DateFormatter>)> axDayStringForIndex{
     "_axDayStringForIndex:withFormatter:"};
 
 // A trend by day of the week: the title as a header, then one element per day with both averages. As a
 // series it has two bars a day, the longer average before the shorter.
 class TrendDetailDailyAverageViewAccessibility : public TrendChart<TrendDetailDailyAverageViewAccessibility> {
  public:
-  using TrendChart::TrendChart;
-
   static GraphSource graphSource() {
     return {"dayStops"_key, "kAXTrendDetailDailyAveragesGraphElements"_key, &Number::staticClass()};
   }
@@ -33,16 +32,14 @@ class TrendDetailDailyAverageViewAccessibility : public TrendChart<TrendDetailDa
     return {"kAXTrendDailyDetailGraphCachedMin"_key, "kAXTrendDailyDetailGraphCachedMax"_key};
   }
 
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "Velto.TrendDetailDailyAverageView";
-    constexpr auto method = &Manager::validateClassHasInstanceMethodWithFullSignature;
-    (manager.*method)(target, "accessibiliytQuantity365ForIndex:", {"@", "i"});
-    (manager.*method)(target, "accessibiliytQuantity90ForIndex:", {"@", "i"});
-    (manager.*method)(target, "accessibilityDayForStopIndex:", {"@", "i"});
-    (manager.*method)(target, "layoutSubviews", {"v"});
-    (manager.*method)(target, "titleLabel", {"@"});
-    (manager.*method)(target, "dayStops", {"@"});
-    (manager.*method)(target, "accessibilityUnit", {"@"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceMethod("accessibiliytQuantity365ForIndex:", {"@", "i"});
+    contract.instanceMethod("accessibiliytQuantity90ForIndex:", {"@", "i"});
+    contract.instanceMethod("accessibilityDayForStopIndex:", {"@", "i"});
+    contract.instanceMethod("layoutSubviews", {"v"});
+    contract.instanceMethod("titleLabel", {"@"});
+    contract.instanceMethod("dayStops", {"@"});
+    contract.instanceMethod("accessibilityUnit", {"@"});
   }
 
   Ref<String> _accessibilityDataSeriesTitleForAxis(std::int64_t axis) {
@@ -141,17 +138,11 @@ class TrendDetailDailyAverageViewAccessibility : public TrendChart<TrendDetailDa
   }
 };
 
-using C = TrendDetailDailyAverageViewAccessibility;
-
-const DataSeriesRegistration<C> registration{
-    "TrendDetailDailyAverageViewAccessibility",
-    "Velto.TrendDetailDailyAverageView",
-    {overrides<&C::_accessibilityDataSeriesValueDescriptionForPositionAxis>(
-         messages::_accessibilityDataSeriesValueDescriptionForPositionAxis),
-     overrides<&C::layoutSubviews>(messages::layoutSubviews),
-     overrides<&C::_axLabelForIndexWithFormatter>(axLabelForIndex),
-     overrides<&C::_axDayStringForIndexWithFormatter>(axDayStringForIndex)}};
-
 }  // namespace
+
+AX_CATEGORY(TrendDetailDailyAverageViewAccessibility, "Velto.TrendDetailDailyAverageView",
+            overrides<&C::_accessibilityGraphData>(messages::_accessibilityGraphData),
+            overrides<&C::_axLabelForIndexWithFormatter>(axLabelForIndex),
+            overrides<&C::_axDayStringForIndexWithFormatter>(axDayStringForIndex))
 
 }  // namespace ax

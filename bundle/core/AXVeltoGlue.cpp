@@ -1,6 +1,8 @@
 #include "bundle/core/AXVeltoGlue.h"
 
+#include <array>
 #include <mutex>
+#include <utility>
 
 #include "bundle/core/InstallationList.h"
 #include "platform/accessibility/ValidationManager.h"
@@ -14,7 +16,12 @@ namespace {
 
 constexpr std::string_view bundleName = "AX Velto";
 
-// What the look-up of a day's summary needs of the host.
+constexpr auto categories = []<std::size_t... Place>(std::index_sequence<Place...>) {
+  return std::array{&categoryAt<Place>...};
+}
+(std::make_index_sequence<installationList.size()>());
+
+// What the look-up of a day's summary needs of the host, and the screens that do it.
 bool validateHost(ValidationManager& manager) {
   manager.validateClassHasClassMethodWithFullSignature("Calendar", "qs_gregorianCalendarWithUTCTimeZone",
                                                        {"@"});
@@ -28,13 +35,15 @@ bool validateHost(ValidationManager& manager) {
 bool introduceBundle(ValidationManager& manager) {
   manager.setValidationTargetName(string(std::string(bundleName)));
   manager.setOverrideProcessName(string(std::string(bundleName)));
+  manager.setValidationTargetScreens({"Month calendar", "Week palette", "Day list"});
   manager.setDebugBuild(false);
   return performValidationChecks();
 }
 
 void installCategories(ValidationManager& manager) {
-  for (const std::string_view category : installationList) {
-    manager.installSafeCategoryCanInteractWithTargetClass(category, true);
+  for (const auto category : categories) registerCategory(category());
+  for (const InstallationRow& row : installationList) {
+    manager.installSafeCategoryCanInteractWithTargetClass(row.category, true);
   }
 }
 

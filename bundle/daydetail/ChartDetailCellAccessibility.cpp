@@ -5,23 +5,20 @@ namespace ax {
 
 namespace {
 
-const Message<void(Ref<Object>)> addChartLabelWithUnit{"addChartLabelWithUnit:"};
-const Message<void()> axHideChartLabel{"_axHideChartLabel"};
-const Message<void()> axUpdateScrollViewInset{"_axUpdateScrollViewInset"};
+constinit const Message<void(Ref<Object>)> addChartLabelWithUnit{"addChartLabelWithUnit:"};
+constinit const Message<void()> axHideChartLabel{"_axHideChartLabel"};
+constinit const Message<void()> axUpdateScrollViewInset{"_axUpdateScrollViewInset"};
 
 // A ring's chart on a day's page: its unit is not spoken by itself, and what the figure covers of the chart
 // does not count as visible.
-class ChartDetailCellAccessibility : public SafeCategory<ChartDetailCellAccessibility> {
+class ChartDetailCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "ChartDetailCell";
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "chartLabel", {"@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "addChartLabelWithUnit:", {"v", "@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "layoutSubviews", {"v"});
-    manager.validateClassHasInstanceVariableWithType(target, "_value", "Label");
-    manager.validateClassHasInstanceVariableWithType(target, "_scrollview", "ScrollView");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceMethod("chartLabel", {"@"});
+    contract.instanceMethod("addChartLabelWithUnit:", {"v", "@"});
+    contract.instanceMethod("layoutSubviews", {"v"});
+    contract.instanceVariable("_value", "Label");
+    contract.instanceVariable("_scrollview", "ScrollView");
   }
 
   void _accessibilityLoadAccessibilityInformation() {
@@ -60,18 +57,11 @@ class ChartDetailCellAccessibility : public SafeCategory<ChartDetailCellAccessib
   }
 };
 
-using C = ChartDetailCellAccessibility;
-
-const CategoryRegistration<C> registration{
-    "ChartDetailCellAccessibility",
-    "ChartDetailCell",
-    {overrides<&C::_accessibilityLoadAccessibilityInformation>(
-         messages::_accessibilityLoadAccessibilityInformation),
-     overrides<&C::addChartLabelWithUnit>(ax::addChartLabelWithUnit),
-     overrides<&C::layoutSubviews>(messages::layoutSubviews),
-     overrides<&C::_axHideChartLabel>(axHideChartLabel),
-     overrides<&C::_axUpdateScrollViewInset>(axUpdateScrollViewInset)}};
-
 }  // namespace
+
+AX_CATEGORY(ChartDetailCellAccessibility, "ChartDetailCell",
+            overrides<&C::addChartLabelWithUnit>(ax::addChartLabelWithUnit),
+            overrides<&C::_axHideChartLabel>(axHideChartLabel),
+            overrides<&C::_axUpdateScrollViewInset>(axUpdateScrollViewInset))
 
 }  // namespace ax

@@ -9,19 +9,16 @@ namespace ax {
 
 namespace {
 
-const Message<void(Ref<Object>, Ref<Object>, double)> setBriskMinutes{"setBriskMinutes:goal:percent:"};
+constinit const Message<void(Ref<Object>, Ref<Object>, double)> setBriskMinutes{
+    "setBriskMinutes:goal:percent:"};
 
 // The exercise ring's chart: the figure is spoken as minutes out of the goal.
-class ExerciseChartDetailCellAccessibility : public SafeCategory<ExerciseChartDetailCellAccessibility> {
+class ExerciseChartDetailCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "ExerciseChartDetailCell";
-    manager.validateClassIsKindOfClass(target, "ChartDetailCell");
-    manager.validateClassHasInstanceMethodWithFullSignature(
-        target, "setBriskMinutes: goal: percent:", {"v", "@", "@", "d"});
-    manager.validateClassHasInstanceVariableWithType("ChartDetailCell", "_value", "Label");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.isKindOf("ChartDetailCell");
+    contract.instanceMethod("setBriskMinutes: goal: percent:", {"v", "@", "@", "d"});
+    contract.of("ChartDetailCell").instanceVariable("_value", "Label");
   }
 
   void setBriskMinutesGoalPercent(Ref<Object> briskMinutes, Ref<Object> goal, double percent) {
@@ -39,12 +36,9 @@ class ExerciseChartDetailCellAccessibility : public SafeCategory<ExerciseChartDe
   }
 };
 
-using C = ExerciseChartDetailCellAccessibility;
-
-const CategoryRegistration<C> registration{"ExerciseChartDetailCellAccessibility",
-                                           "ExerciseChartDetailCell",
-                                           {overrides<&C::setBriskMinutesGoalPercent>(setBriskMinutes)}};
-
 }  // namespace
+
+AX_CATEGORY(ExerciseChartDetailCellAccessibility, "ExerciseChartDetailCell",
+            overrides<&C::setBriskMinutesGoalPercent>(setBriskMinutes))
 
 }  // namespace ax

@@ -5,22 +5,13 @@ namespace ax {
 namespace {
 
 // Nothing behind the loading view can be reached while it shows.
-class LoadingViewAccessibility : public SafeCategory<LoadingViewAccessibility> {
+class LoadingViewAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager&) {}
-
   bool accessibilityViewIsModal() { return true; }
 };
 
-using C = LoadingViewAccessibility;
-
-const CategoryRegistration<C> registration{
-    "LoadingViewAccessibility",
-    "LoadingView",
-    {overrides<&C::accessibilityViewIsModal>(messages::accessibilityViewIsModal)}};
-
 }  // namespace
+
+AX_CATEGORY(LoadingViewAccessibility, "LoadingView")
 
 }  // namespace ax

@@ -9,19 +9,16 @@ namespace ax {
 
 namespace {
 
-const Message<void(Ref<Object>, Ref<Object>, double)> setActiveEnergy{"setActiveEnergy:goalEnergy:percent:"};
+constinit const Message<void(Ref<Object>, Ref<Object>, double)> setActiveEnergy{
+    "setActiveEnergy:goalEnergy:percent:"};
 
 // The move ring's chart: the figure is spoken as an amount out of the goal.
-class MoveChartDetailCellAccessibility : public SafeCategory<MoveChartDetailCellAccessibility> {
+class MoveChartDetailCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "MoveChartDetailCell";
-    manager.validateClassIsKindOfClass(target, "ChartDetailCell");
-    manager.validateClassHasInstanceMethodWithFullSignature(
-        target, "setActiveEnergy: goalEnergy: percent:", {"v", "@", "@", "d"});
-    manager.validateClassHasInstanceVariableWithType("ChartDetailCell", "_value", "Label");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.isKindOf("ChartDetailCell");
+    contract.instanceMethod("setActiveEnergy: goalEnergy: percent:", {"v", "@", "@", "d"});
+    contract.of("ChartDetailCell").instanceVariable("_value", "Label");
   }
 
   void setActiveEnergyGoalEnergyPercent(Ref<Object> activeEnergy, Ref<Object> goalEnergy, double percent) {
@@ -55,13 +52,9 @@ class MoveChartDetailCellAccessibility : public SafeCategory<MoveChartDetailCell
   }
 };
 
-using C = MoveChartDetailCellAccessibility;
-
-const CategoryRegistration<C> registration{
-    "MoveChartDetailCellAccessibility",
-    "MoveChartDetailCell",
-    {overrides<&C::setActiveEnergyGoalEnergyPercent>(setActiveEnergy)}};
-
 }  // namespace
+
+AX_CATEGORY(MoveChartDetailCellAccessibility, "MoveChartDetailCell",
+            overrides<&C::setActiveEnergyGoalEnergyPercent>(setActiveEnergy))
 
 }  // namespace ax

@@ -5,22 +5,19 @@ namespace ax {
 
 namespace {
 
-const Message<void()> setupSubviews{"_setupSubviews"};
-const Message<void()> axUpdateAccessibilityElements{"_axUpdateAccessibilityElements"};
+constinit const Message<void()> setupSubviews{"_setupSubviews"};
+constinit const Message<void()> axUpdateAccessibilityElements{"_axUpdateAccessibilityElements"};
 
 // A day's steps, distance and flights: one element for each caption with its figure.
-class StepsDistanceCellAccessibility : public SafeCategory<StepsDistanceCellAccessibility> {
+class StepsDistanceCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "StepsDistanceCell";
-    manager.validateClassHasInstanceVariableWithType(target, "_stepsTitle", "Label");
-    manager.validateClassHasInstanceVariableWithType(target, "_stepsValue", "Label");
-    manager.validateClassHasInstanceVariableWithType(target, "_distanceTitle", "Label");
-    manager.validateClassHasInstanceVariableWithType(target, "_distanceValue", "Label");
-    manager.validateClassHasInstanceVariableWithType(target, "_flightsTitle", "Label");
-    manager.validateClassHasInstanceVariableWithType(target, "_flightsValue", "Label");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceVariable("_stepsTitle", "Label");
+    contract.instanceVariable("_stepsValue", "Label");
+    contract.instanceVariable("_distanceTitle", "Label");
+    contract.instanceVariable("_distanceValue", "Label");
+    contract.instanceVariable("_flightsTitle", "Label");
+    contract.instanceVariable("_flightsValue", "Label");
   }
 
   void _accessibilityLoadAccessibilityInformation() {
@@ -48,16 +45,9 @@ class StepsDistanceCellAccessibility : public SafeCategory<StepsDistanceCellAcce
   }
 };
 
-using C = StepsDistanceCellAccessibility;
-
-const CategoryRegistration<C> registration{
-    "StepsDistanceCellAccessibility",
-    "StepsDistanceCell",
-    {overrides<&C::_accessibilityLoadAccessibilityInformation>(
-         messages::_accessibilityLoadAccessibilityInformation),
-     overrides<&C::_setupSubviews>(setupSubviews),
-     overrides<&C::_axUpdateAccessibilityElements>(axUpdateAccessibilityElements)}};
-
 }  // namespace
+
+AX_CATEGORY(StepsDistanceCellAccessibility, "StepsDistanceCell", overrides<&C::_setupSubviews>(setupSubviews),
+            overrides<&C::_axUpdateAccessibilityElements>(axUpdateAccessibilityElements))
 
 }  // namespace ax

@@ -5,17 +5,12 @@ namespace ax {
 namespace {
 
 // The toolkit's button speaks well enough by itself.
-class VeltoUIButtonAccessibility : public SafeCategory<VeltoUIButtonAccessibility> {
+class VeltoUIButtonAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager&) {}
 };
 
-using C = VeltoUIButtonAccessibility;
-
-const CategoryRegistration<C> registration{"VeltoUIButtonAccessibility", "Button", {}};
-
 }  // namespace
+
+AX_CATEGORY(VeltoUIButtonAccessibility, "Button")
 
 }  // namespace ax

@@ -7,20 +7,17 @@ namespace ax {
 
 namespace {
 
-const Message<Ref<Object>()> axScrollView{"_axScrollView"};
-const Message<void()> axUpdateStateForDetailView{"_axUpdateStateForDetailView"};
+constinit const Message<Ref<Object>()> axScrollView{"_axScrollView"};
+constinit const Message<void()> axUpdateStateForDetailView{"_axUpdateStateForDetailView"};
 
 // A page control in a cell with a chart: when it is adjusted, the chart turns to the page.
-class VeltoUIPageControlAccessibility : public SafeCategory<VeltoUIPageControlAccessibility> {
+class VeltoUIPageControlAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    manager.validateClass("ChartDetailCell");
-    manager.validateClassHasInstanceVariableWithType("ChartDetailCell", "_scrollview", "ScrollView");
-    manager.validateClass("CHWorkoutDetailHeartRateChartTableViewCell");
-    manager.validateClassHasInstanceVariableWithType("CHWorkoutDetailHeartRateChartTableViewCell",
-                                                     "_scrollView", "ScrollView");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.of("ChartDetailCell").exists();
+    contract.of("ChartDetailCell").instanceVariable("_scrollview", "ScrollView");
+    contract.of("CHWorkoutDetailHeartRateChartTableViewCell").exists();
+    contract.of("CHWorkoutDetailHeartRateChartTableViewCell").instanceVariable("_scrollView", "ScrollView");
   }
 
   void accessibilityIncrement() {
@@ -62,16 +59,9 @@ class VeltoUIPageControlAccessibility : public SafeCategory<VeltoUIPageControlAc
   }
 };
 
-using C = VeltoUIPageControlAccessibility;
-
-const CategoryRegistration<C> registration{
-    "VeltoUIPageControlAccessibility",
-    "PageControl",
-    {overrides<&C::accessibilityIncrement>(messages::accessibilityIncrement),
-     overrides<&C::accessibilityDecrement>(messages::accessibilityDecrement),
-     overrides<&C::_axScrollView>(axScrollView),
-     overrides<&C::_axUpdateStateForDetailView>(axUpdateStateForDetailView)}};
-
 }  // namespace
+
+AX_CATEGORY(VeltoUIPageControlAccessibility, "PageControl", overrides<&C::_axScrollView>(axScrollView),
+            overrides<&C::_axUpdateStateForDetailView>(axUpdateStateForDetailView))
 
 }  // namespace ax

@@ -5,17 +5,12 @@ namespace ax {
 namespace {
 
 // The toolkit's scroll view speaks well enough by itself.
-class VeltoUIScrollViewAccessibility : public SafeCategory<VeltoUIScrollViewAccessibility> {
+class VeltoUIScrollViewAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager&) {}
 };
 
-using C = VeltoUIScrollViewAccessibility;
-
-const CategoryRegistration<C> registration{"VeltoUIScrollViewAccessibility", "ScrollView", {}};
-
 }  // namespace
+
+AX_CATEGORY(VeltoUIScrollViewAccessibility, "ScrollView")
 
 }  // namespace ax

@@ -5,13 +5,11 @@ namespace ax {
 namespace {
 
 // A key beside its value: one element that speaks both.
-class PairedLabelsAccessibility : public SafeCategory<PairedLabelsAccessibility> {
+class PairedLabelsAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    manager.validateClassHasInstanceMethodWithFullSignature("_PairedLabels", "valueLabel", {"@"});
-    manager.validateClassHasInstanceMethodWithFullSignature("_PairedLabels", "keyLabel", {"@"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceMethod("valueLabel", {"@"});
+    contract.instanceMethod("keyLabel", {"@"});
   }
 
   bool isAccessibilityElement() { return true; }
@@ -22,14 +20,8 @@ class PairedLabelsAccessibility : public SafeCategory<PairedLabelsAccessibility>
   }
 };
 
-using C = PairedLabelsAccessibility;
-
-const CategoryRegistration<C> registration{
-    "_PairedLabelsAccessibility",
-    "_PairedLabels",
-    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-     overrides<&C::accessibilityLabel>(messages::accessibilityLabel)}};
-
 }  // namespace
+
+AX_CATEGORY(PairedLabelsAccessibility, "_PairedLabels")
 
 }  // namespace ax

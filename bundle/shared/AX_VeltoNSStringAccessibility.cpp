@@ -5,16 +5,14 @@ namespace ax {
 
 namespace {
 
-const Message<Ref<Object>(Ref<Object>, Ref<String>)> attrStringWithValueUnit{"attrStringWithValue:unit:"};
+constinit const Message<Ref<Object>(Ref<Object>, Ref<String>)> attrStringWithValueUnit{
+    "attrStringWithValue:unit:"};
 
 // Gives the host's value-and-unit strings a spoken unit where the unit has one.
-class AX_VeltoNSStringAccessibility : public SafeCategory<AX_VeltoNSStringAccessibility> {
+class AX_VeltoNSStringAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    manager.validateClassHasClassMethodWithFullSignature("String",
-                                                         "attrStringWithValue: unit:", {"@", "@", "@"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.classMethod("attrStringWithValue: unit:", {"@", "@", "@"});
   }
 
   Ref<Object> attrStringWithValueUnit(Ref<Object> value, Ref<String> unit) {
@@ -33,13 +31,9 @@ class AX_VeltoNSStringAccessibility : public SafeCategory<AX_VeltoNSStringAccess
   }
 };
 
-using C = AX_VeltoNSStringAccessibility;
-
-const CategoryRegistration<C> registration{
-    "AX_VeltoNSStringAccessibility",
-    "String",
-    {overridesClassMethod<&C::attrStringWithValueUnit>(ax::attrStringWithValueUnit)}};
-
 }  // namespace
+
+AX_CATEGORY(AX_VeltoNSStringAccessibility, "String",
+            overridesClassMethod<&C::attrStringWithValueUnit>(ax::attrStringWithValueUnit))
 
 }  // namespace ax

@@ -5,13 +5,10 @@ namespace ax {
 namespace {
 
 // One thing to do with a friend: a button named by its title.
-class CHFriendDetailActionCellAccessibility : public SafeCategory<CHFriendDetailActionCellAccessibility> {
+class CHFriendDetailActionCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    manager.validateClassHasInstanceVariableWithType("CHFriendDetailActionCell", "_actionTitleLabel",
-                                                     "Label");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceVariable("_actionTitleLabel", "Label");
   }
 
   bool isAccessibilityElement() { return true; }
@@ -21,15 +18,8 @@ class CHFriendDetailActionCellAccessibility : public SafeCategory<CHFriendDetail
   Traits accessibilityTraits() { return super(messages::accessibilityTraits) | TraitButton; }
 };
 
-using C = CHFriendDetailActionCellAccessibility;
-
-const CategoryRegistration<C> registration{
-    "CHFriendDetailActionCellAccessibility",
-    "CHFriendDetailActionCell",
-    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-     overrides<&C::accessibilityLabel>(messages::accessibilityLabel),
-     overrides<&C::accessibilityTraits>(messages::accessibilityTraits)}};
-
 }  // namespace
+
+AX_CATEGORY(CHFriendDetailActionCellAccessibility, "CHFriendDetailActionCell")
 
 }  // namespace ax

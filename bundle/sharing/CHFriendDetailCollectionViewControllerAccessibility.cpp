@@ -7,17 +7,13 @@ namespace {
 
 // A friend's page: its button for a new message is named as in the inbox. On the user's own page there is
 // none.
-class CHFriendDetailCollectionViewControllerAccessibility
-    : public SafeCategory<CHFriendDetailCollectionViewControllerAccessibility> {
+class CHFriendDetailCollectionViewControllerAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "CHFriendDetailCollectionViewController";
-    manager.validateClassHasInstanceVariableWithType(target, "_isMe", "B");
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "_sendMessageButtonTapped:", {"v", "@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "viewDidLoad", {"v"});
-    manager.validateClassIsKindOfClass(target, "ViewController");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceVariable("_isMe", "B");
+    contract.instanceMethod("_sendMessageButtonTapped:", {"v", "@"});
+    contract.instanceMethod("viewDidLoad", {"v"});
+    contract.isKindOf("ViewController");
   }
 
   void viewDidLoad() {
@@ -31,14 +27,8 @@ class CHFriendDetailCollectionViewControllerAccessibility
   }
 };
 
-using C = CHFriendDetailCollectionViewControllerAccessibility;
-
-const CategoryRegistration<C> registration{"CHFriendDetailCollectionViewControllerAccessibility",
-                                           "CHFriendDetailCollectionViewController",
-                                           {overrides<&C::viewDidLoad>(messages::viewDidLoad),
-                                            overrides<&C::_accessibilityLoadAccessibilityInformation>(
-                                                messages::_accessibilityLoadAccessibilityInformation)}};
-
 }  // namespace
+
+AX_CATEGORY(CHFriendDetailCollectionViewControllerAccessibility, "CHFriendDetailCollectionViewController")
 
 }  // namespace ax

@@ -5,14 +5,11 @@ namespace ax {
 namespace {
 
 // One goal of a friend: the title is the label, what has been done of it the value.
-class CHFriendDetailGoalCellAccessibility : public SafeCategory<CHFriendDetailGoalCellAccessibility> {
+class CHFriendDetailGoalCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "CHFriendDetailGoalCell";
-    manager.validateClassHasInstanceVariableWithType(target, "_titleLabel", "Label");
-    manager.validateClassHasInstanceVariableWithType(target, "_subtitleLabel", "Label");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceVariable("_titleLabel", "Label");
+    contract.instanceVariable("_subtitleLabel", "Label");
   }
 
   bool isAccessibilityElement() { return true; }
@@ -20,15 +17,8 @@ class CHFriendDetailGoalCellAccessibility : public SafeCategory<CHFriendDetailGo
   Ref<String> accessibilityValue() { return labelOfPart(self, self.safeValueForKey("_subtitleLabel"_key)); }
 };
 
-using C = CHFriendDetailGoalCellAccessibility;
-
-const CategoryRegistration<C> registration{
-    "CHFriendDetailGoalCellAccessibility",
-    "CHFriendDetailGoalCell",
-    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-     overrides<&C::accessibilityLabel>(messages::accessibilityLabel),
-     overrides<&C::accessibilityValue>(messages::accessibilityValue)}};
-
 }  // namespace
+
+AX_CATEGORY(CHFriendDetailGoalCellAccessibility, "CHFriendDetailGoalCell")
 
 }  // namespace ax

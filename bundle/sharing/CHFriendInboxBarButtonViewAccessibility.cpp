@@ -7,14 +7,11 @@ namespace ax {
 namespace {
 
 // The button that opens the inbox says how many items wait there.
-class CHFriendInboxBarButtonViewAccessibility : public SafeCategory<CHFriendInboxBarButtonViewAccessibility> {
+class CHFriendInboxBarButtonViewAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    manager.validateClassHasInstanceVariableWithType("CHFriendInboxBarButtonView", "_badgeView",
-                                                     "CHFriendInboxBadgeView");
-    manager.validateClassHasInstanceMethodWithFullSignature("CHFriendInboxBadgeView", "badgeText", {"@"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceVariable("_badgeView", "CHFriendInboxBadgeView");
+    contract.of("CHFriendInboxBadgeView").instanceMethod("badgeText", {"@"});
   }
 
   bool isAccessibilityElement() { return true; }
@@ -35,15 +32,8 @@ class CHFriendInboxBarButtonViewAccessibility : public SafeCategory<CHFriendInbo
   }
 };
 
-using C = CHFriendInboxBarButtonViewAccessibility;
-
-const CategoryRegistration<C> registration{
-    "CHFriendInboxBarButtonViewAccessibility",
-    "CHFriendInboxBarButtonView",
-    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-     overrides<&C::accessibilityLabel>(messages::accessibilityLabel),
-     overrides<&C::accessibilityValue>(messages::accessibilityValue)}};
-
 }  // namespace
+
+AX_CATEGORY(CHFriendInboxBarButtonViewAccessibility, "CHFriendInboxBarButtonView")
 
 }  // namespace ax

@@ -6,16 +6,12 @@ namespace ax {
 namespace {
 
 // The inbox: its button for a new message is named and explained.
-class CHFriendInboxTableViewControllerAccessibility
-    : public SafeCategory<CHFriendInboxTableViewControllerAccessibility> {
+class CHFriendInboxTableViewControllerAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "CHFriendInboxTableViewController";
-    manager.validateClassIsKindOfClass(target, "ViewController");
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "viewDidLoad", {"v"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "_sendMessageButtonTapped:", {"v", "@"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.isKindOf("ViewController");
+    contract.instanceMethod("viewDidLoad", {"v"});
+    contract.instanceMethod("_sendMessageButtonTapped:", {"v", "@"});
   }
 
   void viewDidLoad() {
@@ -29,14 +25,8 @@ class CHFriendInboxTableViewControllerAccessibility
   }
 };
 
-using C = CHFriendInboxTableViewControllerAccessibility;
-
-const CategoryRegistration<C> registration{"CHFriendInboxTableViewControllerAccessibility",
-                                           "CHFriendInboxTableViewController",
-                                           {overrides<&C::viewDidLoad>(messages::viewDidLoad),
-                                            overrides<&C::_accessibilityLoadAccessibilityInformation>(
-                                                messages::_accessibilityLoadAccessibilityInformation)}};
-
 }  // namespace
+
+AX_CATEGORY(CHFriendInboxTableViewControllerAccessibility, "CHFriendInboxTableViewController")
 
 }  // namespace ax

@@ -5,15 +5,11 @@ namespace ax {
 namespace {
 
 // The row of one competition: the score, then the days that remain.
-class CHFriendListCompetitionTableViewCellAccessibility
-    : public SafeCategory<CHFriendListCompetitionTableViewCellAccessibility> {
+class CHFriendListCompetitionTableViewCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "CHFriendListCompetitionTableViewCell";
-    manager.validateClassHasInstanceVariableWithType(target, "_daysRemainingLabel", "Label");
-    manager.validateClassHasInstanceVariableWithType(target, "_scoreView", "ASCompetitionScoreView");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceVariable("_daysRemainingLabel", "Label");
+    contract.instanceVariable("_scoreView", "ASCompetitionScoreView");
   }
 
   bool isAccessibilityElement() { return true; }
@@ -22,14 +18,8 @@ class CHFriendListCompetitionTableViewCellAccessibility
   }
 };
 
-using C = CHFriendListCompetitionTableViewCellAccessibility;
-
-const CategoryRegistration<C> registration{
-    "CHFriendListCompetitionTableViewCellAccessibility",
-    "CHFriendListCompetitionTableViewCell",
-    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-     overrides<&C::accessibilityLabel>(messages::accessibilityLabel)}};
-
 }  // namespace
+
+AX_CATEGORY(CHFriendListCompetitionTableViewCellAccessibility, "CHFriendListCompetitionTableViewCell")
 
 }  // namespace ax

@@ -6,22 +6,18 @@ namespace ax {
 
 namespace {
 
-const Message<void(Ref<Object>, Ref<Object>, Ref<Object>, bool)> setFriend{
+constinit const Message<void(Ref<Object>, Ref<Object>, Ref<Object>, bool)> setFriend{
     "setFriend:snapshot:formattingManager:animated:"};
 
 // The row of one friend: one element, labelled anew each time the list shows a friend in it.
-class CHFriendListTableViewCellAccessibility : public SafeCategory<CHFriendListTableViewCellAccessibility> {
+class CHFriendListTableViewCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "CHFriendListTableViewCell";
-    manager.validateClassIsKindOfClass(target, "TableViewCell");
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "detailLineOneLabel", {"@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "detailLineTwoLabel", {"@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "competitionBadgeView", {"@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(
-        target, "setFriend:snapshot:formattingManager:animated:", {"v", "@", "@", "@", "B"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.isKindOf("TableViewCell");
+    contract.instanceMethod("detailLineOneLabel", {"@"});
+    contract.instanceMethod("detailLineTwoLabel", {"@"});
+    contract.instanceMethod("competitionBadgeView", {"@"});
+    contract.instanceMethod("setFriend:snapshot:formattingManager:animated:", {"v", "@", "@", "@", "B"});
   }
 
   bool isAccessibilityElement() { return true; }
@@ -54,16 +50,9 @@ class CHFriendListTableViewCellAccessibility : public SafeCategory<CHFriendListT
   }
 };
 
-using C = CHFriendListTableViewCellAccessibility;
-
-const CategoryRegistration<C> registration{
-    "CHFriendListTableViewCellAccessibility",
-    "CHFriendListTableViewCell",
-    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-     overrides<&C::setFriendSnapshotFormattingManagerAnimated>(setFriend),
-     overrides<&C::_accessibilityLoadAccessibilityInformation>(
-         messages::_accessibilityLoadAccessibilityInformation)}};
-
 }  // namespace
+
+AX_CATEGORY(CHFriendListTableViewCellAccessibility, "CHFriendListTableViewCell",
+            overrides<&C::setFriendSnapshotFormattingManagerAnimated>(setFriend))
 
 }  // namespace ax

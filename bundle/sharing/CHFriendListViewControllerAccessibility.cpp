@@ -7,14 +7,11 @@ namespace ax {
 namespace {
 
 // The list of friends: its sort button says what it does and which order is chosen.
-class CHFriendListViewControllerAccessibility : public SafeCategory<CHFriendListViewControllerAccessibility> {
+class CHFriendListViewControllerAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "CHFriendListViewController";
-    manager.validateClassHasInstanceVariableWithType(target, "_sortBarButtonItem", "BarButtonItem");
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "viewDidLoad", {"v"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceVariable("_sortBarButtonItem", "BarButtonItem");
+    contract.instanceMethod("viewDidLoad", {"v"});
   }
 
   void viewDidLoad() {
@@ -32,14 +29,8 @@ class CHFriendListViewControllerAccessibility : public SafeCategory<CHFriendList
   }
 };
 
-using C = CHFriendListViewControllerAccessibility;
-
-const CategoryRegistration<C> registration{"CHFriendListViewControllerAccessibility",
-                                           "CHFriendListViewController",
-                                           {overrides<&C::viewDidLoad>(messages::viewDidLoad),
-                                            overrides<&C::_accessibilityLoadAccessibilityInformation>(
-                                                messages::_accessibilityLoadAccessibilityInformation)}};
-
 }  // namespace
+
+AX_CATEGORY(CHFriendListViewControllerAccessibility, "CHFriendListViewController")
 
 }  // namespace ax

@@ -7,13 +7,8 @@ namespace ax {
 namespace {
 
 // The row that sorts the friends: its button says what it is for.
-class FriendListSortTableViewCellAccessibility
-    : public SafeCategory<FriendListSortTableViewCellAccessibility> {
+class FriendListSortTableViewCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager&) {}
-
   void _accessibilityLoadAccessibilityInformation() {
     super(messages::_accessibilityLoadAccessibilityInformation);
     const Ref<Array> buttons = _accessibilityFindUnsortedDescendantsPassingTest(
@@ -22,13 +17,8 @@ class FriendListSortTableViewCellAccessibility
   }
 };
 
-using C = FriendListSortTableViewCellAccessibility;
-
-const CategoryRegistration<C> registration{"FriendListSortTableViewCellAccessibility",
-                                           "Velto.FriendListSortTableViewCell",
-                                           {overrides<&C::_accessibilityLoadAccessibilityInformation>(
-                                               messages::_accessibilityLoadAccessibilityInformation)}};
-
 }  // namespace
+
+AX_CATEGORY(FriendListSortTableViewCellAccessibility, "Velto.FriendListSortTableViewCell")
 
 }  // namespace ax

@@ -5,12 +5,8 @@ namespace ax {
 namespace {
 
 // What a trend's own screen says about it, in one stop and without its headings.
-class TrendDetailSummaryViewAccessibility : public SafeCategory<TrendDetailSummaryViewAccessibility> {
+class TrendDetailSummaryViewAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager&) {}
-
   bool isAccessibilityElement() { return true; }
   Ref<String> accessibilityLabel() {
     return _accessibilityTextForSubhierarchyIncludingHeadersFocusableItemsExclusions(self, false, true,
@@ -18,14 +14,8 @@ class TrendDetailSummaryViewAccessibility : public SafeCategory<TrendDetailSumma
   }
 };
 
-using C = TrendDetailSummaryViewAccessibility;
-
-const CategoryRegistration<C> registration{
-    "TrendDetailSummaryViewAccessibility",
-    "Velto.TrendDetailSummaryView",
-    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-     overrides<&C::accessibilityLabel>(messages::accessibilityLabel)}};
-
 }  // namespace
+
+AX_CATEGORY(TrendDetailSummaryViewAccessibility, "Velto.TrendDetailSummaryView")
 
 }  // namespace ax

@@ -5,15 +5,12 @@ namespace ax {
 namespace {
 
 // One measure with its trend: a button that says title, trend and value.
-class TrendListMetricViewAccessibility : public SafeCategory<TrendListMetricViewAccessibility> {
+class TrendListMetricViewAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "Velto.TrendListMetricView";
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "titleLabel", {"@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "trendString", {"@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "valueLabel", {"@"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceMethod("titleLabel", {"@"});
+    contract.instanceMethod("trendString", {"@"});
+    contract.instanceMethod("valueLabel", {"@"});
   }
 
   bool isAccessibilityElement() { return true; }
@@ -25,15 +22,8 @@ class TrendListMetricViewAccessibility : public SafeCategory<TrendListMetricView
   Traits accessibilityTraits() { return super(messages::accessibilityTraits) | TraitButton; }
 };
 
-using C = TrendListMetricViewAccessibility;
-
-const CategoryRegistration<C> registration{
-    "TrendListMetricViewAccessibility",
-    "Velto.TrendListMetricView",
-    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-     overrides<&C::accessibilityLabel>(messages::accessibilityLabel),
-     overrides<&C::accessibilityTraits>(messages::accessibilityTraits)}};
-
 }  // namespace
+
+AX_CATEGORY(TrendListMetricViewAccessibility, "Velto.TrendListMetricView")
 
 }  // namespace ax

@@ -6,12 +6,8 @@ namespace ax {
 namespace {
 
 // A row of two trends: the buttons over them say nothing that the trends do not.
-class TrendPairTableViewCellAccessibility : public SafeCategory<TrendPairTableViewCellAccessibility> {
+class TrendPairTableViewCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager&) {}
-
   void _accessibilityLoadAccessibilityInformation() {
     super(messages::_accessibilityLoadAccessibilityInformation);
     const Ref<Array> buttons = _accessibilityFindUnsortedDescendantsPassingTest(
@@ -20,13 +16,8 @@ class TrendPairTableViewCellAccessibility : public SafeCategory<TrendPairTableVi
   }
 };
 
-using C = TrendPairTableViewCellAccessibility;
-
-const CategoryRegistration<C> registration{"TrendPairTableViewCellAccessibility",
-                                           "Velto.TrendPairTableViewCell",
-                                           {overrides<&C::_accessibilityLoadAccessibilityInformation>(
-                                               messages::_accessibilityLoadAccessibilityInformation)}};
-
 }  // namespace
+
+AX_CATEGORY(TrendPairTableViewCellAccessibility, "Velto.TrendPairTableViewCell")
 
 }  // namespace ax

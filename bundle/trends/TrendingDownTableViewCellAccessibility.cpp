@@ -5,14 +5,11 @@ namespace ax {
 namespace {
 
 // A row with one downward trend: one button, the trend and what is said about it.
-class TrendingDownTableViewCellAccessibility : public SafeCategory<TrendingDownTableViewCellAccessibility> {
+class TrendingDownTableViewCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "Velto.TrendingDownTableViewCell";
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "view", {"@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "detailLabel", {"@"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceMethod("view", {"@"});
+    contract.instanceMethod("detailLabel", {"@"});
   }
 
   bool isAccessibilityElement() { return true; }
@@ -22,15 +19,8 @@ class TrendingDownTableViewCellAccessibility : public SafeCategory<TrendingDownT
   Traits accessibilityTraits() { return super(messages::accessibilityTraits) | TraitButton; }
 };
 
-using C = TrendingDownTableViewCellAccessibility;
-
-const CategoryRegistration<C> registration{
-    "TrendingDownTableViewCellAccessibility",
-    "Velto.TrendingDownTableViewCell",
-    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-     overrides<&C::accessibilityLabel>(messages::accessibilityLabel),
-     overrides<&C::accessibilityTraits>(messages::accessibilityTraits)}};
-
 }  // namespace
+
+AX_CATEGORY(TrendingDownTableViewCellAccessibility, "Velto.TrendingDownTableViewCell")
 
 }  // namespace ax

@@ -5,14 +5,11 @@ namespace ax {
 namespace {
 
 // A row of upward trends: its two halves are the buttons, not the row.
-class TrendingUpTableViewCellAccessibility : public SafeCategory<TrendingUpTableViewCellAccessibility> {
+class TrendingUpTableViewCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "Velto.TrendingUpTableViewCell";
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "leadingView", {"@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "trailingView", {"@"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceMethod("leadingView", {"@"});
+    contract.instanceMethod("trailingView", {"@"});
   }
 
   bool isAccessibilityElement() { return false; }
@@ -28,14 +25,8 @@ class TrendingUpTableViewCellAccessibility : public SafeCategory<TrendingUpTable
   }
 };
 
-using C = TrendingUpTableViewCellAccessibility;
-
-const CategoryRegistration<C> registration{
-    "TrendingUpTableViewCellAccessibility",
-    "Velto.TrendingUpTableViewCell",
-    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-     overrides<&C::accessibilityElements>(messages::accessibilityElements)}};
-
 }  // namespace
+
+AX_CATEGORY(TrendingUpTableViewCellAccessibility, "Velto.TrendingUpTableViewCell")
 
 }  // namespace ax

@@ -8,16 +8,12 @@ namespace {
 enum ExpandedStatus : std::int64_t { isExpanded = 1, isCollapsed = 2 };
 
 // A section's header, which opens and closes the section: activating it presses its button.
-class CHWorkoutDetailExpandingHeaderViewAccessibility
-    : public SafeCategory<CHWorkoutDetailExpandingHeaderViewAccessibility> {
+class CHWorkoutDetailExpandingHeaderViewAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "CHWorkoutDetailExpandingHeaderView";
-    manager.validateClassHasInstanceVariableWithType(target, "_titleLabel", "Label");
-    manager.validateClassHasInstanceVariableWithType(target, "_expandButton", "Button");
-    manager.validateClassHasInstanceVariableWithType(target, "_expanded", "B");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceVariable("_titleLabel", "Label");
+    contract.instanceVariable("_expandButton", "Button");
+    contract.instanceVariable("_expanded", "B");
   }
 
   bool isAccessibilityElement() { return true; }
@@ -32,17 +28,8 @@ class CHWorkoutDetailExpandingHeaderViewAccessibility
   }
 };
 
-using C = CHWorkoutDetailExpandingHeaderViewAccessibility;
-
-const CategoryRegistration<C> registration{
-    "CHWorkoutDetailExpandingHeaderViewAccessibility",
-    "CHWorkoutDetailExpandingHeaderView",
-    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-     overrides<&C::accessibilityLabel>(messages::accessibilityLabel),
-     overrides<&C::accessibilityTraits>(messages::accessibilityTraits),
-     overrides<&C::accessibilityActivationPoint>(messages::accessibilityActivationPoint),
-     overrides<&C::_accessibilityExpandedStatus>(messages::_accessibilityExpandedStatus)}};
-
 }  // namespace
+
+AX_CATEGORY(CHWorkoutDetailExpandingHeaderViewAccessibility, "CHWorkoutDetailExpandingHeaderView")
 
 }  // namespace ax

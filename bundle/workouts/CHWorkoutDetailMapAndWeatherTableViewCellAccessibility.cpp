@@ -5,15 +5,11 @@ namespace ax {
 namespace {
 
 // The cell with a workout's map and weather, in that order.
-class CHWorkoutDetailMapAndWeatherTableViewCellAccessibility
-    : public SafeCategory<CHWorkoutDetailMapAndWeatherTableViewCellAccessibility> {
+class CHWorkoutDetailMapAndWeatherTableViewCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "CHWorkoutDetailMapAndWeatherTableViewCell";
-    manager.validateClassHasInstanceVariableWithType(target, "_mapView", "_CHWorkoutDetailMapView");
-    manager.validateClassHasInstanceVariableWithType(target, "_weatherView", "_CHWorkoutDetailWeatherView");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceVariable("_mapView", "_CHWorkoutDetailMapView");
+    contract.instanceVariable("_weatherView", "_CHWorkoutDetailWeatherView");
   }
 
   Ref<Array> accessibilityElements() {
@@ -22,13 +18,9 @@ class CHWorkoutDetailMapAndWeatherTableViewCellAccessibility
   }
 };
 
-using C = CHWorkoutDetailMapAndWeatherTableViewCellAccessibility;
-
-const CategoryRegistration<C> registration{
-    "CHWorkoutDetailMapAndWeatherTableViewCellAccessibility",
-    "CHWorkoutDetailMapAndWeatherTableViewCell",
-    {overrides<&C::accessibilityElements>(messages::accessibilityElements)}};
-
 }  // namespace
+
+AX_CATEGORY(CHWorkoutDetailMapAndWeatherTableViewCellAccessibility,
+            "CHWorkoutDetailMapAndWeatherTableViewCell")
 
 }  // namespace ax

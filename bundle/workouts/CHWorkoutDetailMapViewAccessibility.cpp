@@ -7,13 +7,11 @@ namespace ax {
 namespace {
 
 // The route map: one button named by its title.
-class CHWorkoutDetailMapViewAccessibility : public SafeCategory<CHWorkoutDetailMapViewAccessibility> {
+class CHWorkoutDetailMapViewAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    manager.validateClassIsKindOfClass("CHWorkoutDetailMapView", "View");
-    manager.validateClassHasInstanceVariableWithType("CHWorkoutDetailMapView", "_titleLabel", "Label");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.isKindOf("View");
+    contract.instanceVariable("_titleLabel", "Label");
   }
 
   bool isAccessibilityElement() { return true; }
@@ -27,17 +25,8 @@ class CHWorkoutDetailMapViewAccessibility : public SafeCategory<CHWorkoutDetailM
   }
 };
 
-using C = CHWorkoutDetailMapViewAccessibility;
-
-const CategoryRegistration<C> registration{
-    "CHWorkoutDetailMapViewAccessibility",
-    "CHWorkoutDetailMapView",
-    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-     overrides<&C::accessibilityLabel>(messages::accessibilityLabel),
-     overrides<&C::accessibilityHint>(messages::accessibilityHint),
-     overrides<&C::accessibilityTraits>(messages::accessibilityTraits),
-     overrides<&C::accessibilityFrame>(messages::accessibilityFrame)}};
-
 }  // namespace
+
+AX_CATEGORY(CHWorkoutDetailMapViewAccessibility, "CHWorkoutDetailMapView")
 
 }  // namespace ax

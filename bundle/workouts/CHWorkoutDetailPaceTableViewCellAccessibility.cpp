@@ -7,21 +7,16 @@ namespace ax {
 
 namespace {
 
-const Message<void(Ref<Object>, Ref<Object>)> configureWithWorkoutDataCalculator{
+constinit const Message<void(Ref<Object>, Ref<Object>)> configureWithWorkoutDataCalculator{
     "configureWithWorkout:dataCalculator:"};
 
 // The pace of a workout, spoken as minutes and seconds. A ride shows a speed and keeps what the cell said.
-class CHWorkoutDetailPaceTableViewCellAccessibility
-    : public SafeCategory<CHWorkoutDetailPaceTableViewCellAccessibility> {
+class CHWorkoutDetailPaceTableViewCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "CHWorkoutDetailPaceTableViewCell";
-    manager.validateClassHasInstanceVariableWithType(target, "_titleLabel", "Label");
-    manager.validateClassHasInstanceVariableWithType(target, "_valueLabel", "Label");
-    manager.validateClassHasInstanceMethodWithFullSignature(
-        target, "configureWithWorkout:dataCalculator:", {"v", "@", "@"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceVariable("_titleLabel", "Label");
+    contract.instanceVariable("_valueLabel", "Label");
+    contract.instanceMethod("configureWithWorkout:dataCalculator:", {"v", "@", "@"});
   }
 
   void _accessibilityLoadAccessibilityInformation() {
@@ -40,15 +35,9 @@ class CHWorkoutDetailPaceTableViewCellAccessibility
   }
 };
 
-using C = CHWorkoutDetailPaceTableViewCellAccessibility;
-
-const CategoryRegistration<C> registration{
-    "CHWorkoutDetailPaceTableViewCellAccessibility",
-    "CHWorkoutDetailPaceTableViewCell",
-    {overrides<&C::_accessibilityLoadAccessibilityInformation>(
-         messages::_accessibilityLoadAccessibilityInformation),
-     overrides<&C::configureWithWorkoutDataCalculator>(ax::configureWithWorkoutDataCalculator)}};
-
 }  // namespace
+
+AX_CATEGORY(CHWorkoutDetailPaceTableViewCellAccessibility, "CHWorkoutDetailPaceTableViewCell",
+            overrides<&C::configureWithWorkoutDataCalculator>(ax::configureWithWorkoutDataCalculator))
 
 }  // namespace ax

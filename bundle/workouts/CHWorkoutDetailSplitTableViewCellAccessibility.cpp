@@ -7,16 +7,13 @@ namespace ax {
 namespace {
 
 // One split: its unit, its distance where that is shown, its pace.
-class CHWorkoutDetailSplitTableViewCellAccessibility
-    : public SafeCategory<CHWorkoutDetailSplitTableViewCellAccessibility> {
+class CHWorkoutDetailSplitTableViewCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto paceCell = "CHWorkoutDetailPaceTableViewCell";
-    manager.validateClassHasInstanceVariableWithType(paceCell, "_unitLabel", "Label");
-    manager.validateClassHasInstanceVariableWithType(paceCell, "_distanceLabel", "Label");
-    manager.validateClassHasInstanceVariableWithType(paceCell, "_paceLabel", "Label");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    const Contract paceCell = contract.of("CHWorkoutDetailPaceTableViewCell");
+    paceCell.instanceVariable("_unitLabel", "Label");
+    paceCell.instanceVariable("_distanceLabel", "Label");
+    paceCell.instanceVariable("_paceLabel", "Label");
   }
 
   Ref<String> accessibilityLabel() {
@@ -30,12 +27,8 @@ class CHWorkoutDetailSplitTableViewCellAccessibility
   }
 };
 
-using C = CHWorkoutDetailSplitTableViewCellAccessibility;
-
-const CategoryRegistration<C> registration{"CHWorkoutDetailSplitTableViewCellAccessibility",
-                                           "CHWorkoutDetailSplitTableViewCell",
-                                           {overrides<&C::accessibilityLabel>(messages::accessibilityLabel)}};
-
 }  // namespace
+
+AX_CATEGORY(CHWorkoutDetailSplitTableViewCellAccessibility, "CHWorkoutDetailSplitTableViewCell")
 
 }  // namespace ax

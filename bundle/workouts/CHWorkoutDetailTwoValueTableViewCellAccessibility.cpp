@@ -7,30 +7,26 @@ namespace ax {
 
 namespace {
 
-const Message<void(Ref<Object>, Ref<Object>)> configureWithTitle1Value1{"configureWithTitle1:value1:"};
-const Message<void(Ref<Object>, Ref<Object>)> configureWithTitle2Value2{"configureWithTitle2:value2:"};
-const Message<Ref<String>(Ref<Object>)> axStringForValue{"_axStringForValue:"};
-const Message<Ref<Array>()> axElements{"_axElements"};
-const Message<void(Ref<Array>)> axSetElements{"_axSetElements:"};
+constinit const Message<void(Ref<Object>, Ref<Object>)> configureWithTitle1Value1{
+    "configureWithTitle1:value1:"};
+constinit const Message<void(Ref<Object>, Ref<Object>)> configureWithTitle2Value2{
+    "configureWithTitle2:value2:"};
+constinit const Message<Ref<String>(Ref<Object>)> axStringForValue{"_axStringForValue:"};
+constinit const Message<Ref<Array>()> axElements{"_axElements"};
+constinit const Message<void(Ref<Array>)> axSetElements{"_axSetElements:"};
 
 const char elementsKey = 0;
 
 // Two figures side by side: two elements, each with its title as label and its figure as value.
-class CHWorkoutDetailTwoValueTableViewCellAccessibility
-    : public SafeCategory<CHWorkoutDetailTwoValueTableViewCellAccessibility> {
+class CHWorkoutDetailTwoValueTableViewCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "CHWorkoutDetailTwoValueTableViewCell";
-    manager.validateClassHasInstanceVariableWithType(target, "_titleLabel1", "Label");
-    manager.validateClassHasInstanceVariableWithType(target, "_titleLabel2", "Label");
-    manager.validateClassHasInstanceVariableWithType(target, "_valueLabel1", "Label");
-    manager.validateClassHasInstanceVariableWithType(target, "_valueLabel2", "Label");
-    manager.validateClassHasInstanceMethodWithFullSignature(target,
-                                                            "configureWithTitle1: value1:", {"v", "@", "@"});
-    manager.validateClassHasInstanceMethodWithFullSignature(target,
-                                                            "configureWithTitle2: value2:", {"v", "@", "@"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceVariable("_titleLabel1", "Label");
+    contract.instanceVariable("_titleLabel2", "Label");
+    contract.instanceVariable("_valueLabel1", "Label");
+    contract.instanceVariable("_valueLabel2", "Label");
+    contract.instanceMethod("configureWithTitle1: value1:", {"v", "@", "@"});
+    contract.instanceMethod("configureWithTitle2: value2:", {"v", "@", "@"});
   }
 
   bool isAccessibilityElement() { return false; }
@@ -71,18 +67,12 @@ class CHWorkoutDetailTwoValueTableViewCellAccessibility
   }
 };
 
-using C = CHWorkoutDetailTwoValueTableViewCellAccessibility;
-
-const CategoryRegistration<C> registration{
-    "CHWorkoutDetailTwoValueTableViewCellAccessibility",
-    "CHWorkoutDetailTwoValueTableViewCell",
-    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-     overrides<&C::accessibilityElements>(messages::accessibilityElements),
-     overrides<&C::configureWithTitle1Value1>(ax::configureWithTitle1Value1),
-     overrides<&C::configureWithTitle2Value2>(ax::configureWithTitle2Value2),
-     overrides<&C::_axStringForValue>(axStringForValue), overrides<&C::_axElements>(axElements),
-     overrides<&C::_axSetElements>(axSetElements)}};
-
 }  // namespace
+
+AX_CATEGORY(CHWorkoutDetailTwoValueTableViewCellAccessibility, "CHWorkoutDetailTwoValueTableViewCell",
+            overrides<&C::configureWithTitle1Value1>(ax::configureWithTitle1Value1),
+            overrides<&C::configureWithTitle2Value2>(ax::configureWithTitle2Value2),
+            overrides<&C::_axStringForValue>(axStringForValue), overrides<&C::_axElements>(axElements),
+            overrides<&C::_axSetElements>(axSetElements))
 
 }  // namespace ax

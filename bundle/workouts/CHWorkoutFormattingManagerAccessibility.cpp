@@ -6,17 +6,14 @@ namespace ax {
 
 namespace {
 
-const Message<Ref<Object>(Ref<Object>, Ref<Object>)> formattedDurationForWorkoutContext{
+constinit const Message<Ref<Object>(Ref<Object>, Ref<Object>)> formattedDurationForWorkoutContext{
     "formattedDurationForWorkout:context:"};
 
 // Gives every duration that the host writes a spoken form that is read as one.
-class CHWorkoutFormattingManagerAccessibility : public SafeCategory<CHWorkoutFormattingManagerAccessibility> {
+class CHWorkoutFormattingManagerAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    manager.validateClassHasInstanceMethodWithFullSignature(
-        "CHWorkoutFormattingManager", "formattedDurationForWorkout:context:", {"@", "@", "@"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceMethod("formattedDurationForWorkout:context:", {"@", "@", "@"});
   }
 
   Ref<Object> formattedDurationForWorkoutContext(Ref<Object> workout, Ref<Object> context) {
@@ -31,13 +28,9 @@ class CHWorkoutFormattingManagerAccessibility : public SafeCategory<CHWorkoutFor
   }
 };
 
-using C = CHWorkoutFormattingManagerAccessibility;
-
-const CategoryRegistration<C> registration{
-    "CHWorkoutFormattingManagerAccessibility",
-    "CHWorkoutFormattingManager",
-    {overrides<&C::formattedDurationForWorkoutContext>(ax::formattedDurationForWorkoutContext)}};
-
 }  // namespace
+
+AX_CATEGORY(CHWorkoutFormattingManagerAccessibility, "CHWorkoutFormattingManager",
+            overrides<&C::formattedDurationForWorkoutContext>(ax::formattedDurationForWorkoutContext))
 
 }  // namespace ax

@@ -5,15 +5,11 @@ namespace ax {
 namespace {
 
 // The header over a group of workouts: its date, then its detail.
-class CHWorkoutListTableHeaderViewAccessibility
-    : public SafeCategory<CHWorkoutListTableHeaderViewAccessibility> {
+class CHWorkoutListTableHeaderViewAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "CHWorkoutListTableHeaderView";
-    manager.validateClassHasInstanceVariableWithType(target, "_dateLabel", "Label");
-    manager.validateClassHasInstanceVariableWithType(target, "_detailLabel", "Label");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceVariable("_dateLabel", "Label");
+    contract.instanceVariable("_detailLabel", "Label");
   }
 
   bool isAccessibilityElement() { return true; }
@@ -25,15 +21,8 @@ class CHWorkoutListTableHeaderViewAccessibility
   Traits accessibilityTraits() { return super(messages::accessibilityTraits) | TraitHeader; }
 };
 
-using C = CHWorkoutListTableHeaderViewAccessibility;
-
-const CategoryRegistration<C> registration{
-    "CHWorkoutListTableHeaderViewAccessibility",
-    "CHWorkoutListTableHeaderView",
-    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-     overrides<&C::accessibilityLabel>(messages::accessibilityLabel),
-     overrides<&C::accessibilityTraits>(messages::accessibilityTraits)}};
-
 }  // namespace
+
+AX_CATEGORY(CHWorkoutListTableHeaderViewAccessibility, "CHWorkoutListTableHeaderView")
 
 }  // namespace ax

@@ -7,19 +7,14 @@ namespace ax {
 
 namespace {
 
-const Message<void()> updateUI{"_updateUI"};
+constinit const Message<void()> updateUI{"_updateUI"};
 
 // The summary on top of a workout: all its figures, the duration spoken as one.
-class CHWorkoutSummaryTableViewCellAccessibility
-    : public SafeCategory<CHWorkoutSummaryTableViewCellAccessibility> {
+class CHWorkoutSummaryTableViewCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "CHWorkoutSummaryTableViewCell";
-    manager.validateClassHasInstanceVariableWithType(target, "_durationLabel",
-                                                     "_CHWorkoutSummaryTabbedLabelContainer");
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "_updateUI", {"v"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceVariable("_durationLabel", "_CHWorkoutSummaryTabbedLabelContainer");
+    contract.instanceMethod("_updateUI", {"v"});
   }
 
   Ref<String> accessibilityLabel() {
@@ -41,15 +36,9 @@ class CHWorkoutSummaryTableViewCellAccessibility
   }
 };
 
-using C = CHWorkoutSummaryTableViewCellAccessibility;
-
-const CategoryRegistration<C> registration{"CHWorkoutSummaryTableViewCellAccessibility",
-                                           "CHWorkoutSummaryTableViewCell",
-                                           {overrides<&C::accessibilityLabel>(messages::accessibilityLabel),
-                                            overrides<&C::_accessibilityLoadAccessibilityInformation>(
-                                                messages::_accessibilityLoadAccessibilityInformation),
-                                            overrides<&C::_updateUI>(updateUI)}};
-
 }  // namespace
+
+AX_CATEGORY(CHWorkoutSummaryTableViewCellAccessibility, "CHWorkoutSummaryTableViewCell",
+            overrides<&C::_updateUI>(updateUI))
 
 }  // namespace ax

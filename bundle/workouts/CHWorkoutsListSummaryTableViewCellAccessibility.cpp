@@ -6,20 +6,16 @@ namespace ax {
 namespace {
 
 // The totals over the workout list, those that are shown.
-class CHWorkoutsListSummaryTableViewCellAccessibility
-    : public SafeCategory<CHWorkoutsListSummaryTableViewCellAccessibility> {
+class CHWorkoutsListSummaryTableViewCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "CHWorkoutsListSummaryTableViewCell";
+  static void _accessibilityPerformValidations(const Contract& contract) {
     constexpr auto container = "_CHWorkoutSummaryTabbedLabelContainer";
-    manager.validateClassIsKindOfClass(container, "View");
-    manager.validateClassHasInstanceVariableWithType(target, "_numberOfWorkoutsLabel", container);
-    manager.validateClassHasInstanceVariableWithType(target, "_activeEnergyLabel", container);
-    manager.validateClassHasInstanceVariableWithType(target, "_durationLabel", container);
-    manager.validateClassHasInstanceVariableWithType(target, "_distanceLabel", container);
-    manager.validateClassHasInstanceVariableWithType(target, "_paceLabel", container);
+    contract.of(container).isKindOf("View");
+    contract.instanceVariable("_numberOfWorkoutsLabel", container);
+    contract.instanceVariable("_activeEnergyLabel", container);
+    contract.instanceVariable("_durationLabel", container);
+    contract.instanceVariable("_distanceLabel", container);
+    contract.instanceVariable("_paceLabel", container);
   }
 
   Ref<Array> accessibilityElements() {
@@ -32,13 +28,8 @@ class CHWorkoutsListSummaryTableViewCellAccessibility
   }
 };
 
-using C = CHWorkoutsListSummaryTableViewCellAccessibility;
-
-const CategoryRegistration<C> registration{
-    "CHWorkoutsListSummaryTableViewCellAccessibility",
-    "CHWorkoutsListSummaryTableViewCell",
-    {overrides<&C::accessibilityElements>(messages::accessibilityElements)}};
-
 }  // namespace
+
+AX_CATEGORY(CHWorkoutsListSummaryTableViewCellAccessibility, "CHWorkoutsListSummaryTableViewCell")
 
 }  // namespace ax

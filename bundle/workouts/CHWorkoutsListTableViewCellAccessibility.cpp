@@ -7,21 +7,17 @@ namespace ax {
 
 namespace {
 
-const Message<void()> configureWithCurrentWorkout{"_configureWithCurrentWorkout"};
+constinit const Message<void()> configureWithCurrentWorkout{"_configureWithCurrentWorkout"};
 
 // One workout of the list, read as one element: the app that recorded it, its date in full, its figures.
-class CHWorkoutsListTableViewCellAccessibility
-    : public SafeCategory<CHWorkoutsListTableViewCellAccessibility> {
+class CHWorkoutsListTableViewCellAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "CHWorkoutsListTableViewCell";
-    manager.validateClassHasInstanceMethodWithFullSignature(target, "_configureWithCurrentWorkout", {"v"});
-    manager.validateClassHasInstanceVariableWithType(target, "_workout", "Workout");
-    manager.validateClassHasInstanceVariableWithType(target, "_dateLabel", "Label");
-    manager.validateClassHasInstanceMethodWithFullSignature("Source", "_isNorvaleWatch", {"B"});
-    manager.validateClassIsKindOfClass(target, "TableViewCell");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceMethod("_configureWithCurrentWorkout", {"v"});
+    contract.instanceVariable("_workout", "Workout");
+    contract.instanceVariable("_dateLabel", "Label");
+    contract.of("Source").instanceMethod("_isNorvaleWatch", {"B"});
+    contract.isKindOf("TableViewCell");
   }
 
   bool isAccessibilityElement() { return true; }
@@ -53,17 +49,9 @@ class CHWorkoutsListTableViewCellAccessibility
   }
 };
 
-using C = CHWorkoutsListTableViewCellAccessibility;
-
-const CategoryRegistration<C> registration{
-    "CHWorkoutsListTableViewCellAccessibility",
-    "CHWorkoutsListTableViewCell",
-    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-     overrides<&C::accessibilityLabel>(messages::accessibilityLabel),
-     overrides<&C::_accessibilityLoadAccessibilityInformation>(
-         messages::_accessibilityLoadAccessibilityInformation),
-     overrides<&C::_configureWithCurrentWorkout>(configureWithCurrentWorkout)}};
-
 }  // namespace
+
+AX_CATEGORY(CHWorkoutsListTableViewCellAccessibility, "CHWorkoutsListTableViewCell",
+            overrides<&C::_configureWithCurrentWorkout>(configureWithCurrentWorkout))
 
 }  // namespace ax

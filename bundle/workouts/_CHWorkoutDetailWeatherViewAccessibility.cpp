@@ -7,29 +7,26 @@ namespace ax {
 
 namespace {
 
-const Message<void(Ref<Object>, Ref<Object>, std::int64_t, Ref<Object>)> setWeather{
+constinit const Message<void(Ref<Object>, Ref<Object>, std::int64_t, Ref<Object>)> setWeather{
     "setTemperature:humidity:weatherCondition:formattingManager:"};
 
 // The weather strip: one summary of all it shows, then the host's attribution button.
-class CHWorkoutDetailWeatherViewAccessibility : public SafeCategory<CHWorkoutDetailWeatherViewAccessibility> {
+class CHWorkoutDetailWeatherViewAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "_CHWorkoutDetailWeatherView";
-    manager.validateClassIsKindOfClass(target, "View");
-    manager.validateClassHasInstanceVariableWithType(target, "_weatherConditionImageView", "ImageView");
-    manager.validateClassHasInstanceVariableWithType(target, "_twcButton", "Button");
-    manager.validateClassHasInstanceMethodWithFullSignature(
-        target, "setTemperature:humidity:weatherCondition:formattingManager:", {"v", "@", "@", "q", "@"});
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.isKindOf("View");
+    contract.instanceVariable("_weatherConditionImageView", "ImageView");
+    contract.instanceVariable("_twcButton", "Button");
+    contract.instanceMethod("setTemperature:humidity:weatherCondition:formattingManager:",
+                            {"v", "@", "@", "q", "@"});
   }
 
   Ref<Array> accessibilityElements() {
-    if (const Ref<Object> cached = self._accessibilityValueForKey(StorageKeyChildren))
+    if (const Ref<Object> cached = self._accessibilityValueForKey(StorageKeyChildren.get()))
       return cast<Array>(cached);
     const Ref<Object> button = self.safeValueForKey("_twcButton"_key);
     const Ref<Array> elements = axArrayByIgnoringNilElementsWithCount(2, {summaryWithout(button), button});
-    self._accessibilitySetRetainedValueForKey(elements, StorageKeyChildren);
+    self._accessibilitySetRetainedValueForKey(elements, StorageKeyChildren.get());
     return elements;
   }
 
@@ -64,14 +61,9 @@ class CHWorkoutDetailWeatherViewAccessibility : public SafeCategory<CHWorkoutDet
   }
 };
 
-using C = CHWorkoutDetailWeatherViewAccessibility;
-
-const CategoryRegistration<C> registration{
-    "_CHWorkoutDetailWeatherViewAccessibility",
-    "_CHWorkoutDetailWeatherView",
-    {overrides<&C::accessibilityElements>(messages::accessibilityElements),
-     overrides<&C::setTemperatureHumidityWeatherConditionFormattingManager>(setWeather)}};
-
 }  // namespace
+
+AX_CATEGORY(CHWorkoutDetailWeatherViewAccessibility, "_CHWorkoutDetailWeatherView",
+            overrides<&C::setTemperatureHumidityWeatherConditionFormattingManager>(setWeather))
 
 }  // namespace ax

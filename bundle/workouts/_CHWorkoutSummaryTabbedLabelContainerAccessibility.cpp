@@ -11,16 +11,12 @@ namespace {
 const char labelAttributeKey = 0;
 
 // A titled figure of a summary with its total and its average, in one element.
-class CHWorkoutSummaryTabbedLabelContainerAccessibility
-    : public SafeCategory<CHWorkoutSummaryTabbedLabelContainerAccessibility> {
+class CHWorkoutSummaryTabbedLabelContainerAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-
-  static void _accessibilityPerformValidations(Manager& manager) {
-    constexpr auto target = "_CHWorkoutSummaryTabbedLabelContainer";
-    manager.validateClassHasInstanceVariableWithType(target, "_titleText", "String");
-    manager.validateClassHasInstanceVariableWithType(target, "_totalText", "String");
-    manager.validateClassHasInstanceVariableWithType(target, "_averageText", "String");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.instanceVariable("_titleText", "String");
+    contract.instanceVariable("_totalText", "String");
+    contract.instanceVariable("_averageText", "String");
   }
 
   bool isAccessibilityElement() { return true; }
@@ -58,16 +54,10 @@ class CHWorkoutSummaryTabbedLabelContainerAccessibility
   }
 };
 
-using C = CHWorkoutSummaryTabbedLabelContainerAccessibility;
-
-const CategoryRegistration<C> registration{
-    "_CHWorkoutSummaryTabbedLabelContainerAccessibility",
-    "_CHWorkoutSummaryTabbedLabelContainer",
-    {overrides<&C::isAccessibilityElement>(messages::isAccessibilityElement),
-     overrides<&C::accessibilityLabel>(messages::accessibilityLabel),
-     overrides<&C::_accessibilityLabelAttribute>(messages::_accessibilityLabelAttribute),
-     overrides<&C::_accessibilitySetLabelAttribute>(messages::_accessibilitySetLabelAttribute)}};
-
 }  // namespace
+
+AX_CATEGORY(CHWorkoutSummaryTabbedLabelContainerAccessibility, "_CHWorkoutSummaryTabbedLabelContainer",
+            overrides<&C::_accessibilityLabelAttribute>(messages::_accessibilityLabelAttribute),
+            overrides<&C::_accessibilitySetLabelAttribute>(messages::_accessibilitySetLabelAttribute))
 
 }  // namespace ax

@@ -7,77 +7,91 @@ namespace ax {
 
 namespace {
 
-const Message<Ref<String>()> safeCategoryTargetClassName{"safeCategoryTargetClassName"};
-const Message<Ref<Object>()> safeCategoryBaseClassMessage{"safeCategoryBaseClass"};
-const Message<void(Ref<ValidationManager>)> performValidations{"_accessibilityPerformValidations:"};
+constinit const Message<Ref<String>()> safeCategoryTargetClassName{"safeCategoryTargetClassName"};
+constinit const Message<Ref<String>()> safeCategoryScreen{"safeCategoryScreen"};
+constinit const Message<Ref<Object>()> safeCategoryBaseClass{"safeCategoryBaseClass"};
+constinit const Message<void(Ref<ValidationManager>)> performValidations{"_accessibilityPerformValidations:"};
 
-const char targetNameKey = 0;
-const char validationsKey = 0;
-
-// A category's validations, kept on its class object.
-class Validations final : public Object {
- public:
-  static Class& staticClass() {
-    static Class& result = Class::add("CategoryValidations", &Object::staticClass(), nullptr);
-    return result;
-  }
-  explicit Validations(void (*function)(ValidationManager&)) : perform(function) {}
-  void (*perform)(ValidationManager&);
-};
-
-Class& safeCategoryClass() {
-  static Class& result = Class::add("SafeCategory", &Object::staticClass(), nullptr);
-  return result;
+// The receiver is one of the classes below "SafeCategory"; that class itself has no record.
+const CategoryRecord* recordOf(Object& category) {
+  return static_cast<Class&>(category).categoryRecord();
 }
 
 Ref<Object> targetNameOf(Object& category, const Method&) {
-  return category.attachedValue(&targetNameKey);
+  const CategoryRecord* record = recordOf(category);
+  return record == nullptr ? nullptr : string(std::string(record->targetClassName));
+}
+Ref<Object> screenOf(Object& category, const Method&) {
+  const CategoryRecord* record = recordOf(category);
+  return record == nullptr ? nullptr : string(std::string(record->screen));
 }
 Ref<Object> baseClassOf(Object&, const Method&) {
-  return Ref<Object>(&safeCategoryClass());
+  return Ref<Object>(Class::named("SafeCategory"_key));
 }
 void validate(Object& category, const Method&, Ref<Object> manager) {
-  const auto* validations = static_cast<const Validations*>(category.attached(&validationsKey));
+  const CategoryRecord* record = recordOf(category);
   ValidationManager* to = cast<ValidationManager>(manager.get());
-  if (validations != nullptr && to != nullptr) validations->perform(*to);
+  if (record == nullptr || record->validations == nullptr || to == nullptr) return;
+  record->validations(Contract(*to, record->targetClassName));
+}
+
+// What every category class answers stands at their base, and is not grafted with what is their own.
+Class& makeSafeCategoryClass() {
+  using registration::record;
+  Class& base = Class::add("SafeCategory", &Object::staticClass(), nullptr);
+  Class& meta = base.metaclass();
+  meta.addMethod(record<Ref<Object>>(safeCategoryTargetClassName.selector(), &targetNameOf));
+  meta.addMethod(record<Ref<Object>>(safeCategoryScreen.selector(), &screenOf));
+  meta.addMethod(record<Ref<Object>>(safeCategoryBaseClass.selector(), &baseClassOf));
+  meta.addMethod(record<void, Ref<Object>>(performValidations.selector(), &validate));
+  return base;
+}
+
+Class& safeCategoryClass() {
+  static Class& result = makeSafeCategoryClass();
+  return result;
+}
+
+Method entryOf(const Override& override) {
+  return {.selector = override.message->selector(),
+          .signature = &override.message->signature(),
+          .function = override.function(),
+          .result = override.result(),
+          .takes = override.takes};
 }
 
 }  // namespace
 
-Class& registerCategory(std::string_view name, std::string_view targetClassName,
-                        void (*validations)(ValidationManager&), std::span<const Override> overrides) {
-  const std::string categoryName(name);
-  Class& hinge = Class::add("__" + categoryName + "_super", &safeCategoryClass(), nullptr);
-  Class& category = Class::add(categoryName, &hinge, nullptr);
-  category.attach(&targetNameKey, string(std::string(targetClassName)));
-  category.attach(&validationsKey, make<Validations>(validations));
-  using registration::record;
-  Class& meta = category.metaclass();
-  meta.addMethod(record<Ref<Object>>(safeCategoryTargetClassName.selector(), &targetNameOf));
-  meta.addMethod(record<Ref<Object>>(safeCategoryBaseClassMessage.selector(), &baseClassOf));
-  meta.addMethod(record<void, Ref<Object>>(performValidations.selector(), &validate));
-  for (const Override& override : overrides) {
-    (override.isClassMethod ? meta : category).addMethod(override.method);
+Class& registerCategory(const CategoryRecord& record) {
+  const std::string name(record.name);
+  Class& hinge = Class::add("__" + name + "_super", &safeCategoryClass(), nullptr);
+  Class& category = Class::add(name, &hinge, nullptr);
+  category.setCategoryRecord(record);
+  for (const Override& override : record.overrides) {
+    (override.isClassMethod ? category.metaclass() : category).addMethod(entryOf(override));
   }
   return category;
 }
 
-const Method* safeCategoryEntry(const Class* category, Receiver object, bool* mismatch, SourcePlace place) {
-  const CategoryGraft* graft = category == nullptr ? nullptr : graftOf(*category);
+const Method* safeCategoryEntry(Selector category, Receiver object, bool* mismatch, SourcePlace place) {
+  const Class* found = Class::named(category);
+  const CategoryGraft* graft = found == nullptr ? nullptr : graftOf(*found);
   const bool isOfTarget =
       graft != nullptr && object.get() != nullptr && object.get()->isKindOf(*graft->target);
   const bool isMismatch = object.get() != nullptr && !isOfTarget;
   if (mismatch != nullptr) *mismatch = isMismatch;
-  if (isMismatch) {
-    reportCastMismatch(*object.get(), category == nullptr ? "unregistered category" : category->name(),
-                       place);
-  }
+  if (isMismatch) reportCastMismatch(*object.get(), category.name(), place);
   return isOfTarget ? &graft->entry : nullptr;
 }
 
 std::string categoryTargetClassName(Class& category) {
   const Ref<String> name = safeCategoryTargetClassName(category);
   return name ? name->text() : "";
+}
+
+std::string categoryScreen(Class& category) {
+  const Ref<String> screen = safeCategoryScreen(category);
+  return screen ? screen->text() : "";
 }
 
 void performCategoryValidations(Class& category, Ref<ValidationManager> manager) {

@@ -68,8 +68,11 @@ class ValidationManager final : public Object {
 
   void setValidationTargetName(const Ref<String>& name);
   void setOverrideProcessName(const Ref<String>& name);
+  // The screens that rely on the checks of no category.
+  void setValidationTargetScreens(std::vector<std::string> screens) { targetScreens_ = std::move(screens); }
   void setDebugBuild(bool isDebugBuild) { isDebugBuild_ = isDebugBuild; }
   const std::string& validationTargetName() const { return targetName_; }
+  const std::vector<std::string>& validationTargetScreens() const { return targetScreens_; }
   const std::string& overrideProcessName() const { return processName_; }
   bool isDebugBuild() const { return isDebugBuild_; }
 
@@ -100,6 +103,7 @@ class ValidationManager final : public Object {
   void recordLeftToHost(const CategoryGraft& graft);
 
   std::string targetName_;
+  std::vector<std::string> targetScreens_;
   std::string processName_;
   bool isDebugBuild_ = false;
   bool runsChecks_ = true;

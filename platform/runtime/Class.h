@@ -14,6 +14,8 @@
 
 namespace ax {
 
+struct CategoryRecord;
+
 // A member that is reached by name: plain functions that read and write it, and name its declared type (a
 // class name, or the type code of a scalar). The type is asked for late, so that classes may hold one
 // another.
@@ -114,6 +116,9 @@ class Class final : public Object {
   bool hideMember(std::string_view name);
   bool hasHiddenMember(Selector selector) const;  // here or in a class above
 
+  // What this class is made of as a category; null when it is none.
+  const CategoryRecord* categoryRecord() const { return categoryRecord_; }
+  void setCategoryRecord(const CategoryRecord& record) { categoryRecord_ = &record; }
   // What this class, as a category, brought to its target; null until all of it answers.
   const CategoryGraft* graft() const { return graft_.load(std::memory_order_acquire); }
   void setGraft(const CategoryGraft& graft) { graft_.store(&graft, std::memory_order_release); }
@@ -148,6 +153,7 @@ class Class final : public Object {
   mutable FirstTable<KeyReader, 32> firstReaders_;
   mutable SelectorTable<Method> methodCache_;
   mutable SelectorTable<KeyReader> keyCache_;
+  const CategoryRecord* categoryRecord_ = nullptr;
   std::atomic<const CategoryGraft*> graft_ = nullptr;
   std::deque<Method> ownedMethods_;
   std::deque<InstanceVariable> ownedVariables_;

@@ -1,25 +1,15 @@
 #include "platform/runtime/Grafting.h"
 
-#include <algorithm>
-#include <array>
 #include <deque>
 
 namespace ax {
 
 namespace {
 
-bool describesCategory(Selector selector) {
-  static const std::array anatomy = {Selector::intern("safeCategoryTargetClassName"),
-                                     Selector::intern("safeCategoryBaseClass"),
-                                     Selector::intern("_accessibilityPerformValidations:")};
-  return std::find(anatomy.begin(), anatomy.end(), selector) != anatomy.end();
-}
-
 // Keeps the entries that one table of the target is to answer.
 std::vector<const Method*> keepEntries(const Class& from, Class& onto, CategoryGraft& graft) {
   std::vector<const Method*> kept;
   from.forEachOwnMethod([&](const Method& method) {
-    if (describesCategory(method.selector)) return;
     const Method& answering = onto.lookUp(method.selector);
     if (answering.function != nullptr && answering.signature != method.signature) {
       graft.leftToHost.push_back({&method, &answering, onto.isMetaclass()});

@@ -26,10 +26,10 @@ struct CategoryGraft {
 
 // Puts every method of the category's own tables, class methods included, into the target's: from then on
 // the target's instances answer them, and a call to super inside one reaches what stood there before, or
-// what the target's superclass answers at that moment. Other threads may send messages meanwhile. The methods
-// by which a category describes itself stay behind, and so does a method whose selector the target, or a
-// class above it, answers with a method of another type: the host's senders know that type alone. A category
-// is grafted once: false when it has been before.
+// what the target's superclass answers at that moment. Other threads may send messages meanwhile. What
+// a category inherits stays behind, and so does a method whose selector the target, or a class above it,
+// answers with a method of another type: the host's senders know that type alone. A category is grafted once:
+// false when it has been before.
 bool graftCategory(Class& category, Class& target);
 
 // The graft of a category; null when it was never grafted.

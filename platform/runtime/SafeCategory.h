@@ -6,11 +6,12 @@
 
 namespace ax {
 
-// What a category's methods see: the host object that received the message, and the entry through which it
-// came. It is made per call and keeps nothing; `self` outlives it.
-class CategoryView {
+// The base of every category, which has no members of its own: what its methods see of the host object that
+// received the message, and of the entry through which it came. It is made per call and keeps nothing; `self`
+// outlives it.
+class SafeCategory {
  public:
-  CategoryView(Object& receiver, const Method& method) : self(receiver), method_(method) {}
+  SafeCategory(Object& receiver, const Method& method) : self(receiver), method_(method) {}
 
  protected:
   // What the target class answered before this category was grafted onto it.
@@ -25,12 +26,15 @@ class CategoryView {
   const Method& method_;
 };
 
-// The base of every category: C is the category itself, a view without members of its own.
+// An object seen as a category, through one of the entries that the category brought.
 template <class C>
-class SafeCategory : public CategoryView {
- public:
-  using CategoryView::CategoryView;
-};
+C seenAs(Object& object, const Method& method) {
+  if constexpr (std::is_aggregate_v<C>) {
+    return C{{object, method}};
+  } else {
+    return C(object, method);
+  }
+}
 
 namespace registration {
 
@@ -45,42 +49,41 @@ template <auto Function, class Type = decltype(Function)>
 struct CategoryMethod;
 template <auto Function, class C, class R, class... A>
 struct CategoryMethod<Function, R (C::*)(A...)> {
-  using Type = R(A...);
+  using Type = typename CanonicalFunction<R(A...)>::type;
   static CanonicalType<R> call(Object& self, const Method& method, CanonicalType<A>... arguments) {
-    return (C(self, method).*Function)(specific<A>(arguments)...);
+    return (seenAs<C>(self, method).*Function)(specific<A>(arguments)...);
   }
-  static Method make(Selector selector) { return record<R, A...>(selector, &call); }
+  static GenericFunction function() { return reinterpret_cast<GenericFunction>(&call); }
+  static constexpr auto result = &identityOf<std::remove_cvref_t<R>>;
+  static constexpr auto takes = &takesArguments<A...>;
 };
 template <auto Function, class C, class R, class... A>
-struct CategoryMethod<Function, R (C::*)(A...) const> {
-  using Type = R(A...);
-  static CanonicalType<R> call(Object& self, const Method& method, CanonicalType<A>... arguments) {
-    return (C(self, method).*Function)(specific<A>(arguments)...);
-  }
-  static Method make(Selector selector) { return record<R, A...>(selector, &call); }
-};
+struct CategoryMethod<Function, R (C::*)(A...) const> : CategoryMethod<Function, R (C::*)(A...)> {};
 
 }  // namespace registration
 
-// One override: the entry that answers a message, for instances or, if so marked, for the class itself.
+// One override as constant data: the message that it answers, and with what.
 struct Override {
-  Method method;
+  const MessageRecord* message = nullptr;
+  GenericFunction (*function)() = nullptr;
+  const void* (*result)() = nullptr;
+  bool (*takes)(std::span<const Ref<Object>>) = nullptr;
   bool isClassMethod = false;
 };
 
-// A category's method for a message of the same type; another type does not compile.
+// A category's method for a message of the same type; another type does not compile. The message lives as
+// long as the process.
 template <auto Function, class Type>
-Override overrides(const Message<Type>& message) {
-  using Given = typename registration::CategoryMethod<Function>::Type;
-  static_assert(std::is_same_v<typename registration::CanonicalFunction<Given>::type,
-                               typename registration::CanonicalFunction<Type>::type>,
+constexpr Override overrides(const Message<Type>& message) {
+  using Given = registration::CategoryMethod<Function>;
+  static_assert(std::is_same_v<typename Given::Type, typename registration::CanonicalFunction<Type>::type>,
                 "the method's type is not the message's");
-  return {registration::CategoryMethod<Function>::make(message.selector())};
+  return {&message, &Given::function, Given::result, Given::takes};
 }
 
 // The same for a class method; the receiver is the class object.
 template <auto Function, class Type>
-Override overridesClassMethod(const Message<Type>& message) {
+constexpr Override overridesClassMethod(const Message<Type>& message) {
   Override result = overrides<Function>(message);
   result.isClassMethod = true;
   return result;

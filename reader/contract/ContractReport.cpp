@@ -3,7 +3,6 @@
 #include <algorithm>
 
 #include "platform/accessibility/CategoryRegistration.h"
-#include "reader/contract/CategoryScreens.h"
 
 namespace ax::reader {
 
@@ -23,6 +22,12 @@ std::string joined(const std::vector<std::string>& names) {
 
 std::string counted(std::size_t count, const std::string& one, const std::string& many) {
   return std::to_string(count) + " " + (count == 1 ? one : many);
+}
+
+std::vector<std::string> screensOf(const ContractCheck& check, const ValidationManager& manager) {
+  if (check.category.empty()) return manager.validationTargetScreens();
+  Class* category = Class::named(check.category);
+  return category == nullptr ? std::vector<std::string>() : std::vector{categoryScreen(*category)};
 }
 
 // Of a category that stands but was not installed, the host lacks the class.
@@ -51,18 +56,19 @@ ContractReport ContractReport::ofProcess() {
 }
 
 ContractReport::ContractReport(const ValidationManager& manager) : target_(manager.validationTargetName()) {
-  for (const ContractCheck& check : manager.checks()) add(check);
+  for (const ContractCheck& check : manager.checks()) add(check, screensOf(check, manager));
   requested_ = manager.installationRequests().size();
   for (const InstallationRequest& request : manager.installationRequests()) {
     if (request.installed) {
       ++installed_;
     } else if (Class::named(request.category) != nullptr) {
-      add(missingTarget(request.category));
+      const ContractCheck missing = missingTarget(request.category);
+      add(missing, screensOf(missing, manager));
     }
   }
 }
 
-void ContractReport::add(const ContractCheck& check) {
+void ContractReport::add(const ContractCheck& check, const std::vector<std::string>& screens) {
   const std::string description = check.description();
   auto found = std::find_if(findings_.begin(), findings_.end(), [&](const ContractFinding& finding) {
     return finding.check == description && finding.expected == check.expected;
@@ -72,7 +78,7 @@ void ContractReport::add(const ContractCheck& check) {
     found = findings_.end() - 1;
   }
   if (!check.category.empty()) addOnce(found->categories, check.category);
-  for (const std::string& screen : screensOfCategory(check.category)) addOnce(found->screens, screen);
+  for (const std::string& screen : screens) addOnce(found->screens, screen);
 }
 
 std::size_t ContractReport::failures() const {

@@ -43,7 +43,7 @@ class ContractReport {
   nlohmann::ordered_json failuresJson() const;
 
  private:
-  void add(const ContractCheck& check);
+  void add(const ContractCheck& check, const std::vector<std::string>& screens);
 
   std::string target_;
   std::vector<ContractFinding> findings_;

@@ -13,6 +13,9 @@ std::unique_ptr<LoadedBundle> openBundle();
 // The same, and starts it, once in the process.
 void startBundle();
 
+// How many categories it brings.
+inline constexpr std::size_t categoryCount = 65;
+
 // A function of the module that has been opened, by the name and type under which the module exports it.
 template <class Function>
 Function* exported(const std::string& name) {

@@ -5,7 +5,9 @@
 
 #include "host/core/HostApp.h"
 #include "platform/accessibility/BundleLoader.h"
-#include "platform/accessibility/CategoryRegistration.h"
+#include "platform/accessibility/ValidationManager.h"
+#include "platform/runtime/ClassBuilder.h"
+#include "platform/runtime/Grafting.h"
 #include "reader/contract/ContractReport.h"
 #include "tests/contract/InChild.h"
 #include "tests/tour/Samples.h"
@@ -18,6 +20,7 @@ namespace {
 
 struct Overridden {
   std::string category;
+  std::string target;
   std::string selector;
   bool isClassMethod;
 };
@@ -32,7 +35,7 @@ Class& tableOf(Class& owner, const Overridden& row) {
 }
 
 Class& targetOf(const Overridden& row) {
-  return *Class::named(categoryTargetClassName(*Class::named(row.category)));
+  return *Class::named(row.target);
 }
 
 std::vector<Overridden> overridesOfInstalledCategories() {
@@ -42,9 +45,8 @@ std::vector<Overridden> overridesOfInstalledCategories() {
     for (const bool isClassMethod : {false, true}) {
       const Class& table = isClassMethod ? category->metaclass() : *category;
       table.forEachOwnMethod([&](const Method& method) {
-        const std::string name(method.selector.name());
-        if (!name.starts_with("safeCategory") && name != "_accessibilityPerformValidations:")
-          rows.push_back({category->name(), name, isClassMethod});
+        rows.push_back({category->name(), graftOf(*category)->target->name(),
+                        std::string(method.selector.name()), isClassMethod});
       });
     }
   }
@@ -126,11 +128,13 @@ std::vector<Overridden> allOverrides() {
     openModule()->start();
     std::string text;
     for (const Overridden& row : overridesOfInstalledCategories())
-      text += row.category + " " + row.selector + " " + std::to_string(row.isClassMethod) + "\n";
+      text += row.category + " " + row.target + " " + row.selector + " " + std::to_string(row.isClassMethod) +
+              "\n";
     return text;
   }));
   std::vector<Overridden> rows;
-  for (Overridden row; lines >> row.category >> row.selector >> row.isClassMethod;) rows.push_back(row);
+  for (Overridden row; lines >> row.category >> row.target >> row.selector >> row.isClassMethod;)
+    rows.push_back(row);
   return rows;
 }
 

@@ -1,6 +1,5 @@
 #include <gtest/gtest.h>
 
-#include "platform/accessibility/CategoryRegistration.h"
 #include "platform/foundation/Number.h"
 #include "platform/toolkit/AccessibilityElement.h"
 #include "platform/toolkit/Control.h"
@@ -9,6 +8,7 @@
 #include "platform/toolkit/TableViewCell.h"
 #include "platform/toolkit/ViewController.h"
 #include "tests/formatting/RegionScope.h"
+#include "tests/platform/AddedCategory.h"
 
 namespace ax {
 
@@ -24,30 +24,28 @@ class Badge : public Label {
   }
 };
 
-class BadgeAccessibility : public SafeCategory<BadgeAccessibility> {
+class BadgeAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-  static void _accessibilityPerformValidations(ValidationManager&) {}
   Ref<String> accessibilityLabel() { return string("badge " + super(messages::accessibilityLabel)->text()); }
   Traits accessibilityTraits() { return super(messages::accessibilityTraits) | TraitHeader; }
 };
 using B = BadgeAccessibility;
-const CategoryRegistration<B> registration{
-    "PropertiesTestBadgeAccessibility",
-    "PropertiesTest.Badge",
-    {overrides<&B::accessibilityLabel>(messages::accessibilityLabel),
-     overrides<&B::accessibilityTraits>(messages::accessibilityTraits)}};
+Class& badgeCategory() {
+  return addCategory({"PropertiesTestBadgeAccessibility",
+                      "PropertiesTest.Badge",
+                      {overrides<&B::accessibilityLabel>(messages::accessibilityLabel),
+                       overrides<&B::accessibilityTraits>(messages::accessibilityTraits)}});
+}
 
-class TextAccessibility : public SafeCategory<TextAccessibility> {
+class TextAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-  static void _accessibilityPerformValidations(ValidationManager&) {}
   Ref<String> accessibilityLabel() { return string("override"); }
 };
-const CategoryRegistration<TextAccessibility> textRegistration{
-    "PropertiesTestTextAccessibility",
-    "String",
-    {overrides<&TextAccessibility::accessibilityLabel>(messages::accessibilityLabel)}};
+Class& textCategory() {
+  return addCategory({"PropertiesTestTextAccessibility",
+                      "String",
+                      {overrides<&TextAccessibility::accessibilityLabel>(messages::accessibilityLabel)}});
+}
 
 TEST(AccessibilityProperties, answerInTheirOrderOfPrecedence) {
   const Ref<Badge> badge = make<Badge>();
@@ -60,7 +58,7 @@ TEST(AccessibilityProperties, answerInTheirOrderOfPrecedence) {
   EXPECT_EQ(accessibilityLabel(badge)->text(), "block default");
   badge->setText(string("changed"));
   EXPECT_EQ(accessibilityLabel(badge)->text(), "block changed") << "blocks are asked each time";
-  graftCategory(*registration.category, Badge::staticClass());
+  graftCategory(badgeCategory(), Badge::staticClass());
   EXPECT_EQ(accessibilityLabel(badge)->text(), "badge block changed");
   EXPECT_EQ(accessibilityUserDefinedLabel(badge)->text(), "set");
   _accessibilityAddTrait(badge, TraitSelected);
@@ -113,7 +111,7 @@ TEST(AccessibilityProperties, speakTheSpokenFormOfATextFirst) {
   EXPECT_EQ(accessibilityLabel(label), nullptr);
   label->setText(string("plain"));
   EXPECT_EQ(accessibilityLabel(label), label->text());
-  graftCategory(*textRegistration.category, String::staticClass());
+  graftCategory(textCategory(), String::staticClass());
   EXPECT_EQ(accessibilityLabel(label)->text(), "override") << "also of a text that carries nothing";
 }
 

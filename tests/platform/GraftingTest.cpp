@@ -6,10 +6,10 @@
 #include <atomic>
 #include <thread>
 
-#include "platform/accessibility/CategoryRegistration.h"
 #include "platform/foundation/String.h"
 #include "platform/runtime/ClassBuilder.h"
 #include "platform/runtime/KeyReading.h"
+#include "tests/platform/AddedCategory.h"
 
 namespace ax {
 
@@ -64,17 +64,15 @@ class Derived : public Base<N> {
 };
 
 template <const char* Mark>
-class Marking : public SafeCategory<Marking<Mark>> {
+class Marking : public SafeCategory {
  public:
-  using SafeCategory<Marking>::SafeCategory;
-  static void _accessibilityPerformValidations(ValidationManager&) {}
-  Text word() { return this->super(ax::word) + Mark; }
-  Text inherited() { return this->super(ax::inherited) + Mark; }
-  Text classWord() { return this->super(ax::classWord) + Mark; }
-  Text added() { return this->super(ax::added) + Mark; }
+  Text word() { return super(ax::word) + Mark; }
+  Text inherited() { return super(ax::inherited) + Mark; }
+  Text classWord() { return super(ax::classWord) + Mark; }
+  Text added() { return super(ax::added) + Mark; }
   // Asks super for another message than the one it answers.
-  Text both() { return this->super(ax::word) + "&" + this->super(ax::inherited)->text().c_str(); }
-  std::int64_t countDown(std::int64_t from) { return this->super(ax::countDown, from) + 100; }
+  Text both() { return super(ax::word) + "&" + super(ax::inherited)->text().c_str(); }
+  std::int64_t countDown(std::int64_t from) { return super(ax::countDown, from) + 100; }
 };
 
 constexpr char onBase[] = "+B";
@@ -84,12 +82,11 @@ constexpr char second[] = "+2";
 template <const char* Mark>
 Class& category(int number, const std::string& target) {
   using C = Marking<Mark>;
-  const std::array all = {
-      overrides<&C::word>(word),           overrides<&C::inherited>(inherited),
-      overrides<&C::added>(added),         overrides<&C::both>(both),
-      overrides<&C::countDown>(countDown), overridesClassMethod<&C::classWord>(classWord)};
-  return registerCategory("GraftingTest" + std::string(Mark) + std::to_string(number), target,
-                          &C::_accessibilityPerformValidations, all);
+  return addCategory({"GraftingTest" + std::string(Mark) + std::to_string(number),
+                      target,
+                      {overrides<&C::word>(word), overrides<&C::inherited>(inherited),
+                       overrides<&C::added>(added), overrides<&C::both>(both),
+                       overrides<&C::countDown>(countDown), overridesClassMethod<&C::classWord>(classWord)}});
 }
 
 template <int N>
@@ -177,28 +174,28 @@ TEST(Grafting, letsOtherThreadsSendMeanwhile) {
 
 // Three threads send what asks super for another message, while eight categories are put onto the class.
 template <std::size_t N>
-class Stacked : public SafeCategory<Stacked<N>> {
+class Stacked : public SafeCategory {
  public:
-  using SafeCategory<Stacked>::SafeCategory;
-  static void _accessibilityPerformValidations(ValidationManager&) {}
-  Text word() { return this->super(ax::word); }
-  Text inherited() { return this->super(ax::word); }
-  Text both() { return this->super(ax::inherited); }
+  Text word() { return super(ax::word); }
+  Text inherited() { return super(ax::word); }
+  Text both() { return super(ax::inherited); }
 };
 
 template <std::size_t... N>
 std::array<Class*, sizeof...(N)> stackedCategories(const std::string& target, std::index_sequence<N...>) {
   const auto make = [&]<std::size_t I>(std::integral_constant<std::size_t, I>) {
     using C = Stacked<I>;
-    std::vector<Override> all = {overrides<&C::word>(word), overrides<&C::inherited>(inherited),
-                                 overrides<&C::both>(both)};
+    Class& category = addCategory(
+        {"GraftingTestStacked" + std::to_string(I),
+         target,
+         {overrides<&C::word>(word), overrides<&C::inherited>(inherited), overrides<&C::both>(both)}});
     // So many that grafting takes its time.
     for (int i = 0; i < 300; ++i) {
-      all.push_back(overrides<&C::word>(word));
-      all.back().method.selector = Selector::intern("graftingTestMore" + std::to_string(i));
+      Method more = *category.ownMethod(word.selector());
+      more.selector = Selector::intern("graftingTestMore" + std::to_string(i));
+      category.addMethod(more);
     }
-    return &registerCategory("GraftingTestStacked" + std::to_string(I), target,
-                             &C::_accessibilityPerformValidations, all);
+    return &category;
   };
   return {make(std::integral_constant<std::size_t, N>())...};
 }
@@ -297,30 +294,30 @@ TEST(Grafting, leavesToASubclassWhatItChanged) {
   EXPECT_EQ(namesLeftBy(lower), bothWords);
 }
 
-class Viewed : public SafeCategory<Viewed> {
+class Viewed : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-  static void _accessibilityPerformValidations(ValidationManager&) {}
   Text word() { return super(ax::word) + "+V"; }
 };
-const CategoryRegistration<Viewed> viewed{
-    "GraftingTestViewed", "GraftingTest.Derived5", {overrides<&Viewed::word>(word)}};
 
 TEST(Grafting, showsAnObjectAsACategory) {
+  const Selector name = "GraftingTestViewed"_key;
   const Ref<Object> derived = make<Derived<5>>();
   const std::size_t before = castMismatches();
   testing::internal::CaptureStderr();
-  EXPECT_FALSE(castAsSafeCategory<Viewed>(derived)) << "not grafted yet";
-  graftCategory(*viewed.category, Derived<5>::staticClass());
+  EXPECT_FALSE(castAsSafeCategory<Viewed>(name, derived)) << "there is no such category yet";
+  Class& viewed =
+      addCategory({std::string(name.name()), "GraftingTest.Derived5", {overrides<&Viewed::word>(word)}});
+  EXPECT_FALSE(castAsSafeCategory<Viewed>(name, derived)) << "not grafted yet";
+  graftCategory(viewed, Derived<5>::staticClass());
   bool mismatch = true;
-  EXPECT_EQ(castAsSafeCategory<Viewed>(derived, &mismatch)->word()->text(), "base>derived+V");
+  EXPECT_EQ(castAsSafeCategory<Viewed>(name, derived, &mismatch)->word()->text(), "base>derived+V");
   EXPECT_FALSE(mismatch);
-  EXPECT_FALSE(castAsSafeCategory<Viewed>(make<Base<5>>(), &mismatch));
+  EXPECT_FALSE(castAsSafeCategory<Viewed>(name, make<Base<5>>(), &mismatch));
   EXPECT_TRUE(mismatch);
-  EXPECT_FALSE(castAsSafeCategory<Viewed>(nullptr, &mismatch));
+  EXPECT_FALSE(castAsSafeCategory<Viewed>(name, nullptr, &mismatch));
   EXPECT_FALSE(mismatch);
   testing::internal::GetCapturedStderr();
-  EXPECT_EQ(castMismatches(), before + 2);
+  EXPECT_EQ(castMismatches(), before + 3);
 }
 
 }  // namespace

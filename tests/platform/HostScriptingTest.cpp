@@ -2,11 +2,11 @@
 
 #include <stdexcept>
 
-#include "platform/accessibility/CategoryRegistration.h"
 #include "platform/foundation/Number.h"
 #include "platform/foundation/String.h"
 #include "platform/runtime/ClassBuilder.h"
 #include "platform/runtime/ScriptedAnswers.h"
+#include "tests/platform/AddedCategory.h"
 
 namespace ax {
 
@@ -47,18 +47,17 @@ class Archive : public Folder {
   std::int64_t size() const { return 99; }
 };
 
-class FolderAccessibility : public SafeCategory<FolderAccessibility> {
+class FolderAccessibility : public SafeCategory {
  public:
-  using SafeCategory::SafeCategory;
-  static void _accessibilityPerformValidations(ValidationManager&) {}
   Ref<String> nameOf(std::int64_t index) {
     return string("spoken " + super(ax::nameOf, index)->description());
   }
 };
-const CategoryRegistration<FolderAccessibility> registration{
-    "ScriptingTestFolderAccessibility",
-    "ScriptingTest.Folder",
-    {overrides<&FolderAccessibility::nameOf>(nameOf)}};
+Class& folderCategory() {
+  return addCategory({"ScriptingTestFolderAccessibility",
+                      "ScriptingTest.Folder",
+                      {overrides<&FolderAccessibility::nameOf>(nameOf)}});
+}
 
 TEST(ScriptedAnswers, standBelowGraftsForOneObject) {
   const Ref<Folder> plain = make<Folder>();
@@ -69,7 +68,7 @@ TEST(ScriptedAnswers, standBelowGraftsForOneObject) {
   EXPECT_TRUE(setScriptedAnswer(*scripted, nameOf.selector(), echo));
   EXPECT_EQ(nameOf(scripted, 7)->text(), "answer 7");
   EXPECT_EQ(nameOf(plain, 7)->text(), "file 7");
-  graftCategory(*registration.category, Folder::staticClass());
+  graftCategory(folderCategory(), Folder::staticClass());
   EXPECT_EQ(nameOf(scripted, 7)->text(), "spoken answer 7");
   EXPECT_EQ(nameOf(plain, 7)->text(), "spoken file 7");
   const Ref<Folder> late = make<Folder>();

@@ -2,9 +2,9 @@
 
 #include <gtest/gtest.h>
 
-#include "platform/accessibility/CategoryRegistration.h"
 #include "platform/accessibility/Notifications.h"
 #include "platform/toolkit/Label.h"
+#include "tests/platform/AddedCategory.h"
 
 namespace ax {
 
@@ -119,20 +119,23 @@ TEST(ValidationManager, namesWhatFails) {
 }
 
 template <int N>
-class Category : public SafeCategory<Category<N>> {
+class Category : public SafeCategory {
  public:
-  using SafeCategory<Category>::SafeCategory;
-  static void _accessibilityPerformValidations(ValidationManager& manager) {
-    manager.validateClass("View");
-    manager.validateClassHasInstanceVariableWithType(screen, "_gone" + std::to_string(N), "Label");
+  static void _accessibilityPerformValidations(const Contract& contract) {
+    contract.of("View").exists();
+    contract.instanceVariable("_gone" + std::to_string(N), "Label");
   }
-  Ref<String> reply() { return string(this->super(ax::reply)->text() + " " + std::to_string(N)); }
+  Ref<String> reply() { return string(super(ax::reply)->text() + " " + std::to_string(N)); }
 };
 
 template <int N>
 Class& registerNumbered(const char* name, const char* target) {
-  const Override override = overrides<&Category<N>::reply>(reply);
-  return registerCategory(name, target, &Category<N>::_accessibilityPerformValidations, {&override, 1});
+  using C = Category<N>;
+  return addCategory({name,
+                      target,
+                      {overrides<&C::reply>(reply)},
+                      &C::_accessibilityPerformValidations,
+                      "Screen " + std::to_string(N)});
 }
 
 void startWith(ValidationManager& manager, bool checks, const ValidationManager::Handler& installation) {
@@ -170,7 +173,11 @@ TEST(ValidationManager, installsInOrderWhateverIsMissing) {
   EXPECT_EQ(failed[0].category, "");
   EXPECT_EQ(failed[1].category, "ValidationTestOne");
   EXPECT_EQ(failed[1].member, "_gone1");
+  EXPECT_EQ(failed[1].className, screen);
   EXPECT_EQ(failed[2].category, "ValidationTestThree");
+  EXPECT_EQ(categoryScreen(*Class::named("ValidationTestThree")), "Screen 3");
+  EXPECT_EQ(categoryTargetClassName(*Class::named("ValidationTestTwo")), nobody);
+  EXPECT_EQ(categoryScreen(View::staticClass()) + categoryScreen(*Class::named("SafeCategory")), "");
 }
 
 TEST(ValidationManager, missesTheClassOfAMember) {

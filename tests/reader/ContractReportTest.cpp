@@ -2,26 +2,25 @@
 
 #include <gtest/gtest.h>
 
-#include "platform/accessibility/CategoryRegistration.h"
-#include "reader/contract/CategoryScreens.h"
+#include "tests/platform/AddedCategory.h"
 
 namespace ax::reader {
 namespace {
 
-void checkTitle(ValidationManager& manager) {
-  manager.validateClassHasInstanceVariableWithType("View", "_title", "String");
-  manager.validateClass("Label");
+void checkTitle(const Contract& contract) {
+  contract.of("View").instanceVariable("_title", "String");
+  contract.exists();
 }
 
-// Two categories with real names and the same check, and one whose host class is missing.
-void registerCategories() {
-  registerCategory("TrendListMetricViewAccessibility", "Label", checkTitle, {});
-  registerCategory("LoadingViewAccessibility", "Label", checkTitle, {});
-  registerCategory("TrendListHeaderViewAccessibility", "Tests.NoSuchHeader", checkTitle, {});
+// Two categories with the same check, and one whose host class is missing.
+void addCategories() {
+  addCategory({"ReportTestMetricAccessibility", "Label", {}, checkTitle, "Trends"});
+  addCategory({"ReportTestLoadingAccessibility", "Label", {}, checkTitle, "Loading"});
+  addCategory({"ReportTestHeaderAccessibility", "Tests.NoSuchHeader", {}, checkTitle, "Trends"});
 }
 
 TEST(ContractReport, GroupsChecksAndNamesTheScreens) {
-  registerCategories();
+  addCategories();
   const Ref<ValidationManager> manager = make<ValidationManager>();
   manager->performValidationsWithPreValidationHandlerPostValidationHandlerSafeCategoryInstallationHandler(
       [](ValidationManager& m) { return m.validateClass("Button"); },
@@ -31,8 +30,8 @@ TEST(ContractReport, GroupsChecksAndNamesTheScreens) {
       },
       nullptr,
       [](ValidationManager& m) {
-        for (const char* name : {"TrendListMetricViewAccessibility", "LoadingViewAccessibility",
-                                 "TrendListHeaderViewAccessibility", "NotBuiltYetAccessibility"}) {
+        for (const char* name : {"ReportTestMetricAccessibility", "ReportTestLoadingAccessibility",
+                                 "ReportTestHeaderAccessibility", "ReportTestNotBuiltYetAccessibility"}) {
           m.installSafeCategoryCanInteractWithTargetClass(name, true);
         }
       });
@@ -42,11 +41,11 @@ TEST(ContractReport, GroupsChecksAndNamesTheScreens) {
             "Target\n"
             "ok      Button exists\n"
             "FAILED  View has instance variable _title: expected String, found no such member\n"
-            "          relied on by TrendListMetricViewAccessibility, LoadingViewAccessibility\n"
+            "          relied on by ReportTestMetricAccessibility, ReportTestLoadingAccessibility\n"
             "          screens: Trends, Loading\n"
             "ok      Label exists\n"
             "FAILED  Tests.NoSuchHeader exists: expected a class, found no such class\n"
-            "          relied on by TrendListHeaderViewAccessibility\n"
+            "          relied on by ReportTestHeaderAccessibility\n"
             "          screens: Trends\n"
             "2 checks passed, 2 failed; 2 of 4 categories installed\n"
             "Screens that lose speech: Trends, Loading\n");
@@ -57,10 +56,11 @@ TEST(ContractReport, GroupsChecksAndNamesTheScreens) {
 
 TEST(ContractReport, ChecksOfTheWholeBundleNameTheirScreens) {
   const Ref<ValidationManager> manager = make<ValidationManager>();
+  manager->setValidationTargetScreens({"Month calendar", "Week palette"});
   manager->validateClass("Tests.NoSuchCache");
   const ContractReport report(*manager);
   EXPECT_NE(report.text().find("relied on by the bundle as a whole\n"
-                               "          screens: Month calendar, Week palette, Day list\n"),
+                               "          screens: Month calendar, Week palette\n"),
             std::string::npos);
 }
 
@@ -75,17 +75,16 @@ TEST(ContractReport, TellsWhatIsLeftToTheHost) {
   const Selector selector = Selector::intern("testsChangedMethod");
   Class& host = Class::add("Tests.ChangedHost", &Object::staticClass(), nullptr);
   host.addMethod(registration::record<double, bool>(selector, &hostsOwn));
-  const Override override{registration::record<Ref<Object>>(selector, &categorys)};
-  registerCategory("MonthWeekViewAccessibility", "Tests.ChangedHost", [](ValidationManager&) {},
-                   {&override, 1});
+  addCategory({"ReportTestMonthAccessibility", "Tests.ChangedHost", {}, nullptr, "Month calendar"})
+      .addMethod(registration::record<Ref<Object>>(selector, &categorys));
   const Ref<ValidationManager> manager = make<ValidationManager>();
-  manager->installSafeCategoryCanInteractWithTargetClass("MonthWeekViewAccessibility", true);
+  manager->installSafeCategoryCanInteractWithTargetClass("ReportTestMonthAccessibility", true);
   EXPECT_EQ(ContractReport(*manager).text(),
             "\n"
             "FAILED  Tests.ChangedHost takes override of instance method testsChangedMethod: expected @, "
             "found d B, "
             "left to the host\n"
-            "          relied on by MonthWeekViewAccessibility\n"
+            "          relied on by ReportTestMonthAccessibility\n"
             "          screens: Month calendar\n"
             "0 checks passed, 1 failed; 1 of 1 category installed\n"
             "Screens that lose speech: Month calendar\n");
