@@ -1,5 +1,7 @@
 #include <gtest/gtest.h>
 
+#include <cstdlib>
+#include <fstream>
 #include <random>
 
 #include "host/core/HostApp.h"
@@ -62,6 +64,66 @@ std::string ride(bool isBigEndian, int headerSize) {
   file.add(4, {at(100), at(0), 2, 100500, 80500, 40123, 12, 131, 172, 210, 77});
   file.define(5, 34, {{253, fitU32, 4}, {5, fitU32, 4}}).add(5, {at(100), at(100) - 5 * 3600});
   return file.file(headerSize);
+}
+
+std::string spoken(const WorkoutActivity& activity, const std::string& locale) {
+  host::linkHost();
+  const Scene scene = readSceneDocument(workoutScene(activity, {.locale = locale}), "test");
+  const SceneRun run(scene, {.modulePath = tour::modulePath()});
+  std::string text;
+  for (const std::string& line : transcript(takeSnapshot(run.screen()), run.title())) text += line + "\n";
+  return text;
+}
+
+// 200 meters in a pool of 25, a rest in the middle, by a clock one hour east of UTC.
+std::string poolSwim() {
+  FitWriter file;
+  file.define(0, 20, {{253, fitU32, 4}, {3, fitU8, 1}, {5, fitU32, 4}});
+  for (int second = 0; second <= 270; second += 5) {
+    const int swum = second < 120 ? second : std::max(120, second - 30);
+    file.add(0, {at(second), 112 + swum / 8, swum * 20000 / 240});
+  }
+  file.define(1, 101, {{253, fitU32, 4}, {2, fitU32, 4}, {4, fitU32, 4}, {7, fitEnum, 1}, {12, fitEnum, 1}});
+  constexpr int freestyle = 0, breaststroke = 2, noStroke = 255;
+  int begin = 0;
+  const auto add = [&](int seconds, int stroke) {
+    file.add(1, {at(begin + seconds), at(begin), seconds * 1000, stroke, stroke == noStroke ? 0 : 1});
+    begin += seconds;
+  };
+  for (const int seconds : {28, 30, 30, 32}) add(seconds, freestyle);
+  add(30, noStroke);
+  for (const int seconds : {29, 30, 30, 31}) add(seconds, breaststroke);
+  file.define(2, 18,
+              {{253, fitU32, 4},
+               {2, fitU32, 4},
+               {5, fitEnum, 1},
+               {7, fitU32, 4},
+               {8, fitU32, 4},
+               {9, fitU32, 4},
+               {11, fitU16, 2},
+               {44, fitU16, 2}});
+  file.add(2, {at(270), at(0), 5, 270000, 240000, 20000, 38, 2500});
+  file.define(3, 34, {{253, fitU32, 4}, {5, fitU32, 4}}).add(3, {at(270), at(270) + 3600});
+  return file.file();
+}
+
+// With AXVELTO_WRITE_SAMPLES in the environment it is written anew.
+TEST(FitFile, IsTheSampleOfThePool) {
+  const auto sample = tour::samplesFolder() / "workouts/pool-swim.fit";
+  if (std::getenv("AXVELTO_WRITE_SAMPLES") != nullptr) {
+    std::ofstream(sample, std::ios::binary) << poolSwim();
+  }
+  EXPECT_TRUE(tour::fileText(sample) == poolSwim());
+}
+
+TEST(WorkoutScene, RoundsADistanceOnceWhenItIsSpoken) {
+  WorkoutActivity activity = fileOf(ride(false, 14)).activities.at(0);
+  const std::pair<double, const char*> distances[] = {
+      {15964.9, "Distance, Total, 15.96 k"}, {15964.999, "15.96 k"}, {15965, "Distance, Total, 15.97 k"}};
+  for (const auto& [metres, expected] : distances) {
+    activity.metres = metres;
+    EXPECT_NE(spoken(activity, "en_AU").find(expected), std::string::npos) << metres;
+  }
 }
 
 TEST(FitFile, TellsASessionInEitherByteOrder) {
@@ -141,12 +203,7 @@ TEST(FitFile, MakesAWorkoutOfEachSession) {
   EXPECT_EQ(triathlon.activities[1].start, seven + 120);
   EXPECT_EQ(triathlon.activities[1].points.size(), 18U);
 
-  host::linkHost();
-  const Json json = workoutScene(swim, {.locale = "en_US"});
-  const Scene scene = readSceneDocument(json, "swim");
-  const SceneRun run(scene, {.modulePath = tour::modulePath()});
-  std::string text;
-  for (const std::string& line : transcript(takeSnapshot(run.screen()), run.title())) text += line + "\n";
+  const std::string text = spoken(swim, "en_US");
   EXPECT_NE(text.find("Length 1, breaststroke, 25 meters, 2 minutes per 100 meters"), std::string::npos)
       << text;
   EXPECT_NE(text.find("Length 2, rest, 20 seconds"), std::string::npos) << text;
