@@ -198,7 +198,7 @@ TEST_F(CommandFaults, AReportOfTheContractAddsUp) {
   EXPECT_EQ(told, atRisk);
   const std::string text = run(without).out;
   EXPECT_NE(text.find(std::to_string(checks.size() - failed) + " checks passed, " + std::to_string(failed) +
-                      " failed; " + report["installed"].dump() + " of " + std::to_string(categoryCount) +
+                      " failed; " + report["installed"].dump() + " of " + std::to_string(categoryCount()) +
                       " categories installed"),
             std::string::npos);
 }

@@ -3,8 +3,10 @@
 #include <gtest/gtest.h>
 
 #include <filesystem>
+#include <fstream>
 
 #include "host/core/HostApp.h"
+#include "tests/tour/Samples.h"
 
 namespace ax {
 
@@ -21,6 +23,16 @@ void startBundle() {
   const auto bundle = openBundle();
   ASSERT_NE(bundle, nullptr);
   bundle->start();
+}
+
+// Each stands at the beginning of a line, with its checks behind blanks; the first line is of none.
+std::size_t categoryCount() {
+  std::ifstream table(tour::samplesFolder().parent_path() / "tests/contract/checks.txt");
+  std::size_t count = 0;
+  for (std::string line; std::getline(table, line);) {
+    if (!line.starts_with(' ') && !line.starts_with('(')) ++count;
+  }
+  return count;
 }
 
 }  // namespace ax

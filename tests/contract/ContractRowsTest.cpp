@@ -110,8 +110,8 @@ TEST(ContractRows, AHealthyHostHoldsThemAll) {
     EXPECT_TRUE(finding.passed) << finding.check << ": expected " << finding.expected << ", found "
                                 << finding.found;
   }
-  EXPECT_EQ(report.installed(), categoryCount);
-  EXPECT_EQ(report.requested(), categoryCount);
+  EXPECT_EQ(report.installed(), categoryCount());
+  EXPECT_EQ(report.requested(), categoryCount());
 }
 
 // In shares, so that they can run side by side.

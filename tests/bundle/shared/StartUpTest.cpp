@@ -42,7 +42,7 @@ class StartUpTest : public testing::Test {
 TEST_F(StartUpTest, AsksForEveryCategoryOnceAndInOrder) {
   bundle_->start();
   const auto& requests = manager_->installationRequests();
-  ASSERT_EQ(requests.size(), categoryCount);
+  ASSERT_EQ(requests.size(), categoryCount());
   EXPECT_EQ(requests[0].category, "CHWorkoutsListSummaryTableViewCellAccessibility");
   EXPECT_EQ(requests[30].category, "_CHWorkoutDetailWeatherViewAccessibility");
   EXPECT_EQ(requests[58].category, "MonthDayCellLayerAccessibility");
@@ -59,7 +59,7 @@ TEST_F(StartUpTest, AsksForEveryCategoryOnceAndInOrder) {
   const std::size_t checks = manager_->checks().size();
   bundle_->start();
   EXPECT_EQ(manager_->starts(), 1u);
-  EXPECT_EQ(manager_->installationRequests().size(), categoryCount);
+  EXPECT_EQ(manager_->installationRequests().size(), categoryCount());
   EXPECT_EQ(manager_->checks().size(), checks);
 }
 
@@ -99,7 +99,7 @@ TEST_F(StartUpTest, InstallsWithoutChecksWhereChecksAreOff) {
   const EnvironmentScope environment(Environment{.checks = false});
   bundle_->start();
   EXPECT_TRUE(manager_->checks().empty());
-  EXPECT_EQ(manager_->installationRequests().size(), categoryCount);
+  EXPECT_EQ(manager_->installationRequests().size(), categoryCount());
   EXPECT_TRUE(isInstalled("AX_VeltoNSStringAccessibility"));
 }
 
@@ -113,7 +113,7 @@ TEST_F(StartUpTest, EveryThreadReturnsAfterTheOneStart) {
     });
   }
   for (std::thread& thread : threads) thread.join();
-  EXPECT_EQ(seen, std::vector<std::size_t>(4, categoryCount));
+  EXPECT_EQ(seen, std::vector<std::size_t>(4, categoryCount()));
   EXPECT_EQ(manager_->starts(), 1u);
 }
 
