@@ -6,7 +6,7 @@ import time
 import pyatspi
 
 import expected
-from desktop import xdotool
+from desktop import PATIENCE, xdotool
 
 KEYS = """Tab Tab Tab shift+Tab Right Right Left Up Down Return Return Escape Home End h shift+h b shift+b
 c shift+c 1 2 5 8 ctrl+plus ctrl+minus ctrl+0 F1 Escape alt F10 space""".split()
@@ -90,7 +90,7 @@ def reading(opened, reader, lines):
         def is_said(texts):
             return all(piece in expected.bare(" ".join(texts)) for piece in pieces)
 
-        if not speech.wait_for(is_said, since, 8):
+        if not speech.wait_for(is_said, since, PATIENCE):
             yield f"after \"{lines[place + 1]}\" was to be heard: {[text for _, text in speech.said(since)]}", None
         elif len(wanted) > 1:
             delays.append(speech.said(since)[0][0] - pressed)

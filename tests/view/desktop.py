@@ -12,6 +12,9 @@ import pyatspi  # noqa: E402
 from gi.repository import Gdk  # noqa: E402
 
 
+PATIENCE = 30  # seconds that a busy machine may take
+
+
 def until(test, seconds, what):
     """Waits until the test answers something, and answers that."""
     end = time.monotonic() + seconds
@@ -35,6 +38,7 @@ class Window:
         self.log_path = log
         environment = dict(os.environ, QT_LINUX_ACCESSIBILITY_ALWAYS_ON="1", QT_QPA_PLATFORM="xcb")
         environment.pop("AT_SPI_BUS_ADDRESS", None)
+        environment.setdefault("PULSE_SERVER", "unix:/nonexistent")
         # The desktop's own libraries leave memory behind when they end.
         environment["ASAN_OPTIONS"] = "detect_leaks=0"
         with open(log, "w") as out:
@@ -72,6 +76,9 @@ class Window:
     def picture(self):
         x, y, width, height = self.geometry()
         return Gdk.pixbuf_get_from_window(Gdk.get_default_root_window(), x, y, width, height)
+
+    def title(self):
+        return xdotool("getwindowname", self.id).strip()
 
     def end(self):
         if self.is_running():
@@ -123,6 +130,13 @@ class ScreenReader:
             if self.speech.count() != count:
                 count, since = self.speech.count(), time.monotonic()
         return count
+
+    def meets(self, title, since):
+        """Waits until it speaks of a window: then it is done with the keys of the one before."""
+        heard = self.speech.wait_for(lambda texts: any(title in text for text in texts), since, 2 * PATIENCE)
+        if not heard:
+            raise AssertionError(f"\"{title}\" was not heard: {self.speech.said(since)[-20:]}")
+        self.rest(1)
 
     def close(self):
         self.process.terminate()
