@@ -13,17 +13,26 @@ class SafeCategory {
  public:
   SafeCategory(Object& receiver, const Method& method) : self(receiver), method_(method) {}
 
+  // Whether what was replaced has raised something in this call.
+  bool superHasRaised() const { return superHasRaised_; }
+
  protected:
   // What the target class answered before this category was grafted onto it.
   template <class R, class... A>
   R super(const Message<R(A...)>& message, std::type_identity_t<A>... arguments) const {
-    return message.call(self, superMethod(method_, message.selector()), std::move(arguments)...);
+    try {
+      return message.call(self, superMethod(method_, message.selector()), std::move(arguments)...);
+    } catch (...) {
+      superHasRaised_ = true;
+      throw;
+    }
   }
 
   Object& self;
 
  private:
   const Method& method_;
+  mutable bool superHasRaised_ = false;
 };
 
 // An object seen as a category, through one of the entries that the category brought.
@@ -45,13 +54,26 @@ struct CanonicalFunction<R(A...)> {
   using type = CanonicalType<R>(CanonicalType<A>...);
 };
 
+// Runs a category's method. What it raises counts as nil, NO or 0, except what came out of the method that it
+// replaced: the host's senders get that as they would without the category.
+template <auto Function, class C, class R, class... A>
+CanonicalType<R> answerOfCategory(Object& self, const Method& method, CanonicalType<A>&... arguments) {
+  C view = seenAs<C>(self, method);
+  try {
+    return (view.*Function)(specific<A>(arguments)...);
+  } catch (...) {
+    if (view.superHasRaised()) throw;
+    return CanonicalType<R>();
+  }
+}
+
 template <auto Function, class Type = decltype(Function)>
 struct CategoryMethod;
 template <auto Function, class C, class R, class... A>
 struct CategoryMethod<Function, R (C::*)(A...)> {
   using Type = typename CanonicalFunction<R(A...)>::type;
   static CanonicalType<R> call(Object& self, const Method& method, CanonicalType<A>... arguments) {
-    return (seenAs<C>(self, method).*Function)(specific<A>(arguments)...);
+    return answerOfCategory<Function, C, R, A...>(self, method, arguments...);
   }
   static GenericFunction function() { return reinterpret_cast<GenericFunction>(&call); }
   static constexpr auto result = &identityOf<std::remove_cvref_t<R>>;

@@ -2,7 +2,7 @@
 
 #include <cstddef>
 
-#include "platform/runtime/Message.h"
+#include "platform/runtime/SafeMessage.h"
 
 // How far a host's objects are followed into one another. A host may answer with the object that it was asked
 // for, or make a new one at each question, and then there would be no end.
@@ -36,12 +36,12 @@ class PartQuestion {
 };
 
 // What a part of `whole` answers, for an answer of the whole's own to the same message; nil, NO or 0 when the
-// part is the whole itself, or is being asked already.
+// part is the whole itself, is being asked already, or raises.
 template <class R>
 R answerOfPart(const Message<R()>& message, Receiver whole, Receiver part) {
   const PartQuestion beingAsked(message.selector(), whole);
   const PartQuestion question(message.selector(), part);
-  return question.mayBePut() ? message(part) : R();
+  return question.mayBePut() ? safeAnswer(message, part) : R();
 }
 
 }  // namespace ax

@@ -4,6 +4,8 @@
 
 #include <array>
 #include <atomic>
+#include <stdexcept>
+#include <string>
 #include <thread>
 
 #include "platform/foundation/String.h"
@@ -318,6 +320,36 @@ TEST(Grafting, showsAnObjectAsACategory) {
   EXPECT_FALSE(mismatch);
   testing::internal::GetCapturedStderr();
   EXPECT_EQ(castMismatches(), before + 3);
+}
+
+// A host method that raises, and a category that raises by itself, by way of another object, or not at all.
+class Raising : public Base<11> {
+ public:
+  static Class& staticClass() {
+    static Class& result = ClassBuilder<Raising>("GraftingTest.Raising", Base<11>::staticClass())
+                               .method<&Raising::inherited>("graftingTestInherited")
+                               .build();
+    return result;
+  }
+  Text inherited() { throw std::runtime_error("the host"); }
+};
+class OnRaising : public SafeCategory {
+ public:
+  Text inherited() { return super(ax::inherited); }
+  Text word() { return ax::inherited(make<Raising>()); }
+  std::int64_t countDown(std::int64_t from) { return super(ax::countDown, from) + std::stoi("no number"); }
+};
+TEST(Grafting, letsNothingOutButWhatSuperRaises) {
+  using C = OnRaising;
+  Class& category = addCategory({"GraftingTestOnRaising",
+                                 "GraftingTest.Raising",
+                                 {overrides<&C::inherited>(inherited), overrides<&C::word>(word),
+                                  overrides<&C::countDown>(countDown)}});
+  graftCategory(category, Raising::staticClass());
+  const Ref<Object> object = make<Raising>();
+  EXPECT_THROW(inherited(object), std::runtime_error);
+  EXPECT_EQ(word(object), nullptr) << "another object's method has raised";
+  EXPECT_EQ(countDown(object, 3), 0) << "and here the category itself";
 }
 
 }  // namespace
