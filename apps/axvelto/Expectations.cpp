@@ -1,8 +1,8 @@
 #include "apps/axvelto/Expectations.h"
 
 #include <fstream>
-#include <iostream>
 
+#include "apps/shared/Complaint.h"
 #include "apps/shared/Input.h"
 #include "reader/graph/ChartDescription.h"
 #include "reader/scene/Expectation.h"
@@ -105,10 +105,8 @@ bool holds(const Scene& scene, const Outcome& outcome) {
   }
   if (scene.expect) add(reader::differences(*scene.expect, outcome.whole, "/expect"));
   for (const Difference& difference : all) {
-    std::cerr << reader::Fault{scene.file, difference.place, shown(difference.found),
-                               shown(difference.expected)}
-                     .text()
-              << '\n';
+    complain(
+        reader::Fault{scene.file, difference.place, shown(difference.found), shown(difference.expected)});
   }
   return all.empty();
 }

@@ -5,6 +5,7 @@
 #include "apps/axvelto/Command.h"
 #include "apps/axvelto/Output.h"
 #include "apps/axvelto/Progress.h"
+#include "apps/shared/Complaint.h"
 #include "apps/shared/Input.h"
 #include "apps/shared/Workouts.h"
 
@@ -62,7 +63,7 @@ bool addAll(const std::vector<std::string>& files, const Arguments& arguments, W
       isWhole = false;
       progress.clear();
       if (files.size() == 1) throw;
-      std::cerr << fault.text() << '\n';
+      complain(fault);
     }
   }
   return isWhole;

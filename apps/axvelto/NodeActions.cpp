@@ -4,6 +4,7 @@
 #include <optional>
 
 #include "apps/axvelto/Output.h"
+#include "apps/shared/Complaint.h"
 #include "platform/accessibility/Notifications.h"
 #include "reader/snapshot/HostQuestions.h"
 #include "reader/speech/SpokenLine.h"
@@ -76,9 +77,9 @@ std::string actionsOf(const Node& node) {
 ExitCode fail(ActionResult result, const WantedAction& wanted, const Node& node, const std::string& file) {
   const std::string of = std::string(actionName(wanted.action)) + " of \"" + wanted.target + "\"";
   if (result == ActionResult::unavailable) {
-    std::cerr << Fault{file, "", "no " + of, actionsOf(node)}.text() << '\n';
+    complain(Fault{file, "", "no " + of, actionsOf(node)});
   } else if (result == ActionResult::raised) {
-    std::cerr << Fault{file, "", "the host raised in " + of, "an answer"}.text() << '\n';
+    complain(Fault{file, "", "the host raised in " + of, "an answer"});
   } else {
     std::cout << readerText(result == ActionResult::gone ? "element.gone" : "action.nothing") << '\n';
   }

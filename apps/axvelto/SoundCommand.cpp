@@ -1,9 +1,9 @@
-#include <iostream>
 
 #include "apps/axvelto/Command.h"
 #include "apps/axvelto/Progress.h"
 #include "apps/axvelto/SceneCharts.h"
 #include "apps/axvelto/SoundOutput.h"
+#include "apps/shared/Complaint.h"
 #include "reader/sound/ChartSound.h"
 
 namespace ax::app {
@@ -27,7 +27,7 @@ ExitCode run(const Arguments& arguments) {
   const SceneCharts charts(presentation, arguments.chart);
   const std::string& file = presentation.scene().file;
   if (charts.found().empty()) {
-    std::cerr << "axvelto: " << file << ": no chart, so there is nothing to hear\n";
+    complain(file + ": no chart, so there is nothing to hear");
     return exitFallsShort;
   }
   tellOfMissingVoice(file);

@@ -1,9 +1,9 @@
 #include "apps/axvelto/SoundOutput.h"
 
 #include <fstream>
-#include <iostream>
 #include <utility>
 
+#include "apps/shared/Complaint.h"
 #include "platform/formatting/Region.h"
 #include "reader/sound/Speech.h"
 #include "reader/text/Fault.h"
@@ -34,7 +34,7 @@ void SoundOutput::write() {
 void tellOfMissingVoice(const std::string& file) {
   const std::string& locale = formatting::currentRegion().locale;
   if (reader::hasVoice(locale)) return;
-  std::cerr << "axvelto: " << file << ": no voice reads " << locale << ", so only the tones are heard\n";
+  complain(file + ": no voice reads " + locale + ", so only the tones are heard");
 }
 
 }  // namespace ax::app

@@ -30,7 +30,7 @@ int runCommand(const Command& command, const Arguments& arguments) {
     if (std::cout.flush()) return code;
     complain("standard output: cannot be written, expected room for the result");
   } catch (const ax::reader::Fault& fault) {
-    std::cerr << fault.text() << '\n';
+    complain(fault);
   } catch (const std::exception& error) {
     complain(std::string(command.name) + ": " + error.what());
   }

@@ -41,7 +41,8 @@ void Presentation::tellOf(std::size_t timesRaised) const {
   };
   tell("the host raised while it was asked", timesRaised);
   static std::size_t told = 0;
-  tell("what lies deeper than " + std::to_string(deepestLevel) + " levels was left out",
+  tell("what lies deeper than " + std::to_string(deepestLevel) + " levels, or behind " +
+           std::to_string(mostObjects) + " objects, was left out",
        timesTooDeep() - told);
   told = timesTooDeep();
 }

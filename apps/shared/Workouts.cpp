@@ -2,10 +2,10 @@
 
 #include <algorithm>
 #include <cmath>
-#include <iostream>
 #include <optional>
 #include <utility>
 
+#include "apps/shared/Complaint.h"
 #include "apps/shared/Input.h"
 #include "reader/importers/FileKind.h"
 #include "reader/importers/Unpacking.h"
@@ -22,10 +22,6 @@ namespace {
 
 constexpr const char* formats = "a scene or a workout in FIT, TCX or GPX";
 constexpr const char* workoutFormats = "a workout in FIT, TCX or GPX";
-
-void tell(const Fault& fault) {
-  std::cerr << fault.text() << '\n';
-}
 
 bool isWorkout(FileKind kind) {
   return kind == FileKind::fit || kind == FileKind::xml;
@@ -65,7 +61,8 @@ void Workouts::add(const std::string& name, std::string_view bytes) {
   }
   auto& file = std::get<reader::WorkoutFile>(result);
   if (file.damage)
-    tell({name, file.damage->place, file.damage->what + ", read as far as it goes", file.damage->expected});
+    complain(Fault{name, file.damage->place, file.damage->what + ", read as far as it goes",
+                   file.damage->expected});
   for (WorkoutActivity& activity : file.activities) {
     if (!isKnown(name, activity)) keep(name, std::move(activity));
   }
@@ -82,7 +79,7 @@ bool Workouts::isKnown(const std::string& file, const WorkoutActivity& activity)
   const auto same = std::ranges::find_if(
       kept_, [&](const Kept& each) { return each.file != file && areSame(each.activity, activity); });
   if (same == kept_.end()) return false;
-  std::cerr << "axvelto: " << file << ": the same workout as in " << same->file << ", counted once\n";
+  complain(file + ": the same workout as in " + same->file + ", counted once");
   if (toldBy(activity) > toldBy(same->activity)) {
     const bool isWhole = !same->activity.points.empty();
     same->activity = activity;
@@ -111,7 +108,7 @@ bool forEachUnpacked(const std::string& name, const Opening& opening,
   options.readsDamaged = opening.readsDamaged;
   options.onFault = [&](const std::string& file, const std::string& what, const std::string& expected) {
     isWhole = false;
-    tell({file, "", what, expected});
+    complain(Fault{file, "", what, expected});
   };
   const std::string bytes = readInput(name);
   reader::unpack(bytes, name, options, [&](const std::string& file, std::string_view unpacked) {
@@ -120,7 +117,7 @@ bool forEachUnpacked(const std::string& name, const Opening& opening,
       onFile(file, unpacked);
     } catch (const Fault& fault) {
       isWhole = false;
-      tell(fault);
+      complain(fault);
     }
   });
   return isWhole;

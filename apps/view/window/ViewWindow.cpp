@@ -10,6 +10,7 @@
 #include <iostream>
 #include <map>
 
+#include "apps/shared/Complaint.h"
 #include "apps/view/model/ItemWords.h"
 #include "apps/view/model/StepNote.h"
 #include "apps/view/window/Commands.h"
@@ -173,7 +174,7 @@ std::string ViewWindow::play(const reader::Sound& sound) {
 
 void ViewWindow::follow(const Effect& effect) {
   if (effect.result == reader::ActionResult::raised) {
-    std::cerr << "axvelto-view: " << presentation_.scene().file << ": the host raised when it was acted on\n";
+    app::complain(presentation_.scene().file + ": the host raised when it was acted on");
   }
   if (effect.change.isAny()) {
     tour_.leave();
