@@ -30,12 +30,12 @@ struct Path {
   }
 };
 
-void visitBelow(const Path& path, const ElementTest& visit) {
+void visitBelow(const Path& path, const ElementTest& visit, std::size_t& met) {
   const Ref<Array> listed = messages::accessibilityElements(path.object);
   for (const Ref<Object>& child : listed ? listed->items() : drawnChildren(path.object)) {
     if (path.holds(*child)) continue;
-    if (!isWithinDepth(path.level)) return;
-    if (visit(*child)) visitBelow({*child, &path, path.level + 1}, visit);
+    if (!isWithinDepth(path.level) || !isWithinCount(met++)) return;
+    if (visit(*child)) visitBelow({*child, &path, path.level + 1}, visit, met);
   }
 }
 
@@ -102,7 +102,8 @@ Ref<Array> _accessibilityFindUnsortedDescendantsPassingTest(Receiver receiver, c
 }
 
 void visitDescendants(Receiver parent, const ElementTest& visit) {
-  if (parent.get() != nullptr) visitBelow({*parent.get(), nullptr}, visit);
+  std::size_t met = 0;
+  if (parent.get() != nullptr) visitBelow({*parent.get(), nullptr}, visit, met);
 }
 
 bool _accessibilityViewIsVisible(Receiver receiver) {

@@ -14,7 +14,7 @@ using ElementTest = std::function<bool(Object&)>;
 
 // Ancestors are followed through accessibilityContainer: a view's superview, a layer's superlayer and then
 // its view, an element's container. Containers that form a ring are each asked, and then there are no more.
-// Neither up nor down is anything followed further than deepestLevel.
+// Neither up nor down is anything followed further than deepestLevel, nor more than mostObjects met.
 Ref<Object> _accessibilityAncestorIsKindOf(Receiver receiver, const Class* ancestorClass);
 Ref<Object> _accessibilityFindAncestor(Receiver receiver, const ElementTest& test, bool startWithSelf);
 

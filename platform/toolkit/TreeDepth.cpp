@@ -18,6 +18,9 @@ std::vector<Question>& questions() {
   return asked;
 }
 
+// Put since the outermost of those that are being asked.
+thread_local std::size_t putQuestions = 0;
+
 }  // namespace
 
 bool leaveOutTooDeep() {
@@ -32,7 +35,8 @@ std::size_t timesTooDeep() {
 PartQuestion::PartQuestion(Selector message, Receiver asked) {
   const Question question{message, asked.get()};
   const bool isAsked = std::find(questions().begin(), questions().end(), question) != questions().end();
-  mayBePut_ = !isAsked && isWithinDepth(questions().size());
+  if (questions().empty()) putQuestions = 0;
+  mayBePut_ = !isAsked && isWithinDepth(questions().size()) && isWithinCount(putQuestions++);
   questions().push_back(question);
 }
 

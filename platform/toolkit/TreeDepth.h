@@ -9,14 +9,21 @@
 namespace ax {
 
 inline constexpr std::size_t deepestLevel = 256;
+// Of one walk, or of one question and all that it takes. Two new objects at each level would be met too often
+// to end.
+inline constexpr std::size_t mostObjects = 100'000;
 
-// Counts something that is left out because it lies too deep; false. Any thread.
+// Counts something that is left out because it lies too deep, or behind too many others; false. Any thread.
 bool leaveOutTooDeep();
 // Whether a level, counted from 0, is still followed; one that is not is counted.
 inline bool isWithinDepth(std::size_t level) {
   return level < deepestLevel || leaveOutTooDeep();
 }
-// How often something lay deeper, in this process so far.
+// The same for an object that comes after so many others of a walk.
+inline bool isWithinCount(std::size_t before) {
+  return before < mostObjects || leaveOutTooDeep();
+}
+// How often something was left out, in this process so far.
 std::size_t timesTooDeep();
 
 // Stands while one object is asked for something that may be made of what others answer to the same message.

@@ -54,7 +54,7 @@ void SnapshotWalk::visitEach(const Ref<Array>& objects, Place place) {
 }
 
 void SnapshotWalk::visit(Object& object, Place place) {
-  if (met_.contains(&object) || !isWithinDepth(place.depth)) return;
+  if (met_.contains(&object) || !isWithinDepth(place.depth) || !isWithinCount(met_.size())) return;
   met_.insert(&object);
   kept_.push_back(Ref<Object>(&object));
   if (!isVisible(object)) return visitInvisible(object, place);

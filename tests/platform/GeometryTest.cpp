@@ -158,6 +158,8 @@ TEST(ElementTree, findsRelatives) {
 // Lists a new one of itself, and lies in a new one, whenever it is asked.
 class Endless : public View {
  public:
+  static inline std::size_t madeAtOnce = 1;
+
   static Class& staticClass() {
     static Class& result = ClassBuilder<Endless>("GeometryTest.Endless", View::staticClass())
                                .method<&Endless::elements>("accessibilityElements")
@@ -165,7 +167,11 @@ class Endless : public View {
                                .build();
     return result;
   }
-  Ref<Array> elements() { return array({make<Endless>()}); }
+  Ref<Array> elements() {
+    Array::Items made;
+    for (std::size_t i = 0; i < madeAtOnce; ++i) made.push_back(make<Endless>());
+    return array(std::move(made));
+  }
   Ref<Object> container() { return kept_ = make<Endless>(); }
 
  private:
@@ -181,6 +187,9 @@ TEST(ElementTree, endsWhereTheHostDoesNot) {
   EXPECT_EQ(timesTooDeep(), before + 1);
   EXPECT_EQ(_accessibilityFindAncestor(endless, none, true), nullptr);
   EXPECT_EQ(timesTooDeep(), before + 2);
+
+  Endless::madeAtOnce = 2;
+  EXPECT_EQ(_accessibilityFindUnsortedDescendantsPassingTest(endless, all)->count(), mostObjects);
 
   const Ref<View> root = make<View>();
   Ref<View> deep = root;
