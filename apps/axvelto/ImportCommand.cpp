@@ -1,6 +1,5 @@
 #include <algorithm>
 #include <filesystem>
-#include <iostream>
 
 #include "apps/axvelto/Command.h"
 #include "apps/axvelto/Output.h"

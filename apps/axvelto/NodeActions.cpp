@@ -1,6 +1,5 @@
 #include "apps/axvelto/NodeActions.h"
 
-#include <iostream>
 #include <optional>
 
 #include "apps/axvelto/Output.h"

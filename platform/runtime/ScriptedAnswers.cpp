@@ -33,16 +33,29 @@ const Method* declaredMethod(const Class& start, Selector selector) {
   return nullptr;
 }
 
+std::map<const Method*, MethodAnswer>& methodAnswers() {
+  static auto* const answers = new std::map<const Method*, MethodAnswer>;
+  return *answers;
+}
+
+void makeScripted(Method& method) {
+  if (method.unscripted != nullptr) return;
+  method.unscripted = method.function;
+  method.function = method.signature->scripted;
+  method.result = nullptr;
+}
+
 }  // namespace
+
+void setMethodAnswer(const Method& declared, MethodAnswer answer) {
+  makeScripted(const_cast<Method&>(declared));
+  methodAnswers()[&declared] = std::move(answer);
+}
 
 bool setScriptedAnswer(Object& object, Selector selector, ScriptedAnswer answer) {
   auto* method = const_cast<Method*>(declaredMethod(object.isa(), selector));
   if (method == nullptr) return false;
-  if (method->unscripted == nullptr) {
-    method->unscripted = method->function;
-    method->function = method->signature->scripted;
-    method->result = nullptr;
-  }
+  makeScripted(*method);
   Object* answers = object.attached(&answersKey);
   if (answers == nullptr) {
     object.attach(&answersKey, make<Answers>());
@@ -58,6 +71,10 @@ void removeScriptedAnswers(Object& object) {
 
 std::pair<bool, Ref<Object>> scriptedAnswer(Object& receiver, const Method& method,
                                             std::span<const Ref<Object>> arguments) {
+  if (const auto shared = methodAnswers().find(&method); shared != methodAnswers().end()) {
+    auto answer = shared->second(receiver, arguments);
+    if (answer.first) return answer;
+  }
   const auto* answers = static_cast<const Answers*>(receiver.attached(&answersKey));
   if (answers == nullptr) return {false, nullptr};
   const auto found = answers->bySelector.find(method.selector);

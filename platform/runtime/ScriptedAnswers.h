@@ -15,6 +15,11 @@ using ScriptedAnswer = std::function<Ref<Object>(std::span<const Ref<Object>>)>;
 // its line declares the method.
 bool setScriptedAnswer(Object& object, Selector selector, ScriptedAnswer answer);
 
+// Stands in front of a method for every receiver: the first says whether it answers instead, by the second;
+// it may raise. Method and answer are for the whole process, and no other thread may send meanwhile.
+using MethodAnswer = std::function<std::pair<bool, Ref<Object>>(Object&, std::span<const Ref<Object>>)>;
+void setMethodAnswer(const Method& declared, MethodAnswer answer);
+
 // The object answers by itself again, and what its replies held is let go.
 void removeScriptedAnswers(Object& object);
 

@@ -9,7 +9,8 @@
 namespace ax::reader {
 
 // Walks a screen in reading order and writes down what it meets. Every object is met once, so that lists
-// that lead back to themselves end; objects that are made anew at every question end with the depth and the count.
+// that lead back to themselves end; objects that are made anew at every question end with the depth and the
+// count.
 class SnapshotWalk {
  public:
   explicit SnapshotWalk(const ObjectNames& names) : names_(names) {}
