@@ -5,6 +5,7 @@
 
 #include "bundle/shared/DayRings.h"
 #include "bundle/shared/LocalizedString.h"
+#include "platform/base/NeverDestroyed.h"
 #include "platform/foundation/Calendar.h"
 #include "platform/foundation/Environment.h"
 #include "platform/foundation/Formatters.h"
@@ -18,8 +19,8 @@ namespace {
 constexpr TimeInterval day = 86400;
 
 const DateFormatter& weekdayFormatter() {
-  static const Ref<DateFormatter>& formatter = *new Ref<DateFormatter>(make<DateFormatter>());
-  return *formatter;
+  static NeverDestroyed<Ref<DateFormatter>> formatter(make<DateFormatter>());
+  return **formatter;
 }
 
 }  // namespace

@@ -1,6 +1,7 @@
 #include "bundle/shared/LocalizedString.h"
 
 #include "bundle/shared/WheelchairUse.h"
+#include "platform/base/NeverDestroyed.h"
 #include "platform/foundation/AddressBook.h"
 #include "platform/foundation/Bundle.h"
 #include "platform/runtime/SafeMessage.h"
@@ -24,8 +25,8 @@ Ref<Object> makeAchievementLocalizationProvider() {
 
 // The host library's provider, made once with the settings of that moment.
 const Ref<Object>& achievementLocalizationProvider() {
-  static const auto& provider = *new Ref<Object>(makeAchievementLocalizationProvider());
-  return provider;
+  static NeverDestroyed<Ref<Object>> provider(makeAchievementLocalizationProvider());
+  return *provider;
 }
 
 }  // namespace

@@ -6,6 +6,7 @@
 #include <vector>
 
 #include "bundle/shared/LocalizedString.h"
+#include "platform/base/NeverDestroyed.h"
 #include "platform/formatting/Digits.h"
 #include "platform/formatting/RegularExpression.h"
 #include "platform/foundation/Formatters.h"
@@ -22,8 +23,8 @@ namespace {
 constexpr std::size_t paceRanges = 3;
 
 std::vector<formatting::TextRange> findPace(const std::string& text) {
-  static const auto& pattern = *new formatting::RegularExpression(R"re((\d+)'\s?([0-5]?[0-9])(?:''|"))re");
-  return pattern.firstMatch(text);
+  static NeverDestroyed<formatting::RegularExpression> pattern(R"re((\d+)'\s?([0-5]?[0-9])(?:''|"))re");
+  return pattern->firstMatch(text);
 }
 
 // As many seconds as fit.

@@ -1,5 +1,6 @@
 #include "host/charts/HeartRateUnits.h"
 
+#include "platform/base/NeverDestroyed.h"
 #include "platform/runtime/ClassBuilder.h"
 
 // What the app adds to the platform's Quantity.
@@ -22,8 +23,8 @@ const HostExtensions hostExtensions;
 }  // namespace
 
 double beatsPerMinute(const Quantity& quantity) {
-  static const Ref<Unit>& unit = *new Ref<Unit>(Unit::unitFromString("count/min"));
-  return quantity.doubleValueForUnit(unit);
+  static NeverDestroyed<Ref<Unit>> unit(Unit::unitFromString("count/min"));
+  return quantity.doubleValueForUnit(*unit);
 }
 
 }  // namespace ax::host

@@ -1,5 +1,6 @@
 #include "host/daydetail/VLUIUnitManager.h"
 
+#include "platform/base/NeverDestroyed.h"
 #include "platform/foundation/Environment.h"
 #include "platform/runtime/ClassBuilder.h"
 
@@ -15,8 +16,8 @@ Class& VLUIUnitManager::staticClass() {
 }
 
 Ref<VLUIUnitManager> VLUIUnitManager::sharedManager() {
-  static const Ref<VLUIUnitManager>& shared = *new Ref<VLUIUnitManager>(make<VLUIUnitManager>());
-  return shared;
+  static NeverDestroyed<Ref<VLUIUnitManager>> shared(make<VLUIUnitManager>());
+  return *shared;
 }
 
 Ref<Unit> VLUIUnitManager::userActiveEnergyBurnedUnit() {

@@ -1,6 +1,7 @@
 #include "host/workouts/CHWorkoutFormattingManager.h"
 
 #include "host/workouts/WorkoutFigures.h"
+#include "platform/base/NeverDestroyed.h"
 #include "platform/runtime/ClassBuilder.h"
 #include "platform/runtime/Message.h"
 
@@ -24,8 +25,8 @@ Class& CHWorkoutFormattingManager::staticClass() {
 }
 
 Ref<CHWorkoutFormattingManager> CHWorkoutFormattingManager::sharedInstance() {
-  static const auto& shared = *new Ref<CHWorkoutFormattingManager>(make<CHWorkoutFormattingManager>());
-  return shared;
+  static NeverDestroyed<Ref<CHWorkoutFormattingManager>> shared(make<CHWorkoutFormattingManager>());
+  return *shared;
 }
 
 Ref<AttributedString> CHWorkoutFormattingManager::formattedDurationForWorkoutContext(Ref<Workout> workout,

@@ -3,6 +3,7 @@
 #include <algorithm>
 
 #include "platform/accessibility/CategoryRegistration.h"
+#include "platform/base/NeverDestroyed.h"
 #include "platform/runtime/ClassBuilder.h"
 #include "platform/runtime/Grafting.h"
 
@@ -69,8 +70,8 @@ Class& ValidationManager::staticClass() {
 }
 
 Ref<ValidationManager> ValidationManager::sharedInstance() {
-  static const Ref<ValidationManager>& manager = *new Ref<ValidationManager>(make<ValidationManager>());
-  return manager;
+  static NeverDestroyed<Ref<ValidationManager>> manager(make<ValidationManager>());
+  return *manager;
 }
 
 void ValidationManager::

@@ -7,8 +7,10 @@
 
 #include <memory>
 
+#include "platform/base/NeverDestroyed.h"
 #include "platform/formatting/FormatterCache.h"
 #include "platform/formatting/FormatterZone.h"
+#include "platform/formatting/PerRegion.h"
 #include "platform/formatting/Region.h"
 #include "platform/formatting/Templates.h"
 #include "platform/formatting/Text.h"
@@ -99,24 +101,18 @@ std::string written(const DateWriter* writer, double time) {
   return asSpoken(writer->tellsTime ? withoutLeadingZeros(std::move(date)) : std::move(date));
 }
 
-struct WeekdayNames {
-  std::uint64_t generation = 0;
-  std::vector<std::string> names;
-};
+using WeekdayNames = std::vector<std::string>;
 
-const std::vector<std::string>& refreshed(WeekdayNames& cached,
-                                          icu::DateFormatSymbols::DtContextType context) {
-  if (cached.generation == regionGeneration()) return cached.names;
+WeekdayNames weekdayNames(icu::DateFormatSymbols::DtContextType context) {
   UErrorCode status = U_ZERO_ERROR;
   const icu::DateFormatSymbols symbols(gregorianLocale(), status);
   int32_t count = 0;
   const icu::UnicodeString* names = symbols.getWeekdays(count, context, icu::DateFormatSymbols::WIDE);
-  cached.names.clear();
+  WeekdayNames result;
   for (int32_t day = UCAL_SUNDAY; day < count; ++day) {
-    cached.names.push_back(utf8From({names[day].getBuffer(), static_cast<std::size_t>(names[day].length())}));
+    result.push_back(utf8From({names[day].getBuffer(), static_cast<std::size_t>(names[day].length())}));
   }
-  cached.generation = regionGeneration();
-  return cached.names;
+  return result;
 }
 
 }  // namespace
@@ -150,13 +146,13 @@ std::optional<double> parseDate(std::string_view text, std::string_view pattern)
 }
 
 const std::vector<std::string>& weekdaySymbols() {
-  static auto& cached = *new WeekdayNames;
-  return refreshed(cached, icu::DateFormatSymbols::FORMAT);
+  static NeverDestroyed<PerRegion<WeekdayNames>> names;
+  return names->get([] { return weekdayNames(icu::DateFormatSymbols::FORMAT); });
 }
 
 const std::vector<std::string>& standaloneWeekdaySymbols() {
-  static auto& cached = *new WeekdayNames;
-  return refreshed(cached, icu::DateFormatSymbols::STANDALONE);
+  static NeverDestroyed<PerRegion<WeekdayNames>> names;
+  return names->get([] { return weekdayNames(icu::DateFormatSymbols::STANDALONE); });
 }
 
 }  // namespace ax::formatting

@@ -53,11 +53,7 @@ std::vector<std::string> tableLanguages(const std::string& folder) {
 StringTable::StringTable(std::string folder) : folder_(std::move(folder)) {}
 
 const std::string* StringTable::find(std::string_view key) const {
-  if (generation_ != regionGeneration()) {
-    current_ = chainOf(currentRegion().locale);
-    generation_ = regionGeneration();
-  }
-  return findIn(current_, key);
+  return findIn(current_.get([this] { return chainOf(currentRegion().locale); }), key);
 }
 
 const std::string* StringTable::find(std::string_view key, std::string_view language) const {

@@ -1,12 +1,13 @@
 // Localized texts: a folder of compiled resource bundles, one per language, such as "de.res".
 #pragma once
 
-#include <cstdint>
 #include <map>
 #include <string>
 #include <string_view>
 #include <unordered_map>
 #include <vector>
+
+#include "platform/formatting/PerRegion.h"
 
 namespace ax::formatting {
 
@@ -46,8 +47,7 @@ class StringTable {
 
   std::string folder_;
   mutable std::map<std::string, Texts> files_;
-  mutable Chain current_;
-  mutable std::uint64_t generation_ = 0;  // of the region that current_ belongs to
+  mutable PerRegion<Chain> current_;
 };
 
 // The languages that a folder has tables of, "root" included, in order.

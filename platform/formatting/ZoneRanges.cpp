@@ -3,6 +3,7 @@
 #include <cstdint>
 #include <string>
 
+#include "platform/base/NeverDestroyed.h"
 #include "platform/formatting/Region.h"
 
 namespace ax::formatting {
@@ -39,13 +40,13 @@ double ZoneRanges::instantOfLocal(double local, RepeatedTime which) {
 }
 
 const std::shared_ptr<ZoneRanges>& currentZoneRanges() {
-  static auto& current = *new CurrentRanges;
-  if (current.generation == regionGeneration()) return current.ranges;
-  current.generation = regionGeneration();
-  if (current.ranges && current.zone == currentRegion().timeZone) return current.ranges;
-  current.zone = currentRegion().timeZone;
-  current.ranges = std::make_shared<ZoneRanges>(zoneRules(current.zone));
-  return current.ranges;
+  static NeverDestroyed<CurrentRanges> current;
+  if (current->generation == regionGeneration()) return current->ranges;
+  current->generation = regionGeneration();
+  if (current->ranges && current->zone == currentRegion().timeZone) return current->ranges;
+  current->zone = currentRegion().timeZone;
+  current->ranges = std::make_shared<ZoneRanges>(zoneRules(current->zone));
+  return current->ranges;
 }
 
 }  // namespace ax::formatting

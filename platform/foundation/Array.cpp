@@ -19,7 +19,7 @@ Class& MutableArray::staticClass() {
 }
 
 bool Array::isEqual(const Object& other) const {
-  const Array* list = cast<Array>(const_cast<Object*>(&other));
+  const Array* list = cast<Array>(&other);
   return list != nullptr && std::equal(begin(), end(), list->begin(), list->end(),
                                        [](const auto& a, const auto& b) { return a->isEqual(*b); });
 }

@@ -12,7 +12,7 @@ Class& Value::staticClass() {
 }
 
 bool Value::isEqual(const Object& other) const {
-  const Value* value = cast<Value>(const_cast<Object*>(&other));
+  const Value* value = cast<Value>(&other);
   return value != nullptr && value->content_ == content_;
 }
 
@@ -111,7 +111,7 @@ bool isNumber(const Object& object) {
 
 template <class T>
 bool isValueOf(const Object& object) {
-  const Value* value = cast<Value>(const_cast<Object*>(&object));
+  const Value* value = cast<Value>(&object);
   return value != nullptr && std::holds_alternative<T>(value->content());
 }
 template bool isValueOf<Point>(const Object&);

@@ -1,5 +1,6 @@
 #include "platform/foundation/Calendar.h"
 
+#include "platform/base/NeverDestroyed.h"
 #include "platform/formatting/CalendarMath.h"
 #include "platform/foundation/String.h"
 #include "platform/runtime/ClassBuilder.h"
@@ -24,8 +25,8 @@ Class& Calendar::staticClass() {
 }
 
 Ref<Calendar> Calendar::currentCalendar() {
-  static const Ref<Calendar>& calendar = *new Ref<Calendar>(make<Calendar>());
-  return calendar;
+  static NeverDestroyed<Ref<Calendar>> calendar(make<Calendar>());
+  return *calendar;
 }
 
 Ref<Calendar> Calendar::calendarWithIdentifier(const Ref<String>& identifier) {

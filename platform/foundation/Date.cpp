@@ -26,7 +26,7 @@ Ref<Date> Date::dateByAddingTimeInterval(TimeInterval seconds) const {
 }
 
 bool Date::isEqual(const Object& other) const {
-  const Date* date = cast<Date>(const_cast<Object*>(&other));
+  const Date* date = cast<Date>(&other);
   return date != nullptr && date->time_ == time_;
 }
 
@@ -49,7 +49,7 @@ bool DateInterval::containsDate(const Date& date) const {
 }
 
 bool DateInterval::isEqual(const Object& other) const {
-  const DateInterval* interval = cast<DateInterval>(const_cast<Object*>(&other));
+  const DateInterval* interval = cast<DateInterval>(&other);
   return interval != nullptr && interval->start_->isEqual(*start_) && interval->end_->isEqual(*end_);
 }
 

@@ -2,6 +2,7 @@
 
 #include <cmath>
 
+#include "platform/base/NeverDestroyed.h"
 #include "platform/formatting/DateIntervals.h"
 #include "platform/formatting/Dates.h"
 #include "platform/formatting/Durations.h"
@@ -119,9 +120,9 @@ Ref<String> formatWhole(double value) {
 }
 
 Ref<String> formatFloatWithPercentage(float fraction, int) {
-  static auto& texts = *new PercentTexts;
-  return texts.text(fraction,
-                    [](double written) { return numberString(formatting::percentNumber(written)); });
+  static NeverDestroyed<PercentTexts> texts;
+  return texts->text(fraction,
+                     [](double written) { return numberString(formatting::percentNumber(written)); });
 }
 
 Ref<String> durationStringForDuration(TimeInterval seconds) {

@@ -74,7 +74,7 @@ double Number::doubleValue() const {
 }
 
 bool Number::isEqual(const Object& other) const {
-  const Number* number = cast<Number>(const_cast<Object*>(&other));
+  const Number* number = cast<Number>(&other);
   if (number == nullptr || number->doubleValue() != doubleValue()) return false;
   if (!isWhole(content_) || !isWhole(number->content_)) return true;
   return number->int64Value() == int64Value() && number->unsignedValue() == unsignedValue();

@@ -2,9 +2,8 @@
 
 #include <array>
 #include <cmath>
-#include <cstdint>
 
-#include "platform/formatting/Region.h"
+#include "platform/formatting/PerRegion.h"
 #include "platform/foundation/String.h"
 
 namespace ax {
@@ -15,15 +14,14 @@ class PercentTexts {
  public:
   // The text of a fraction rounded to whole percents. `write` makes it of a fraction; it is asked for all
   // that is not remembered: what is negative, large or no number, and what lies so near between two that it
-  // must round.
+  // must round. The text is shared by all who ask for it.
   template <class Write>
   Ref<String> text(double fraction, Write write) {
     const double percent = fraction * 100;
     const double whole = std::round(percent);
     const bool isRemembered = whole >= 0 && whole < most && std::abs(percent - whole) < nearHalf;
     if (!isRemembered) return write(fraction);
-    if (generation_ != formatting::regionGeneration()) forget();
-    Ref<String>& text = texts_[static_cast<std::size_t>(whole)];
+    Ref<String>& text = texts_.get([] { return Texts(); })[static_cast<std::size_t>(whole)];
     if (!text) text = write(whole / 100);
     return text;
   }
@@ -31,14 +29,9 @@ class PercentTexts {
  private:
   static constexpr std::size_t most = 201;
   static constexpr double nearHalf = 0.499;
+  using Texts = std::array<Ref<String>, most>;
 
-  void forget() {
-    texts_ = {};
-    generation_ = formatting::regionGeneration();
-  }
-
-  std::array<Ref<String>, most> texts_;
-  std::uint64_t generation_ = 0;
+  formatting::PerRegion<Texts> texts_;
 };
 
 }  // namespace ax

@@ -2,6 +2,7 @@
 
 #include <array>
 
+#include "platform/base/NeverDestroyed.h"
 #include "platform/runtime/ClassBuilder.h"
 #include "platform/runtime/KeyReading.h"
 
@@ -13,13 +14,13 @@ Class& String::staticClass() {
 }
 
 bool String::isEqual(const Object& other) const {
-  const String* text = cast<String>(const_cast<Object*>(&other));
+  const String* text = cast<String>(&other);
   return text != nullptr && text->text_ == text_;
 }
 
 Ref<String> emptyString() {
-  static const Ref<String>& empty = *new Ref<String>(string(""));
-  return empty;
+  static NeverDestroyed<Ref<String>> empty(string(""));
+  return *empty;
 }
 
 std::vector<Ref<String>> componentsSeparatedByNewlines(const String& text) {

@@ -1,5 +1,6 @@
 #include "platform/foundation/WeatherUtilities.h"
 
+#include "platform/base/NeverDestroyed.h"
 #include "platform/foundation/Bundle.h"
 #include "platform/runtime/ClassBuilder.h"
 
@@ -16,8 +17,8 @@ Class& WeatherUtilities::staticClass() {
 }
 
 Ref<WeatherUtilities> WeatherUtilities::sharedInstance() {
-  static const Ref<WeatherUtilities>& shared = *new Ref<WeatherUtilities>(make<WeatherUtilities>());
-  return shared;
+  static NeverDestroyed<Ref<WeatherUtilities>> shared(make<WeatherUtilities>());
+  return *shared;
 }
 
 Ref<String> WeatherUtilities::descriptionForWeatherWXQConditionCode(std::int64_t code) const {

@@ -23,7 +23,7 @@ double Quantity::doubleValueForUnit(const Ref<Unit>& unit) const {
 }
 
 bool Quantity::isEqual(const Object& other) const {
-  const Quantity* quantity = cast<Quantity>(const_cast<Object*>(&other));
+  const Quantity* quantity = cast<Quantity>(&other);
   if (quantity == nullptr || quantity->value_ != value_) return false;
   return unit_ && quantity->unit_ ? unit_->isEqual(*quantity->unit_) : unit_ == quantity->unit_;
 }

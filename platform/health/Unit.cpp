@@ -4,6 +4,7 @@
 #include <mutex>
 #include <set>
 
+#include "platform/base/NeverDestroyed.h"
 #include "platform/foundation/Bundle.h"
 #include "platform/runtime/ClassBuilder.h"
 
@@ -73,10 +74,10 @@ Ref<Unit> Unit::unitFromString(std::string_view text) {
 }
 
 const std::string& Unit::sharedText(std::string text) {
-  static auto& mutex = *new std::mutex;
-  static auto& texts = *new std::set<std::string>;
-  const std::lock_guard lock(mutex);
-  return *texts.insert(std::move(text)).first;
+  static NeverDestroyed<std::mutex> mutex;
+  static NeverDestroyed<std::set<std::string>> texts;
+  const std::lock_guard lock(*mutex);
+  return *texts->insert(std::move(text)).first;
 }
 
 Ref<Unit> Unit::literUnitWithMetricPrefix(MetricPrefix prefix) {
@@ -98,7 +99,7 @@ Ref<Unit> Unit::unitDividedByUnit(const Unit& divisor) const {
 }
 
 bool Unit::isEqual(const Object& other) const {
-  const Unit* unit = cast<Unit>(const_cast<Object*>(&other));
+  const Unit* unit = cast<Unit>(&other);
   return unit != nullptr && unit->hasTextOf(*this);
 }
 

@@ -133,6 +133,11 @@ T* cast(Object* object) {
 }
 
 template <class T>
+const T* cast(const Object* object) {
+  return cast<T>(const_cast<Object*>(object));
+}
+
+template <class T>
 Ref<T> cast(Ref<Object> object) {
   if constexpr (std::is_same_v<T, Object>) {
     return object;

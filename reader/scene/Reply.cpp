@@ -106,7 +106,7 @@ Json ReplyWriter::write(const Ref<Object>& reply) const {
 }
 
 Json ReplyWriter::writeText(const String& text) const {
-  const auto* attributed = cast<AccessibilityAttributedString>(const_cast<String*>(&text));
+  const auto* attributed = cast<AccessibilityAttributedString>(&text);
   if (attributed == nullptr) return text.text();
   Json attributes = Json::array();
   for (const TextAttribute& attribute : attributed->attributes()) {
@@ -143,13 +143,12 @@ Json ReplyWriter::writeShown(Object& shown) const {
 
 // A class stands for itself, everything else is known by its id.
 Json ReplyWriter::writeOther(const Object& other) const {
-  if (const auto* itself = cast<Class>(const_cast<Object*>(&other)))
-    return named("classNamed", itself->name());
+  if (const auto* itself = cast<Class>(&other)) return named("classNamed", itself->name());
   Json record = Json::object();
   const std::string id = idOf_(other);
   record["id"] = id.empty() ? Json() : Json(id);
   record["class"] = other.isa().name();
-  const auto* styled = cast<AttributedString>(const_cast<Object*>(&other));
+  const auto* styled = cast<AttributedString>(&other);
   if (styled == nullptr) return record;
   record["attributed"] = styled->description();
   record["label"] = write(messages::accessibilityLabel(const_cast<Object&>(other)));

@@ -8,7 +8,7 @@ namespace ax::reader {
 
 AttributedText attributedText(const String& text) {
   AttributedText copy{text.text()};
-  const auto* attributed = cast<AccessibilityAttributedString>(const_cast<String*>(&text));
+  const auto* attributed = cast<AccessibilityAttributedString>(&text);
   if (attributed == nullptr) return copy;
   for (const TextAttribute& attribute : attributed->attributes()) {
     if (!unbox<bool>(attribute.value)) continue;

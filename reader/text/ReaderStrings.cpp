@@ -1,5 +1,6 @@
 #include "reader/text/ReaderStrings.h"
 
+#include "platform/base/NeverDestroyed.h"
 #include "platform/formatting/Lists.h"
 #include "platform/formatting/StringTable.h"
 
@@ -9,9 +10,9 @@ namespace {
 
 const std::string* find(std::string_view key) {
   static const char inThisProgram = 0;
-  static const auto& table = *new formatting::StringTable(
+  static NeverDestroyed<formatting::StringTable> table(
       formatting::resourceFolderBeside(&inThisProgram, "../share/axvelto/Reader"));
-  return table.find(key);
+  return table->find(key);
 }
 
 }  // namespace
