@@ -41,6 +41,7 @@ bool graftCategory(Class& category, Class& target) {
   graft.category = &category;
   graft.target = &target;
   graft.entry.owner = &target;
+  graft.entry.selector = Selector::intern("");  // no message's, used or not
   graft.entry.graft = &graft;
   const std::vector<const Method*> methods = keepEntries(category, target, graft);
   const std::vector<const Method*> classMethods =
@@ -53,6 +54,12 @@ bool graftCategory(Class& category, Class& target) {
 
 const CategoryGraft* graftOf(const Class& category) {
   return category.graft();
+}
+
+// A message that was never used names no entry, and need not be resolved to see it.
+const Method& superMethod(const Method& current, const MessageRecord& message) {
+  return current.selector == message.selectorIfUsed() ? replacedBy(current)
+                                                      : superMethod(current, message.selector());
 }
 
 const Method& superMethod(const Method& current, Selector selector) {

@@ -3,7 +3,7 @@
 #include <string>
 #include <vector>
 
-#include "platform/runtime/Class.h"
+#include "platform/runtime/Message.h"
 
 namespace ax {
 
@@ -36,6 +36,7 @@ bool graftCategory(Class& category, Class& target);
 const CategoryGraft* graftOf(const Class& category);
 
 // The entry that a call to super reaches from inside a grafted one.
+const Method& superMethod(const Method& current, const MessageRecord& message);
 const Method& superMethod(const Method& current, Selector selector);
 
 }  // namespace ax

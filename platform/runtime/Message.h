@@ -29,6 +29,8 @@ class MessageRecord {
       return resolve();
     return Selector(record);
   }
+  // Nil before the first use.
+  Selector selectorIfUsed() const { return Selector(record_.load(std::memory_order_acquire)); }
   const Signature& signature() const {
     (void)selector();
     return *signature_.load(std::memory_order_relaxed);
@@ -43,7 +45,7 @@ class MessageRecord {
       : name_(name), makeSignature_(makeSignature), findResult_(findResult) {}
 
   const Method& answerOf(const Object& object) const {
-    const Selector selector(record_.load(std::memory_order_acquire));
+    const Selector selector = selectorIfUsed();
     const Method& first = object.isa().firstAnswer(place_.load(std::memory_order_relaxed));
     return first.selector == selector ? first : answerSlowly(object);
   }

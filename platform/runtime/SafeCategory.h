@@ -21,7 +21,7 @@ class SafeCategory {
   template <class R, class... A>
   R super(const Message<R(A...)>& message, std::type_identity_t<A>... arguments) const {
     try {
-      return message.call(self, superMethod(method_, message.selector()), std::move(arguments)...);
+      return message.call(self, superMethod(method_, message), std::move(arguments)...);
     } catch (...) {
       superHasRaised_ = true;
       throw;

@@ -126,7 +126,8 @@ TEST_F(CommandFaults, WhatTheHostDoesWrongNeverEndsACommand) {
       "screen": {"class": "View", "set": {"accessibilityElements": [{"ref": "v0"}]}})"));
   EXPECT_EQ(deep.code, 0);
   EXPECT_EQ(deep.out, "Screen: T\nNothing to speak\n");
-  EXPECT_EQ(deep.err, "axvelto: -: what lies deeper than 256 levels, or behind 100000 objects, was left out, 1 time\n");
+  EXPECT_EQ(deep.err,
+            "axvelto: -: what lies deeper than 256 levels, or behind 100000 objects, was left out, 1 time\n");
 }
 
 // Files come from strangers: what they hold is shown and never obeyed, on one line each and not without end.
