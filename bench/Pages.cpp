@@ -35,7 +35,7 @@ class Bars : public View {
   std::int64_t type() { return 2; }
   Ref<Array> values(std::int64_t axis) {
     Array::Items numbers;
-    for (int i = 0; i < count; ++i) numbers.push_back(number(axis == 0 ? i : i * 7 % 23));
+    for (int i = 0; i < count; ++i) numbers.push_back(number(axis == horizontalAxis ? i : i * 7 % 23));
     return array(std::move(numbers));
   }
 

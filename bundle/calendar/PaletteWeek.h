@@ -1,12 +1,11 @@
 #pragma once
 
+#include "bundle/shared/Week.h"
 #include "platform/foundation/Array.h"
 #include "platform/foundation/Date.h"
 #include "platform/foundation/String.h"
 
 namespace ax {
-
-inline constexpr std::size_t daysOfWeek = 7;
 
 // The names of the palette's days at one moment, in the reader's language. Main thread only.
 class PaletteWeekdays {

@@ -1,3 +1,4 @@
+#include "bundle/charts/Slices.h"
 #include "bundle/core/Category.h"
 #include "platform/foundation/Calendar.h"
 #include "platform/foundation/Formatters.h"
@@ -28,10 +29,10 @@ class ActivityActiveHoursChartAccessibility : public SafeCategory {
   }
 
   bool _accessibilityShouldUseSlices() { return true; }
-  std::uint64_t _accessibilityNumberOfSlices() { return 8; }
+  std::uint64_t _accessibilityNumberOfSlices() { return sliceCount; }
   std::uint64_t _accessibilityHoursPerSlice() {
     const std::uint64_t slices = messages::_accessibilityNumberOfSlices(self);
-    return slices == 0 ? 0 : 24 / slices;
+    return slices == 0 ? 0 : hoursOfDay / slices;
   }
   double _accessibilityTimeIntervalPerSlice() {
     return static_cast<double>(messages::_accessibilityHoursPerSlice(self)) * 3600;
@@ -45,7 +46,7 @@ class ActivityActiveHoursChartAccessibility : public SafeCategory {
     const Ref<Date> day =
         castAsClass<Date>(safeValueForKey(self.safeValueForKey("_barSeries"_key), "_minDate"_key));
     const double sum = day && points ? sumOfHours(*points, *day, start, end) : 0;
-    return timeStringForType(3, static_cast<float>(sum));
+    return timeStringForType(TimeStringType::hours, static_cast<float>(sum));
   }
 
  private:

@@ -16,7 +16,8 @@ constexpr TimeInterval spanLength = 10800;
 constinit const Message<void()> accessibilityReloadData{"accessibilityReloadData"};
 
 Ref<String> calories(float sum) {
-  return stringWithFormat(accessibilityLocalizedString("calories.format"), {formatFloat(0, sum)});
+  return stringWithFormat(accessibilityLocalizedString("calories.format"),
+                          {formatFloat(FloatFormat::whole, sum)});
 }
 Ref<String> wholeMinutes(float sum) {
   return stringWithFormat(accessibilityLocalizedString("minutes.format"), {formatWhole(sum)});
@@ -49,7 +50,7 @@ float sumOfSpan(const Array& points, std::size_t span) {
 
 // The day's move energy, move minutes or exercise minutes: eight elements of three hours each.
 class ActivityMoveAndExerciseChartViewAccessibility
-    : public GraphDataChart<ActivityMoveAndExerciseChartViewAccessibility> {
+    : public DayChart<ActivityMoveAndExerciseChartViewAccessibility> {
  public:
   static GraphSource graphSource() {
     return {"moveAndExerciseChartPoints"_key, "kAXDayViewCellGraphElements"_key, &Value::staticClass()};
@@ -63,13 +64,9 @@ class ActivityMoveAndExerciseChartViewAccessibility
   }
 
   bool isAccessibilityElement() { return false; }
-  bool _accessibilityDataSeriesSupportsSummarization() { return false; }
   Ref<String> _accessibilityDataSeriesName() {
     const std::string_view series = kind().series;
     return series.empty() ? nullptr : accessibilityLocalizedString(series);
-  }
-  Ref<Array> _accessibilityDataSeriesValuesForAxis(std::int64_t axis) {
-    return pointValuesForAxis(messages::_accessibilityGraphData(self), axis);
   }
   Ref<String> _accessibilityDataSeriesTitleForAxis(std::int64_t axis) {
     return localizedTextForAxis(axis, "activity.time.of.day.axis", kind().axis);
@@ -77,13 +74,7 @@ class ActivityMoveAndExerciseChartViewAccessibility
   Ref<String> _accessibilityDataSeriesUnitLabelForAxis(std::int64_t axis) {
     return localizedTextForAxis(axis, "activity.time.of.day.unit", kind().unit);
   }
-  Ref<Number> _accessibilityDataSeriesMinimumValueForAxis(std::int64_t axis) {
-    return axis == 0 || axis == 1 ? number(0) : nullptr;
-  }
-  Ref<Number> _accessibilityDataSeriesMaximumValueForAxis(std::int64_t axis) {
-    if (axis == 0) return number(24);
-    return axis == 1 ? number(self.safeDoubleForKey("moveAndExerciseChartMaxYValue"_key)) : nullptr;
-  }
+  Ref<Number> highest() { return number(self.safeDoubleForKey("moveAndExerciseChartMaxYValue"_key)); }
 
   Ref<Array> accessibilityElements() {
     return chartElements(self, [this](MutableArray& elements) { addSpans(elements); });
@@ -104,7 +95,7 @@ class ActivityMoveAndExerciseChartViewAccessibility
     const Ref<Array> points = messages::_accessibilityGraphData(self);
     if (!view || !points) return;
     const Rect area = messages::frame(view);
-    const double width = std::floor(area.width * 0.125);
+    const double width = std::floor(area.width / spanCount);
     const double height = std::floor(area.height);
     for (std::size_t i = 0; i < spanCount; ++i) {
       const Ref<String> value = kind().value(sumOfSpan(*points, i));

@@ -1,5 +1,6 @@
 #include <cmath>
 
+#include "bundle/charts/Slices.h"
 #include "bundle/core/Category.h"
 #include "bundle/shared/LocalizedString.h"
 #include "platform/foundation/Formatters.h"
@@ -11,7 +12,6 @@ namespace ax {
 
 namespace {
 
-constexpr std::uint64_t sliceCount = 8;
 constexpr TimeInterval pointLength = 900;
 
 // The day's energy or minutes, a quarter of an hour per point, told in eight slices.

@@ -13,7 +13,7 @@ namespace {
 constexpr TimeInterval hour = 3600;
 
 // The day's stand hours: one element per hour that the host shows, active or idle.
-class ActivityStandChartViewAccessibility : public GraphDataChart<ActivityStandChartViewAccessibility> {
+class ActivityStandChartViewAccessibility : public DayChart<ActivityStandChartViewAccessibility> {
  public:
   static GraphSource graphSource() {
     return {"standChartPoints"_key, "kAXDayViewCellGraphElements"_key, &Value::staticClass()};
@@ -23,26 +23,16 @@ class ActivityStandChartViewAccessibility : public GraphDataChart<ActivityStandC
     contract.instanceMethod("standChartPoints", {"@"});
   }
 
-  bool _accessibilityDataSeriesSupportsSummarization() { return false; }
   Ref<String> _accessibilityDataSeriesName() {
     return accessibilityLocalizedString("stand.hours.data.series");
-  }
-  Ref<Array> _accessibilityDataSeriesValuesForAxis(std::int64_t axis) {
-    return pointValuesForAxis(messages::_accessibilityGraphData(self), axis);
   }
   Ref<String> _accessibilityDataSeriesTitleForAxis(std::int64_t axis) {
     return localizedTextForAxis(axis, "activity.time.of.day.axis", "stand.goal.data.unit");
   }
   Ref<String> _accessibilityDataSeriesUnitLabelForAxis(std::int64_t axis) {
-    return axis == 1 ? emptyString() : localizedTextForAxis(axis, "activity.time.of.day.unit", {});
+    return axis == verticalAxis ? emptyString() : localizedTextForAxis(axis, "activity.time.of.day.unit", {});
   }
-  Ref<Number> _accessibilityDataSeriesMinimumValueForAxis(std::int64_t axis) {
-    return axis == 0 || axis == 1 ? number(0) : nullptr;
-  }
-  Ref<Number> _accessibilityDataSeriesMaximumValueForAxis(std::int64_t axis) {
-    if (axis == 0) return number(24);
-    return axis == 1 ? number(1) : nullptr;
-  }
+  Ref<Number> highest() { return number(1); }
 
   Ref<Array> accessibilityElements() {
     return chartElements(self, [this](MutableArray& elements) { addHours(elements); });

@@ -3,6 +3,7 @@
 
 #include "bundle/charts/DataSeriesChart.h"
 #include "bundle/charts/Extremes.h"
+#include "bundle/charts/Slices.h"
 #include "bundle/shared/LocalizedString.h"
 #include "platform/foundation/Calendar.h"
 #include "platform/foundation/Formatters.h"
@@ -14,13 +15,11 @@ namespace ax {
 
 namespace {
 
-constexpr std::uint64_t sliceCount = 8;
-
 constinit const Message<Ref<DateInterval>()> axDateInterval{"_axDateInterval"};
 constinit const Message<float(Ref<Date>)> decimalForDate{"_decimalForDate:"};
 
 Ref<String> spokenRate(double rate) {
-  return formatFloat(0, static_cast<float>(rate));
+  return formatFloat(FloatFormat::whole, static_cast<float>(rate));
 }
 
 Ref<String> spokenRange(const Extremes& range) {
@@ -65,7 +64,7 @@ class CHWorkoutDetailHeartRateChartViewAccessibility : public SafeCategory {
   std::int64_t accessibilityContainerType() { return messages::dataSeriesContainerType; }
   bool _accessibilityDataSeriesSupportsSummarization() { return true; }
   bool _accessibilityDataSeriesSupportsSonification() { return true; }
-  std::int64_t _accessibilityDataSeriesType() { return 0; }
+  std::int64_t _accessibilityDataSeriesType() { return lineSeries; }
   Ref<String> _accessibilityDataSeriesName() {
     return accessibilityLocalizedString("heart.rate.data.series");
   }
@@ -80,28 +79,28 @@ class CHWorkoutDetailHeartRateChartViewAccessibility : public SafeCategory {
   Ref<Array> _accessibilityDataSeriesValuesForAxis(std::int64_t axis) {
     Array::Items values;
     const Ref<Array> points = safeArrayForKey(self, "_heartRateChartPoints"_key);
-    if (!points || (axis != 0 && axis != 1)) return array({});
+    if (!points || !isAxis(axis)) return array({});
     values.reserve(points->count());
     for (const Ref<Object>& item : *points) {
       const Ref<Object> point = safeClass("VLUIChartPointMultiple"_key, item);
       const auto hour = [&] {
         return decimalForDate(self, cast<Date>(safeValueForKey(point, "xValue"_key)));
       };
-      values.push_back(number(axis == 0 ? hour() : middleOf(point)));
+      values.push_back(number(axis == horizontalAxis ? hour() : middleOf(point)));
     }
     return array(std::move(values));
   }
 
   Ref<Number> _accessibilityDataSeriesMinimumValueForAxis(std::int64_t axis) {
-    const Ref<DateInterval> workout = axis == 0 ? axDateInterval(self) : nullptr;
-    if (axis == 0) return number(decimalForDate(self, workout ? workout->startDate() : nullptr));
-    return axis == 1 ? endOfRange("minYValue"_key) : nullptr;
+    const Ref<DateInterval> workout = axis == horizontalAxis ? axDateInterval(self) : nullptr;
+    if (axis == horizontalAxis) return number(decimalForDate(self, workout ? workout->startDate() : nullptr));
+    return axis == verticalAxis ? endOfRange("minYValue"_key) : nullptr;
   }
 
   Ref<Number> _accessibilityDataSeriesMaximumValueForAxis(std::int64_t axis) {
-    const Ref<DateInterval> workout = axis == 0 ? axDateInterval(self) : nullptr;
-    if (axis == 0) return number(decimalForDate(self, workout ? workout->endDate() : nullptr));
-    return axis == 1 ? endOfRange("maxYValue"_key) : nullptr;
+    const Ref<DateInterval> workout = axis == horizontalAxis ? axDateInterval(self) : nullptr;
+    if (axis == horizontalAxis) return number(decimalForDate(self, workout ? workout->endDate() : nullptr));
+    return axis == verticalAxis ? endOfRange("maxYValue"_key) : nullptr;
   }
 
   bool _accessibilityShouldUseSlices() { return self.safeBoolForKey("_hasAdequateDataForDisplay"_key); }

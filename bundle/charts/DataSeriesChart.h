@@ -1,6 +1,7 @@
 #pragma once
 
 #include "bundle/charts/GraphData.h"
+#include "bundle/charts/Slices.h"
 #include "platform/toolkit/DataSeriesMessages.h"
 
 namespace ax {
@@ -18,7 +19,7 @@ class GraphDataChart : public SafeCategory {
 
   std::int64_t accessibilityContainerType() { return messages::dataSeriesContainerType; }
   bool _accessibilityDataSeriesSupportsSonification() { return true; }
-  std::int64_t _accessibilityDataSeriesType() { return 2; }
+  std::int64_t _accessibilityDataSeriesType() { return barSeries; }
 
   Ref<Array> _accessibilityGraphData() {
     return cast<Array>(self._accessibilityValueForKey(C::graphSource().graphKey));
@@ -26,6 +27,26 @@ class GraphDataChart : public SafeCategory {
   void _accessibilityLoadAccessibilityInformation() {
     super(messages::_accessibilityLoadAccessibilityInformation);
     refreshGraphData(self, C::graphSource());
+  }
+};
+
+// The base of a chart of one day, whose horizontal axis counts hours. C says how far the vertical one goes:
+// `Ref<Number> highest()`.
+template <class C>
+class DayChart : public GraphDataChart<C> {
+ public:
+  using GraphDataChart<C>::GraphDataChart;
+
+  bool _accessibilityDataSeriesSupportsSummarization() { return false; }
+  Ref<Array> _accessibilityDataSeriesValuesForAxis(std::int64_t axis) {
+    return pointValuesForAxis(messages::_accessibilityGraphData(this->self), axis);
+  }
+  Ref<Number> _accessibilityDataSeriesMinimumValueForAxis(std::int64_t axis) {
+    return isAxis(axis) ? number(0) : nullptr;
+  }
+  Ref<Number> _accessibilityDataSeriesMaximumValueForAxis(std::int64_t axis) {
+    if (axis == horizontalAxis) return number(hoursOfDay);
+    return axis == verticalAxis ? static_cast<C*>(this)->highest() : nullptr;
   }
 };
 

@@ -22,17 +22,19 @@ Ref<AccessibilityElement> chartElement(Object& chart, Rect frame, Ref<String> la
 }
 
 Ref<String> localizedTextForAxis(std::int64_t axis, std::string_view horizontal, std::string_view vertical) {
-  const std::string_view key = axis == 0 ? horizontal : axis == 1 ? vertical : std::string_view();
+  const std::string_view key = axis == horizontalAxis ? horizontal
+                               : axis == verticalAxis ? vertical
+                                                      : std::string_view();
   return key.empty() ? nullptr : accessibilityLocalizedString(key);
 }
 
 Ref<Array> pointValuesForAxis(const Ref<Array>& graphData, std::int64_t axis) {
   Array::Items values;
-  if (graphData && (axis == 0 || axis == 1)) {
+  if (graphData && isAxis(axis)) {
     values.reserve(graphData->count());
     for (const Ref<Object>& item : *graphData) {
       const Point point = unboxPoint(item);
-      values.push_back(number(axis == 0 ? point.x : point.y));
+      values.push_back(number(axis == horizontalAxis ? point.x : point.y));
     }
   }
   return array(std::move(values));

@@ -2,6 +2,7 @@
 
 #include "bundle/core/Category.h"
 #include "platform/toolkit/AccessibilityElement.h"
+#include "platform/toolkit/DataSeriesMessages.h"
 
 // What every chart of bars does with the host's list of points: it keeps its own copy on the chart view,
 // answers from that copy, and makes one element per bar until the next refresh. Main thread only; `chart` is
@@ -41,12 +42,15 @@ Ref<Array> chartElements(Object& chart, Fill&& fill) {
 // One bar: the frame is in the chart's own space. Without a value it has only its label.
 Ref<AccessibilityElement> chartElement(Object& chart, Rect frame, Ref<String> label, Ref<String> value);
 
-// The text of the horizontal axis for 0 and of the vertical one for 1, by its key in the string table; nil
-// for every other axis and for an empty key.
+inline bool isAxis(std::int64_t axis) {
+  return axis == horizontalAxis || axis == verticalAxis;
+}
+
+// The text of an axis by its key in the string table; nil for what is none and for an empty key.
 Ref<String> localizedTextForAxis(std::int64_t axis, std::string_view horizontal, std::string_view vertical);
 
-// The x of every boxed point for axis 0, the y for axis 1, as doubles in the points' order; an empty list for
-// every other axis and without graph data. What is no point counts as the zero point.
+// The x of every boxed point, or the y, as doubles in the points' order; an empty list for what is no axis
+// and without graph data. What is no point counts as the zero point.
 Ref<Array> pointValuesForAxis(const Ref<Array>& graphData, std::int64_t axis);
 
 }  // namespace ax

@@ -30,7 +30,7 @@ double figureInUnit(const Ref<Quantity>& quantity, const Ref<Unit>& unit) {
 
 Ref<String> spokenFigure(double value, const Ref<Unit>& unit) {
   return stringWithFormat(accessibilityLocalizedString("trends.value.with.unit"),
-                          {formatFloat(1, static_cast<float>(value)), unit});
+                          {formatFloat(FloatFormat::twoDecimals, static_cast<float>(value)), unit});
 }
 
 double keptFigure(Object& chart, Key key) {

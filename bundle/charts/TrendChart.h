@@ -48,7 +48,8 @@ double keptFigure(Object& chart, Key key);
 Ref<String> spokenFigureInRange(Object& chart, const RangeKeys& keys, double position, const Ref<Unit>& unit);
 
 // The base of both categories. C says, besides what GraphDataChart asks, under which keys it keeps its range:
-// `static RangeKeys rangeKeys()`.
+// `static RangeKeys rangeKeys()`; where its horizontal axis ends: `Ref<Number> lastColumn()`; and adds an
+// element for each column: `void addColumns(MutableArray& elements, double titleHeight)`.
 template <class C>
 class TrendChart : public GraphDataChart<C> {
  public:
@@ -58,9 +59,25 @@ class TrendChart : public GraphDataChart<C> {
 
   // From 0, or from the smallest figure when that is negative.
   Ref<Number> _accessibilityDataSeriesMinimumValueForAxis(std::int64_t axis) {
-    if (axis == 0) return number(0);
-    if (axis != 1) return nullptr;
+    if (axis == horizontalAxis) return number(0);
+    if (axis != verticalAxis) return nullptr;
     return number(std::min(0.0, keptFigure(this->self, C::rangeKeys().minimum)));
+  }
+
+  Ref<Number> _accessibilityDataSeriesMaximumValueForAxis(std::int64_t axis) {
+    if (axis == horizontalAxis) return static_cast<C*>(this)->lastColumn();
+    if (axis != verticalAxis) return nullptr;
+    return cast<Number>(this->self._accessibilityValueForKey(C::rangeKeys().maximum));
+  }
+
+  // The title as a header, then the columns.
+  Ref<Array> accessibilityElements() {
+    return chartElements(this->self, [this](MutableArray& elements) {
+      const Ref<View> title = safeUIViewForKey(this->self, "titleLabel"_key);
+      _accessibilityAddTrait(title, TraitHeader);
+      elements.axSafelyAddObject(title);
+      static_cast<C*>(this)->addColumns(elements, messages::frame(title).height);
+    });
   }
 
   void layoutSubviews() {

@@ -38,50 +38,58 @@ class TrendDetailChartViewAccessibility : public TrendChart<TrendDetailChartView
   Ref<String> _accessibilityDataSeriesName() { return nullptr; }
 
   Ref<String> _accessibilityDataSeriesTitleForAxis(std::int64_t axis) {
-    if (axis == 0) return accessibilityLocalizedString("trend.time.axis");
-    if (axis != 1) return nullptr;
+    if (axis == horizontalAxis) return accessibilityLocalizedString("trend.time.axis");
+    if (axis != verticalAxis) return nullptr;
     const Ref<Label> top = castAsClass<Label>(safeUIViewForKey(self, "chartMaxLabel"_key));
     return top ? messages::text(top) : trendUnitString(self);
   }
 
   Ref<String> _accessibilityDataSeriesUnitLabelForAxis(std::int64_t axis) {
-    if (axis == 0) return accessibilityLocalizedString("trend.time.unit");
-    return axis == 1 ? trendUnitString(self) : nullptr;
+    if (axis == horizontalAxis) return accessibilityLocalizedString("trend.time.unit");
+    return axis == verticalAxis ? trendUnitString(self) : nullptr;
   }
 
-  // Of the first axis as many as there are elements, the title among them.
-  Ref<Number> _accessibilityDataSeriesMaximumValueForAxis(std::int64_t axis) {
-    if (axis == 0) {
-      const Ref<Array> elements = messages::accessibilityElements(self);
-      return number(std::uint64_t(elements ? elements->count() : 0));
-    }
-    return axis == 1 ? cast<Number>(self._accessibilityValueForKey(rangeKeys().maximum)) : nullptr;
+  // As many as there are elements, the title among them.
+  Ref<Number> lastColumn() {
+    const Ref<Array> elements = messages::accessibilityElements(self);
+    return number(std::uint64_t(elements ? elements->count() : 0));
   }
 
   Ref<Array> _accessibilityDataSeriesValuesForAxis(std::int64_t axis) {
     Array::Items values;
-    const std::size_t bars = axis == 0 || axis == 1 ? barCount() : 0;
+    const std::size_t bars = isAxis(axis) ? barCount() : 0;
     values.reserve(bars);
-    const Ref<Unit> unit = axis == 1 ? trendUnit(self) : nullptr;
+    const Ref<Unit> unit = axis == verticalAxis ? trendUnit(self) : nullptr;
     for (std::size_t i = 0; i < bars; ++i) {
-      values.push_back(axis == 0 ? number(static_cast<std::int32_t>(i)) : roundedFigure(i, unit));
+      values.push_back(axis == horizontalAxis ? number(static_cast<std::int32_t>(i))
+                                              : roundedFigure(i, unit));
     }
     return array(std::move(values));
   }
 
   Ref<String> _accessibilityDataSeriesValueDescriptionForPositionAxis(double position, std::int64_t axis) {
-    if (axis == 1) return spokenFigureInRange(self, rangeKeys(), position, trendUnit(self));
-    return axis == 0 ? spokenDay(position) : nullptr;
+    if (axis == verticalAxis) return spokenFigureInRange(self, rangeKeys(), position, trendUnit(self));
+    return axis == horizontalAxis ? spokenDay(position) : nullptr;
   }
 
-  Ref<Array> accessibilityElements() {
-    return chartElements(self, [this](MutableArray& elements) {
-      elements.reserve(barCount() + 1);
-      const Ref<View> title = safeUIViewForKey(self, "titleLabel"_key);
-      _accessibilityAddTrait(title, TraitHeader);
-      elements.axSafelyAddObject(title);
-      addBars(elements, messages::frame(title).height);
-    });
+  void addColumns(MutableArray& elements, double titleHeight) {
+    const Ref<DateIntervalFormatter> formatter = make<DateIntervalFormatter>();
+    formatter->setDateTemplate("MMMMdyyyy");
+    const Ref<View> view = castAsClass<View>(self);
+    const Ref<Array> stops = messages::_accessibilityGraphData(self);
+    if (!view || !stops || stops->isEmpty()) return;
+    elements.reserve(elements.count() + stops->count());
+    const double top = 2 * titleHeight;
+    const Rect area = messages::frame(view);
+    const double width = area.width / static_cast<double>(stops->count());
+    const double height = std::floor(area.height) - top;
+    Extremes extremes;
+    for (std::size_t i = 0; i < stops->count(); ++i) {
+      const Rect frame = {width + static_cast<float>(unboxDouble(stops->at(i))), top, width, height};
+      elements.axSafelyAddObject(barElement(i, frame, *formatter, extremes));
+    }
+    keep(rangeKeys().minimum, extremes.minimum);
+    keep(rangeKeys().maximum, extremes.maximum);
   }
 
  private:
@@ -103,25 +111,6 @@ class TrendDetailChartViewAccessibility : public TrendChart<TrendDetailChartView
     formatter->setDateStyle(DateFormatterStyle::medium);
     if (!days) return nullptr;
     return formatter->stringFromDate(position == 0 ? days->startDate() : days->endDate());
-  }
-
-  void addBars(MutableArray& elements, double titleHeight) {
-    const Ref<DateIntervalFormatter> formatter = make<DateIntervalFormatter>();
-    formatter->setDateTemplate("MMMMdyyyy");
-    const Ref<View> view = castAsClass<View>(self);
-    const Ref<Array> stops = messages::_accessibilityGraphData(self);
-    if (!view || !stops || stops->isEmpty()) return;
-    const double top = 2 * titleHeight;
-    const Rect area = messages::frame(view);
-    const double width = area.width / static_cast<double>(stops->count());
-    const double height = std::floor(area.height) - top;
-    Extremes extremes;
-    for (std::size_t i = 0; i < stops->count(); ++i) {
-      const Rect frame = {width + static_cast<float>(unboxDouble(stops->at(i))), top, width, height};
-      elements.axSafelyAddObject(barElement(i, frame, *formatter, extremes));
-    }
-    keep(rangeKeys().minimum, extremes.minimum);
-    keep(rangeKeys().maximum, extremes.maximum);
   }
 
   Ref<AccessibilityElement> barElement(std::size_t bar, Rect frame, const DateIntervalFormatter& formatter,

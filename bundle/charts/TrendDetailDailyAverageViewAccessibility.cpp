@@ -2,6 +2,7 @@
 
 #include "bundle/charts/TrendChart.h"
 #include "bundle/shared/LocalizedString.h"
+#include "bundle/shared/Week.h"
 #include "platform/foundation/Formatters.h"
 #include "platform/runtime/Boxing.h"
 
@@ -9,7 +10,7 @@ namespace ax {
 
 namespace {
 
-constexpr std::size_t daysOfWeek = 7;
+constexpr int lastDay = int(daysOfWeek) - 1;
 
 constinit const Message<Ref<Quantity>(std::int32_t)> quantity365ForIndex{"accessibiliytQuantity365ForIndex:"};
 constinit const Message<Ref<Quantity>(std::int32_t)> quantity90ForIndex{"accessibiliytQuantity90ForIndex:"};
@@ -43,43 +44,32 @@ class TrendDetailDailyAverageViewAccessibility : public TrendChart<TrendDetailDa
   }
 
   Ref<String> _accessibilityDataSeriesTitleForAxis(std::int64_t axis) {
-    if (axis == 0) return accessibilityLocalizedString("trend.daily.axis");
-    return axis == 1 ? trendUnitString(self) : nullptr;
+    if (axis == horizontalAxis) return accessibilityLocalizedString("trend.daily.axis");
+    return axis == verticalAxis ? trendUnitString(self) : nullptr;
   }
 
   Ref<String> _accessibilityDataSeriesUnitLabelForAxis(std::int64_t axis) {
-    return axis == 1 ? trendUnitString(self) : nullptr;
+    return axis == verticalAxis ? trendUnitString(self) : nullptr;
   }
 
-  Ref<Number> _accessibilityDataSeriesMaximumValueForAxis(std::int64_t axis) {
-    if (axis == 0) return number(6);
-    return axis == 1 ? cast<Number>(self._accessibilityValueForKey(rangeKeys().maximum)) : nullptr;
-  }
+  Ref<Number> lastColumn() { return number(lastDay); }
 
   Ref<Array> _accessibilityDataSeriesValuesForAxis(std::int64_t axis) {
     const Ref<Unit> unit = trendUnit(self);
     Array::Items values;
-    for (std::size_t day = 0; day < daysOfWeek && (axis == 0 || axis == 1); ++day) {
+    for (std::size_t day = 0; day < daysOfWeek && isAxis(axis); ++day) {
       const auto place = static_cast<double>(day);
-      values.push_back(number(axis == 0 ? place : average(quantity365ForIndex, day, unit)));
-      values.push_back(number(axis == 0 ? place + 0.1 : average(quantity90ForIndex, day, unit)));
+      values.push_back(number(axis == horizontalAxis ? place : average(quantity365ForIndex, day, unit)));
+      values.push_back(number(axis == horizontalAxis ? place + 0.1 : average(quantity90ForIndex, day, unit)));
     }
     return array(std::move(values));
   }
 
   Ref<String> _accessibilityDataSeriesValueDescriptionForPositionAxis(double position, std::int64_t axis) {
-    if (axis == 0) return axDayStringForIndex(self, nearestColumn(position * 6), make<DateFormatter>());
-    const Ref<Unit> unit = axis == 1 ? trendUnit(self) : nullptr;
+    if (axis == horizontalAxis)
+      return axDayStringForIndex(self, nearestColumn(position * lastDay), make<DateFormatter>());
+    const Ref<Unit> unit = axis == verticalAxis ? trendUnit(self) : nullptr;
     return unit ? spokenFigureInRange(self, rangeKeys(), position, unit) : nullptr;
-  }
-
-  Ref<Array> accessibilityElements() {
-    return chartElements(self, [this](MutableArray& elements) {
-      const Ref<View> title = safeUIViewForKey(self, "titleLabel"_key);
-      _accessibilityAddTrait(title, TraitHeader);
-      elements.axSafelyAddObject(title);
-      addDays(elements, messages::frame(title).height);
-    });
   }
 
   Ref<String> _axDayStringForIndexWithFormatter(std::int64_t index, Ref<DateFormatter> formatter) {
@@ -103,6 +93,21 @@ class TrendDetailDailyAverageViewAccessibility : public TrendChart<TrendDetailDa
                                spokenFigure(average90, unit), stringForVariablesSentinel});
   }
 
+  void addColumns(MutableArray& elements, double titleHeight) {
+    const Ref<DateFormatter> formatter = make<DateFormatter>();
+    const Ref<View> view = castAsClass<View>(self);
+    const Ref<Array> stops = messages::_accessibilityGraphData(self);
+    if (!view || !stops || stops->count() != daysOfWeek) return;
+    const double top = 2 * titleHeight;
+    const double height = std::floor(static_cast<float>(messages::frame(view).height)) - top;
+    const float width = unbox<float>(stops->at(1)) - unbox<float>(stops->at(0));
+    for (std::size_t i = 0; i < daysOfWeek; ++i) {
+      const Ref<String> label = axLabelForIndex(self, static_cast<std::int64_t>(i), formatter);
+      const Rect frame = {unbox<float>(stops->at(i)), top, width, height};
+      if (label) elements.axSafelyAddObject(chartElement(self, frame, label, nullptr));
+    }
+  }
+
  private:
   double average(const Message<Ref<Quantity>(std::int32_t)>& which, std::size_t day, const Ref<Unit>& unit) {
     return roundedToHundredths(figureInUnit(answerForColumn(which, self, day), unit));
@@ -120,21 +125,6 @@ class TrendDetailDailyAverageViewAccessibility : public TrendChart<TrendDetailDa
     const Ref<Object> kept = self._accessibilityValueForKey(key);
     if (kept && !Outdone()(unboxDouble(kept), figure)) return;
     self._accessibilitySetRetainedValueForKey(number(figure), key);
-  }
-
-  void addDays(MutableArray& elements, double titleHeight) {
-    const Ref<DateFormatter> formatter = make<DateFormatter>();
-    const Ref<View> view = castAsClass<View>(self);
-    const Ref<Array> stops = messages::_accessibilityGraphData(self);
-    if (!view || !stops || stops->count() != daysOfWeek) return;
-    const double top = 2 * titleHeight;
-    const double height = std::floor(static_cast<float>(messages::frame(view).height)) - top;
-    const float width = unbox<float>(stops->at(1)) - unbox<float>(stops->at(0));
-    for (std::size_t i = 0; i < daysOfWeek; ++i) {
-      const Ref<String> label = axLabelForIndex(self, static_cast<std::int64_t>(i), formatter);
-      const Rect frame = {unbox<float>(stops->at(i)), top, width, height};
-      if (label) elements.axSafelyAddObject(chartElement(self, frame, label, nullptr));
-    }
   }
 };
 

@@ -48,7 +48,7 @@ class MoveChartDetailCellAccessibility : public SafeCategory {
   static Ref<String> wholeAmount(const Ref<Object>& energy, const Ref<Unit>& unit) {
     const Ref<Quantity> quantity = castAsClass<Quantity>(energy);
     const double amount = messages::doubleValueForUnit(quantity, unit);
-    return formatFloat(0, static_cast<float>(std::floor(amount)));
+    return formatFloat(FloatFormat::whole, static_cast<float>(std::floor(amount)));
   }
 };
 

@@ -29,7 +29,7 @@ const char ringsDescriptionKey = 0;
 Ref<String> valueText(double fraction, bool capped) {
   const double clamped = fraction > 0 ? fraction : 0;
   if (capped && clamped == 1) return accessibilityLocalizedString("lifestyle.goal.completed");
-  return formatFloatWithPercentage(static_cast<float>(clamped), 0);
+  return formatFloatWithPercentage(static_cast<float>(clamped));
 }
 
 Ref<String> standLabel() {

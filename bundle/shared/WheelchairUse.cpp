@@ -11,14 +11,12 @@ namespace ax {
 
 namespace {
 
-constexpr std::int64_t wheelchairUser = 2;  // the health store's value
-
 std::atomic<bool> isWheelchairUser = false;
 
 void askHealthStore() {
   Ref<Object> error;
   const Ref<WheelchairUseObject> answer = make<HealthStore>()->wheelchairUseWithError(error);
-  if (!error) isWheelchairUser = answer && answer->wheelchairUse() == wheelchairUser;
+  if (!error) isWheelchairUser = answer && WheelchairUse(answer->wheelchairUse()) == WheelchairUse::yes;
 }
 
 }  // namespace

@@ -5,8 +5,6 @@ namespace ax {
 
 namespace {
 
-enum ExpandedStatus : std::int64_t { isExpanded = 1, isCollapsed = 2 };
-
 // A section's header, which opens and closes the section: activating it presses its button.
 class CHWorkoutDetailExpandingHeaderViewAccessibility : public SafeCategory {
  public:

@@ -54,8 +54,8 @@ void ChartDetailCell::showFigure(double amount, double goal, std::string_view un
   percent_ = percent;
   if (!value_) value_ = make<Label>();
   const Ref<String> unit = HostStrings::textForKey(string(std::string(unitKey)));
-  value_->setText(string(formatFloat(0, static_cast<float>(amount))->text() + "/" +
-                         formatFloat(0, static_cast<float>(goal))->text() +
+  value_->setText(string(formatFloat(FloatFormat::whole, static_cast<float>(amount))->text() + "/" +
+                         formatFloat(FloatFormat::whole, static_cast<float>(goal))->text() +
                          (unit ? " " + unit->text() : "")));
 }
 

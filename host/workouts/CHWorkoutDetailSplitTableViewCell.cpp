@@ -12,7 +12,8 @@ namespace {
 
 bool isWholeUnit(const Ref<Quantity>& distance) {
   const Ref<Unit> unit = CHWorkoutDataCalculator::unitOf(distance);
-  return formatFloat(1, static_cast<float>(distance->doubleValueForUnit(unit)))->isEqual(*formatInteger(1));
+  return formatFloat(FloatFormat::twoDecimals, static_cast<float>(distance->doubleValueForUnit(unit)))
+      ->isEqual(*formatInteger(1));
 }
 
 Ref<String> nameOf(const CHWorkoutSplit& split) {

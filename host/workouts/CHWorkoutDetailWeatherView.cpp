@@ -15,13 +15,13 @@ const Message<void(Ref<Object>, Ref<Object>, std::int64_t, Ref<Object>)> setWeat
 
 Ref<String> temperatureText(const Ref<Object>& temperature) {
   const Ref<Number> degrees = cast<Number>(temperature);
-  return degrees ? hostText("weather.temperature", {formatFloat(0, degrees->floatValue())})
+  return degrees ? hostText("weather.temperature", {formatFloat(FloatFormat::whole, degrees->floatValue())})
                  : cast<String>(temperature);
 }
 
 Ref<String> humidityText(const Ref<Object>& humidity) {
   const Ref<Number> fraction = cast<Number>(humidity);
-  return fraction ? hostText("weather.humidity", {formatFloatWithPercentage(fraction->floatValue(), 0)})
+  return fraction ? hostText("weather.humidity", {formatFloatWithPercentage(fraction->floatValue())})
                   : cast<String>(humidity);
 }
 

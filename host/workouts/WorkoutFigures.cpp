@@ -20,24 +20,24 @@ const Message<Ref<Object>(Ref<Object>, Ref<String>)> attrStringWithValueUnit{"at
 struct ShownUnit {
   std::string_view unitString;
   std::string_view key;
-  int formatOption;
+  FloatFormat format;
 };
 
 constexpr std::array shownUnits = {
-    ShownUnit{"kcal", "unit.kcal", 0},
-    ShownUnit{"kJ", "unit.kj", 0},
-    ShownUnit{"km", "unit.km", 1},
-    ShownUnit{"mi", "unit.mi", 1},
-    ShownUnit{"m", "unit.m", 0},
-    ShownUnit{"yd", "unit.yd", 0},
-    ShownUnit{"ft", "unit.ft", 0},
-    ShownUnit{"km/hr", "unit.km.per.hour", 1},
-    ShownUnit{"mi/hr", "unit.mi.per.hour", 1},
-    ShownUnit{"count/min", "unit.bpm", 0},
-    ShownUnit{"W", "unit.w", 0},
-    ShownUnit{"rev/min", "unit.rpm", 0},
-    ShownUnit{"step/min", "unit.steps.per.minute", 0},
-    ShownUnit{"stroke/min", "unit.strokes.per.minute", 0},
+    ShownUnit{"kcal", "unit.kcal", FloatFormat::whole},
+    ShownUnit{"kJ", "unit.kj", FloatFormat::whole},
+    ShownUnit{"km", "unit.km", FloatFormat::twoDecimals},
+    ShownUnit{"mi", "unit.mi", FloatFormat::twoDecimals},
+    ShownUnit{"m", "unit.m", FloatFormat::whole},
+    ShownUnit{"yd", "unit.yd", FloatFormat::whole},
+    ShownUnit{"ft", "unit.ft", FloatFormat::whole},
+    ShownUnit{"km/hr", "unit.km.per.hour", FloatFormat::twoDecimals},
+    ShownUnit{"mi/hr", "unit.mi.per.hour", FloatFormat::twoDecimals},
+    ShownUnit{"count/min", "unit.bpm", FloatFormat::whole},
+    ShownUnit{"W", "unit.w", FloatFormat::whole},
+    ShownUnit{"rev/min", "unit.rpm", FloatFormat::whole},
+    ShownUnit{"step/min", "unit.steps.per.minute", FloatFormat::whole},
+    ShownUnit{"stroke/min", "unit.strokes.per.minute", FloatFormat::whole},
 };
 
 // Null for none, and for one that the app has no texts for.
@@ -107,7 +107,7 @@ Ref<AttributedString> figureOf(const Ref<Quantity>& given) {
   const Ref<Quantity> quantity = asShown(given);
   const ShownUnit* unit = shownUnit(quantity->unit());
   if (unit == nullptr) return make<AttributedString>(string(quantity->description()));
-  const Ref<String> number = formatFloat(unit->formatOption, static_cast<float>(quantity->value()));
+  const Ref<String> number = formatFloat(unit->format, static_cast<float>(quantity->value()));
   return withUnit(number, unit->key, quantity->unit()->spokenName());
 }
 
@@ -136,7 +136,7 @@ Ref<String> textWithSpokenForm(std::string text, const Ref<String>& spoken) {
 Ref<String> distanceInWords(const Ref<Quantity>& distance) {
   const ShownUnit* unit = distance ? shownUnit(distance->unit()) : nullptr;
   if (unit == nullptr) return nullptr;
-  const Ref<String> number = formatFloat(unit->formatOption, static_cast<float>(distance->value()));
+  const Ref<String> number = formatFloat(unit->format, static_cast<float>(distance->value()));
   return hostText("value.with.unit", {number, distance->unit()});
 }
 

@@ -106,8 +106,8 @@ Ref<Number> NumberFormatter::numberFromString(const Ref<String>& text) const {
   return value ? number(*value) : nullptr;
 }
 
-Ref<String> formatFloat(int option, float value) {
-  return numberString(formatting::decimalNumber(value, option == 0 ? 0 : 2));
+Ref<String> formatFloat(FloatFormat format, float value) {
+  return numberString(formatting::decimalNumber(value, format == FloatFormat::whole ? 0 : 2));
 }
 
 Ref<String> formatInteger(std::int64_t value) {
@@ -116,10 +116,10 @@ Ref<String> formatInteger(std::int64_t value) {
 
 Ref<String> formatWhole(double value) {
   return std::isfinite(value) ? formatInteger(number(value)->int64Value())
-                              : formatFloat(0, static_cast<float>(value));
+                              : formatFloat(FloatFormat::whole, static_cast<float>(value));
 }
 
-Ref<String> formatFloatWithPercentage(float fraction, int) {
+Ref<String> formatFloatWithPercentage(float fraction) {
   static NeverDestroyed<PercentTexts> texts;
   return texts->text(fraction,
                      [](double written) { return numberString(formatting::percentNumber(written)); });
@@ -129,8 +129,9 @@ Ref<String> durationStringForDuration(TimeInterval seconds) {
   return unlessNone(seconds, formatting::spokenDuration(seconds));
 }
 
-Ref<String> timeStringForType(int type, double value) {
-  return unlessNone(value, type == 3 ? formatting::spokenHours(value) : formatting::spokenDuration(value));
+Ref<String> timeStringForType(TimeStringType type, double value) {
+  return unlessNone(value, type == TimeStringType::hours ? formatting::spokenHours(value)
+                                                         : formatting::spokenDuration(value));
 }
 
 Ref<String> dateStringForFormat(const Ref<Date>& date, std::string_view pattern) {

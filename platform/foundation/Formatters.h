@@ -52,18 +52,22 @@ class NumberFormatter final : public Object {
   Ref<Number> numberFromString(const Ref<String>& text) const;
 };
 
+// How many decimals a number is written with.
+enum class FloatFormat { whole, twoDecimals };
+
 // The next four make a NumberString; what is no number, or has no end, becomes the platform's word for no
-// value. option 0: rounded half away from zero to a whole number; option 1: at most two decimals.
-Ref<String> formatFloat(int option, float value);
+// value. Rounded half away from zero; two decimals are the most.
+Ref<String> formatFloat(FloatFormat format, float value);
 Ref<String> formatInteger(std::int64_t value);
 // Without its fraction; a figure that no integer holds is the nearest that there is.
 Ref<String> formatWhole(double value);
-// 1.0 is one hundred percent; option 0 is whole percent.
-Ref<String> formatFloatWithPercentage(float fraction, int option);
+// 1.0 is one hundred percent, in whole percent.
+Ref<String> formatFloatWithPercentage(float fraction);
 // Hours, minutes and seconds in full words.
 Ref<String> durationStringForDuration(TimeInterval seconds);
-// Type 3: the value counts hours, spoken as hours and minutes. Every other type: the value counts seconds.
-Ref<String> timeStringForType(int type, double value);
+// What the value counts; hours are spoken as hours and minutes.
+enum class TimeStringType { seconds, hours };
+Ref<String> timeStringForType(TimeStringType type, double value);
 // Nil for no date.
 Ref<String> dateStringForFormat(const Ref<Date>& date, std::string_view pattern);
 Ref<Date> dateFromStringWithFormat(const Ref<String>& text, std::string_view pattern);

@@ -4,7 +4,7 @@
 
 namespace ax {
 
-// The store's answer to a question about wheelchair use: 2 is a wheelchair user.
+// The store's answer to a question about wheelchair use, a WheelchairUse.
 class WheelchairUseObject final : public Object {
  public:
   static Class& staticClass();

@@ -29,7 +29,8 @@ bool Quantity::isEqual(const Object& other) const {
 }
 
 std::string Quantity::description() const {
-  return stringWithFormat(string("{0, unit, 1}"), {formatFloat(1, static_cast<float>(value_)), unit_})
+  return stringWithFormat(string("{0, unit, 1}"),
+                          {formatFloat(FloatFormat::twoDecimals, static_cast<float>(value_)), unit_})
       ->text();
 }
 

@@ -7,6 +7,10 @@
 
 // The accessibility properties as messages: what a screen reader asks, what categories override, and what
 // sets them. Every object that the toolkit shows answers them; a String answers those of labels.
+namespace ax {
+enum ExpandedStatus : std::int64_t { notExpandable = 0, isExpanded = 1, isCollapsed = 2 };
+}
+
 namespace ax::messages {
 
 inline constinit const Message<bool()> isAccessibilityElement{"isAccessibilityElement"};
@@ -25,7 +29,7 @@ inline constinit const Message<bool()> accessibilityViewIsModal{"accessibilityVi
 inline constinit const Message<bool()> accessibilityActivate{"accessibilityActivate"};
 inline constinit const Message<void()> accessibilityIncrement{"accessibilityIncrement"};
 inline constinit const Message<void()> accessibilityDecrement{"accessibilityDecrement"};
-// 1 expanded, 2 collapsed, 0 neither.
+// An ExpandedStatus.
 inline constinit const Message<std::int64_t()> _accessibilityExpandedStatus{"_accessibilityExpandedStatus"};
 // The element under a point in the receiver's own space; the second argument is the event, which may be nil.
 inline constinit const Message<Ref<Object>(Point, Ref<Object>)> _accessibilityHitTest{

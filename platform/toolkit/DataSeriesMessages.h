@@ -7,8 +7,15 @@
 #include "platform/foundation/String.h"
 #include "platform/runtime/Message.h"
 
-// How a chart describes itself as a data series with two axes, and as a row of equal time slices. Axis 0 is
-// the horizontal one, axis 1 the vertical one. What a chart leaves out is nil, NO or 0.
+// How a chart describes itself as a data series with two axes, and as a row of equal time slices. What a
+// chart leaves out is nil, NO or 0.
+namespace ax {
+
+enum Axis : std::int64_t { horizontalAxis = 0, verticalAxis = 1 };
+enum DataSeriesType : std::int64_t { lineSeries = 0, barSeries = 2 };
+
+}  // namespace ax
+
 namespace ax::messages {
 
 // The accessibilityContainerType of a chart that is a data series.

@@ -105,8 +105,9 @@ std::vector<std::string> describeChart(const Snapshot& snapshot, const Node& cha
   addSeries(series, lines);
   addElements(elements, lines);
   addSlices(series, lines);
-  const bool hasData = !series.axes[0].values.empty() || !series.axes[1].values.empty() ||
-                       !elements.empty() || !series.slices.empty();
+  const bool hasData = !series.axes[horizontalAxis].values.empty() ||
+                       !series.axes[verticalAxis].values.empty() || !elements.empty() ||
+                       !series.slices.empty();
   if (!hasData) add(lines, once, readerText("chart.no.data"));
   return lines;
 }

@@ -30,7 +30,7 @@ void addSeries(const DataSeries& series, Json& json) {
   json["type"] = series.type;
   json["supportsSummarization"] = series.supportsSummarization;
   json["supportsSonification"] = series.supportsSonification;
-  json["axes"] = {axisAsJson(series.axes[0]), axisAsJson(series.axes[1])};
+  json["axes"] = {axisAsJson(series.axes[horizontalAxis]), axisAsJson(series.axes[verticalAxis])};
 }
 
 Json elementsAsJson(const std::vector<const Node*>& elements) {

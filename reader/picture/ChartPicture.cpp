@@ -45,7 +45,7 @@ std::string timeOf(double seconds) {
 // What the chart says of the ends and the middle, else the times of its slices, else the numbers at the ends.
 std::vector<Tick> ticksOf(const DataSeries& series, const AxisRange& range) {
   std::vector<Tick> ticks;
-  for (const auto& [position, text] : series.axes[0].positions) {
+  for (const auto& [position, text] : series.axes[horizontalAxis].positions) {
     if (position == 0 || position == 0.5 || position == 1) ticks.push_back({position, text.text});
   }
   if (!ticks.empty()) return ticks;
@@ -116,11 +116,11 @@ class ChartDrawingWithAxes {
   void addTitles(const Rect& plot) {
     if (!series_.hasAxes) return;
     const double start = isRightToLeft_ ? plot.maxX() : edge;
-    addText(start, fontSize + edge, isRightToLeft_ ? 1 : -1, titleOf(series_.axes[1]));
+    addText(start, fontSize + edge, isRightToLeft_ ? 1 : -1, titleOf(series_.axes[verticalAxis]));
     // Its ends are times or days, not figures of a unit, where the chart tells them.
-    const bool hasFigures = series_.axes[0].positions.empty();
+    const bool hasFigures = series_.axes[horizontalAxis].positions.empty();
     addText(plot.center().x, whole.height - 2 * edge, 0,
-            hasFigures ? titleOf(series_.axes[0]) : textOf(series_.axes[0].title));
+            hasFigures ? titleOf(series_.axes[horizontalAxis]) : textOf(series_.axes[horizontalAxis].title));
     if (values_.values.empty()) return;
     constexpr double middle = 0.36 * fontSize;
     addText(plot.x - edge, plot.y + middle, 1, highest());

@@ -10,7 +10,6 @@ namespace ax::reader {
 namespace {
 
 // The kind of series that is drawn as bars; others are lines.
-constexpr std::int64_t barSeries = 2;
 
 // Also what is no number, since bars keep its place free.
 std::vector<ChartValue> pointsOf(const DataSeries& series) {
@@ -80,8 +79,9 @@ AxisRange range(std::optional<double> low, std::optional<double> high) {
 }
 
 void findRanges(ChartValues& chart, const DataSeries& series) {
-  std::optional<double> left = series.axes[0].minimum, right = series.axes[0].maximum;
-  std::optional<double> low = series.axes[1].minimum, high = series.axes[1].maximum;
+  std::optional<double> left = series.axes[horizontalAxis].minimum,
+                        right = series.axes[horizontalAxis].maximum;
+  std::optional<double> low = series.axes[verticalAxis].minimum, high = series.axes[verticalAxis].maximum;
   const double lowest = std::ranges::min_element(chart.values, {}, &ChartValue::low)->low;
   const double highest = std::ranges::max_element(chart.values, {}, &ChartValue::high)->high;
   if (!left) left = chart.values.front().start;

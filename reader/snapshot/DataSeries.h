@@ -6,6 +6,7 @@
 #include <string>
 #include <vector>
 
+#include "platform/toolkit/DataSeriesMessages.h"
 #include "reader/text/AttributedText.h"
 
 namespace ax::reader {
@@ -40,7 +41,7 @@ struct DataSeries {
   std::int64_t type = 0;
   bool supportsSummarization = false;
   bool supportsSonification = false;
-  std::array<DataSeriesAxis, 2> axes;  // horizontal, vertical
+  std::array<DataSeriesAxis, 2> axes;  // by Axis
 
   bool usesSlices = false;
   double secondsPerSlice = 0;

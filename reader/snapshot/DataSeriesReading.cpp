@@ -46,7 +46,7 @@ void readSeries(Object& chart, HostQuestions& questions, DataSeries& series) {
   series.type = questions.ask(_accessibilityDataSeriesType, chart);
   series.supportsSummarization = questions.ask(_accessibilityDataSeriesSupportsSummarization, chart);
   series.supportsSonification = questions.ask(_accessibilityDataSeriesSupportsSonification, chart);
-  for (std::int64_t i : {0, 1}) series.axes[std::size_t(i)] = readAxis(chart, i, questions);
+  for (const Axis i : {horizontalAxis, verticalAxis}) series.axes[i] = readAxis(chart, i, questions);
 }
 
 void readSlices(Object& chart, HostQuestions& questions, DataSeries& series) {

@@ -27,8 +27,8 @@ States statesOf(Object& object, Traits traits, HostQuestions& questions) {
   const std::int64_t expansion = questions.ask(messages::_accessibilityExpandedStatus, object);
   return {.selected = (traits & TraitSelected) != 0,
           .disabled = (traits & TraitNotEnabled) != 0,
-          .expanded = expansion == 1,
-          .collapsed = expansion == 2,
+          .expanded = expansion == isExpanded,
+          .collapsed = expansion == isCollapsed,
           .modal = questions.ask(messages::accessibilityViewIsModal, object)};
 }
 

@@ -56,7 +56,7 @@ bool areZero(const std::vector<double>& values, const std::vector<bool>& chosen)
 
 // One flag for each value; all false where bars and values cannot be matched.
 std::vector<bool> valuesWithoutBar(const Snapshot& snapshot, const Node& chart) {
-  const std::vector<double>& values = chart.series->axes[1].values;
+  const std::vector<double>& values = chart.series->axes[verticalAxis].values;
   const std::vector<bool> none(values.size());
   const Bars bars = barsOf(snapshot, chart);
   // Wider bars stand for several values each.
@@ -79,7 +79,7 @@ DataSeries shownSeries(const Snapshot& snapshot, const Node& chart) {
   DataSeries series = *chart.series;
   const std::vector<bool> gaps = valuesWithoutBar(snapshot, chart);
   for (std::size_t i = 0; i < gaps.size(); ++i) {
-    if (gaps[i]) series.axes[1].values[i] = std::numeric_limits<double>::quiet_NaN();
+    if (gaps[i]) series.axes[verticalAxis].values[i] = std::numeric_limits<double>::quiet_NaN();
   }
   return series;
 }

@@ -137,7 +137,7 @@ double ChartNotes::heightOf(double value) const {
 }
 
 bool playsSlices(const DataSeries& series) {
-  return series.usesSlices && !series.slices.empty() && series.axes[1].values.empty();
+  return series.usesSlices && !series.slices.empty() && series.axes[verticalAxis].values.empty();
 }
 
 ChartNotes notesOfChart(const Snapshot& snapshot, const Node& chart) {
@@ -149,8 +149,8 @@ ChartNotes notesOfChart(const Snapshot& snapshot, const Node& chart) {
   const bool isAveraged = values.size() > mostNotes;
   if (isAveraged) notes.averaged = values.size();
   const Points points = isAveraged ? averagedPoints(values) : withMissedSteps(values);
-  setRange(series.axes[1], points, notes);
-  const DataSeriesAxis& axis = series.axes[0];
+  setRange(series.axes[verticalAxis], points, notes);
+  const DataSeriesAxis& axis = series.axes[horizontalAxis];
   const bool hasAxis = isFinite(axis.minimum) && isFinite(axis.maximum) && !axis.values.empty();
   const double first = hasAxis ? *axis.minimum : values.front().x;
   addNotes(first, hasAxis ? *axis.maximum : values.back().x, points, notes);

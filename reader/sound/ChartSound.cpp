@@ -27,7 +27,7 @@ std::string counted(std::string_view key, std::size_t count) {
 }
 
 // What it calls its ends, else their figures.
-std::string horizontalAxis(const DataSeriesAxis& axis) {
+std::string horizontalLine(const DataSeriesAxis& axis) {
   const auto& places = axis.positions;
   const bool isDescribed = places.size() > 1 && places.front().position == 0 && places.back().position == 1;
   const std::string range = isDescribed ? readerText("chart.range", {withSpokenTimes(places.front().text),
@@ -38,7 +38,7 @@ std::string horizontalAxis(const DataSeriesAxis& axis) {
       {joined({withSpokenTimes(axis.title), isDescribed ? std::string() : unitOf(axis), range})});
 }
 
-std::string verticalAxis(const DataSeriesAxis& axis, const ChartNotes& notes) {
+std::string verticalLine(const DataSeriesAxis& axis, const ChartNotes& notes) {
   return readerText(
       "chart.axis.y",
       {joined({withSpokenTimes(axis.title), unitOf(axis), rangeOf(notes.minimum, notes.maximum)})});
@@ -59,8 +59,8 @@ Lines linesOf(const Snapshot& snapshot, const Node& chart, const ChartNotes& not
   } else if (playsSlices(series)) {
     for (std::string& line : sliceLines(series, notes)) lines.push_back(std::move(line));
   } else {
-    lines.push_back(horizontalAxis(series.axes[0]));
-    lines.push_back(verticalAxis(series.axes[1], notes));
+    lines.push_back(horizontalLine(series.axes[horizontalAxis]));
+    lines.push_back(verticalLine(series.axes[verticalAxis], notes));
   }
   if (notes.averaged > 0) {
     const std::string_view key = playsSlices(series) ? "chart.slices" : "chart.values";

@@ -142,12 +142,12 @@ TEST(PercentText, isTheFormattersOfEveryFraction) {
     for (int round = 0; round < 2; ++round) {
       for (int i = -20; i < 2500; ++i) {
         const float fraction = static_cast<float>(i) / 1000;
-        ASSERT_EQ(formatFloatWithPercentage(fraction, 0)->text(), formatting::percentString(fraction)) << i;
+        ASSERT_EQ(formatFloatWithPercentage(fraction)->text(), formatting::percentString(fraction)) << i;
       }
     }
     for (const double fraction : {infinity, -infinity, 1e300, -0.0, 0.00499999, 0.00500001}) {
       const auto rounded = static_cast<float>(fraction);
-      EXPECT_EQ(formatFloatWithPercentage(rounded, 0)->text(), formatting::percentString(rounded));
+      EXPECT_EQ(formatFloatWithPercentage(rounded)->text(), formatting::percentString(rounded));
     }
   }
 }

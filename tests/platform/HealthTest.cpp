@@ -84,7 +84,9 @@ TEST(Unit, agreesWithItsNumber) {
   for (const auto& c : cases) {
     const RegionScope language(c.locale);
     const Ref<Object> unit = make<Unit>(c.unit, 1, Unit::Dimension());
-    EXPECT_EQ(stringWithFormat(string("{0, unit, 1}"), {formatFloat(1, c.value), unit})->text(), c.text);
+    EXPECT_EQ(stringWithFormat(string("{0, unit, 1}"), {formatFloat(FloatFormat::twoDecimals, c.value), unit})
+                  ->text(),
+              c.text);
   }
   const Ref<Unit> unnamed = make<Unit>("parsec", 1, Unit::Dimension());
   EXPECT_EQ(stringWithFormat(string("{0, unit, 1}"), {number(1), unnamed})->text(), "1 parsec");

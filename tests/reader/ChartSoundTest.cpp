@@ -44,9 +44,9 @@ class Points : public View {
     return result;
   }
   std::int64_t containerType() { return messages::dataSeriesContainerType; }
-  Ref<Array> values(std::int64_t axis) { return numbers(axis == 0 ? x : y); }
-  Ref<Number> minimum(std::int64_t axis) { return axis == 1 && hasRange ? number(60) : nullptr; }
-  Ref<Number> maximum(std::int64_t axis) { return axis == 1 && hasRange ? number(180) : nullptr; }
+  Ref<Array> values(std::int64_t axis) { return numbers(axis == horizontalAxis ? x : y); }
+  Ref<Number> minimum(std::int64_t axis) { return axis == verticalAxis && hasRange ? number(60) : nullptr; }
+  Ref<Number> maximum(std::int64_t axis) { return axis == verticalAxis && hasRange ? number(180) : nullptr; }
 
   Numbers x, y;
   bool hasRange = true;

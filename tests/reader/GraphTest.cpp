@@ -44,15 +44,15 @@ class Series : public View {
   std::int64_t type() { return 2; }
   Ref<String> name() { return string("Moves"); }
   Ref<Array> values(std::int64_t axis) {
-    if (axis == 0) return array({number(0.5), number(12)});
+    if (axis == horizontalAxis) return array({number(0.5), number(12)});
     return array({number(3), string("not a number"), number(4.25)});
   }
-  Ref<String> title(std::int64_t axis) { return axis == 0 ? string("Time") : nullptr; }
+  Ref<String> title(std::int64_t axis) { return axis == horizontalAxis ? string("Time") : nullptr; }
   Ref<Number> minimum(std::int64_t) { return number(0); }
-  Ref<Number> maximum(std::int64_t axis) { return axis == 0 ? number(24) : nullptr; }
+  Ref<Number> maximum(std::int64_t axis) { return axis == horizontalAxis ? number(24) : nullptr; }
   Ref<String> position(double position, std::int64_t axis) {
     if (position > 0.9) throw std::runtime_error("outside");
-    return axis == 0 ? string(std::to_string(int(position * 24)) + " o'clock") : nullptr;
+    return axis == horizontalAxis ? string(std::to_string(int(position * 24)) + " o'clock") : nullptr;
   }
 };
 
@@ -90,11 +90,11 @@ TEST(Graph, ReadsASeriesWithBothAxes) {
   const Node& chart = *charts(snapshot)[0];
   EXPECT_EQ(chart.role, Role::chart);
   EXPECT_FALSE(chart.isElement);
-  EXPECT_EQ(chart.series->axes[0].values, (std::vector<double>{0.5, 12}));
-  EXPECT_EQ(chart.series->axes[1].values, (std::vector<double>{3, 4.25}));  // numbers alone
-  EXPECT_EQ(chart.series->axes[1].maximum, std::nullopt);
-  EXPECT_EQ(chart.series->axes[0].positions.size(), 4u);  // the fifth one raises
-  EXPECT_TRUE(chart.series->axes[1].positions.empty());
+  EXPECT_EQ(chart.series->axes[horizontalAxis].values, (std::vector<double>{0.5, 12}));
+  EXPECT_EQ(chart.series->axes[verticalAxis].values, (std::vector<double>{3, 4.25}));  // numbers alone
+  EXPECT_EQ(chart.series->axes[verticalAxis].maximum, std::nullopt);
+  EXPECT_EQ(chart.series->axes[horizontalAxis].positions.size(), 4u);  // the fifth one raises
+  EXPECT_TRUE(chart.series->axes[verticalAxis].positions.empty());
   EXPECT_EQ(snapshot.timesRaised(), 2u);
 }
 
@@ -122,7 +122,7 @@ TEST(Graph, NamesTheUnitOfAnAxis) {
       {"steps", "Unit: steps, "},
       {"count", ""}};
   for (const auto& [label, told] : units) {
-    chart.series->axes[1].unitLabel = AttributedText{label};
+    chart.series->axes[verticalAxis].unitLabel = AttributedText{label};
     const std::vector<std::string> lines = describeChart(snapshot, chart);
     const std::string expected = std::string("  Vertical axis: ") + told + "Lowest: 0, 2 values";
     EXPECT_NE(std::ranges::find(lines, expected), lines.end()) << label;

@@ -57,8 +57,8 @@ DataSeries bars(std::vector<double> x, std::vector<double> y) {
   DataSeries series;
   series.hasAxes = true;
   series.type = 2;
-  series.axes[0].values = std::move(x);
-  series.axes[1].values = std::move(y);
+  series.axes[horizontalAxis].values = std::move(x);
+  series.axes[verticalAxis].values = std::move(y);
   return series;
 }
 
@@ -150,8 +150,8 @@ TEST(NumberMarks, ShareAFrameAndShrinkIntoSmallOnes) {
 
 TEST(ChartDrawing, DrawsBarsOfTheirHeight) {
   DataSeries series = bars({0, 1, 2, 23}, {2, 0, 4, 99});
-  series.axes[0].maximum = 24;
-  series.axes[1].maximum = 8;
+  series.axes[horizontalAxis].maximum = 24;
+  series.axes[verticalAxis].maximum = 8;
   EXPECT_EQ(heights(series), (std::vector<double>{25, 0, 50, 100})) << "none is higher than its axis";
   const ChartDrawing drawing = drawChart(series, plot);
   EXPECT_NEAR(drawing.bars[0].x, 101, 1e-9);  // a place is 10 wide, a tenth of it free on each side
@@ -211,8 +211,8 @@ TEST(ChartDrawing, SurvivesValuesOfABrokenHost) {
   const double huge = std::numeric_limits<double>::max();
   for (const double odd : {huge, -huge, none, HUGE_VAL}) {
     DataSeries series = bars({odd, 1, odd}, {1, odd, 2});
-    series.axes[0].minimum = odd;
-    series.axes[1].maximum = odd;
+    series.axes[horizontalAxis].minimum = odd;
+    series.axes[verticalAxis].maximum = odd;
     EXPECT_LE(drawChart(series, plot).bars.size(), 3u);
     EXPECT_FALSE(chartPicture(series, "odd").empty());
   }

@@ -13,7 +13,7 @@ using reader::readerText;
 namespace {
 
 std::vector<ChartStep> valueSteps(const Item& chart) {
-  const reader::DataSeriesAxis& axis = chart.node.series->axes[1];
+  const reader::DataSeriesAxis& axis = chart.node.series->axes[verticalAxis];
   std::vector<ChartStep> steps;
   for (std::size_t i = 0; i < axis.values.size(); ++i) {
     std::string value = formatting::decimalString(axis.values[i], 2);

@@ -60,7 +60,7 @@ std::optional<StepNote> noteOfValue(const reader::DataSeries& series, const Char
 // That of the values whose part of all bars lies in this one.
 std::optional<StepNote> averageIn(const Span& span, const Span& all, const reader::DataSeries& series,
                                   const ChartNotes& notes) {
-  const std::size_t values = series.axes[1].values.size();
+  const std::size_t values = series.axes[verticalAxis].values.size();
   double heights = 0, places = 0;
   int count = 0;
   for (std::size_t i = 0; i < values; ++i) {
@@ -78,7 +78,7 @@ std::optional<StepNote> averageIn(const Span& span, const Span& all, const reade
 
 // The values that have a bar, by their indexes.
 std::vector<std::size_t> shownValues(const reader::DataSeries& series) {
-  const std::vector<double>& values = series.axes[1].values;
+  const std::vector<double>& values = series.axes[verticalAxis].values;
   std::vector<std::size_t> shown;
   for (std::size_t i = 0; i < values.size(); ++i) {
     if (std::isfinite(values[i])) shown.push_back(i);
@@ -93,7 +93,7 @@ std::optional<StepNote> noteOfStep(const ScreenModel& model, const Item& chart,
   const reader::Node& node = *model.snapshot().node(chart.node.id);
   const reader::DataSeries series = reader::shownSeries(model.snapshot(), node);
   const ChartNotes notes = reader::notesOfChart(model.snapshot(), node);
-  if (series.axes[1].values.size() == steps.size()) return noteOfValue(series, notes, at);
+  if (series.axes[verticalAxis].values.size() == steps.size()) return noteOfValue(series, notes, at);
   const std::vector<std::size_t> shown = shownValues(series);
   if (shown.size() == steps.size()) return noteOfValue(series, notes, shown[at]);
   const std::vector<Span> spans = spansOf(model, chart, steps);
