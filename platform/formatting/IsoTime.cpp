@@ -1,5 +1,7 @@
 #include "platform/formatting/IsoTime.h"
 
+#include <algorithm>
+#include <charconv>
 #include <chrono>
 #include <cmath>
 #include <cstdint>
@@ -13,87 +15,78 @@
 namespace ax::formatting {
 namespace {
 
-// Takes text off the front; `good` turns false at the first thing that does not fit.
-class Reader {
- public:
-  explicit Reader(std::string_view text) : rest_(text) {}
+// Takes a text apart from the left. Each step takes what it matched; on a mismatch it takes nothing.
+struct Scanner {
+  std::string_view rest;
 
-  bool good() const { return good_; }
-  bool atEnd() const { return rest_.empty(); }
-  bool skip(char c) {
-    if (rest_.empty() || rest_.front() != c) return false;
-    rest_.remove_prefix(1);
+  bool take(std::string_view anyOf) {
+    if (rest.empty() || anyOf.find(rest.front()) == std::string_view::npos) return false;
+    rest.remove_prefix(1);
     return true;
   }
-  void expect(char c) {
-    if (!skip(c)) good_ = false;
-  }
-  int number(std::size_t digits, int largest);
-  double fraction();
 
- private:
-  bool startsWithDigit() const { return !rest_.empty() && rest_.front() >= '0' && rest_.front() <= '9'; }
-  int digit() {
-    const int value = rest_.front() - '0';
-    rest_.remove_prefix(1);
+  std::optional<int> takeNumber(std::size_t digits, int most) {
+    int value = 0;
+    if (rest.size() < digits || rest.front() == '-') return std::nullopt;
+    const char* end = rest.data() + digits;
+    const auto [stop, error] = std::from_chars(rest.data(), end, value);
+    if (error != std::errc{} || stop != end || value > most) return std::nullopt;
+    rest.remove_prefix(digits);
     return value;
   }
 
-  std::string_view rest_;
-  bool good_ = true;
+  // ".250" or ",250"; 0 where there is none. Digits that no double of this size tells apart do not count.
+  std::optional<double> takeFraction() {
+    if (!take(".,")) return 0.0;
+    const std::size_t digits = std::min(rest.find_first_not_of("0123456789"), rest.size());
+    if (digits == 0) return std::nullopt;
+    double value = 0;
+    double scale = 1;
+    for (const char digit : rest.substr(0, std::min<std::size_t>(digits, 15))) {
+      value = value * 10 + (digit - '0');
+      scale *= 10;
+    }
+    rest.remove_prefix(digits);
+    return value / scale;
+  }
 };
 
-int Reader::number(std::size_t digits, int largest) {
-  int value = 0;
-  for (std::size_t i = 0; i < digits; ++i) {
-    if (!startsWithDigit()) {
-      good_ = false;
-      return 0;
-    }
-    value = value * 10 + digit();
-  }
-  if (value > largest) good_ = false;
-  return value;
-}
-
-double Reader::fraction() {
-  if (!startsWithDigit()) good_ = false;
-  double value = 0;
-  for (double scale = 0.1; startsWithDigit(); scale /= 10) value += digit() * scale;
-  return value;
-}
-
-// Seconds of the date since 1970-01-01, as if local time were UTC.
-double readDate(Reader& reader, bool& exists) {
+// Seconds since 1970-01-01, as if local time were UTC.
+std::optional<double> takeDate(Scanner& scanner) {
   using namespace std::chrono;
-  const year y{reader.number(4, 9999)};
-  reader.expect('-');
-  const month m{static_cast<unsigned>(reader.number(2, 12))};
-  reader.expect('-');
-  const day d{static_cast<unsigned>(reader.number(2, 31))};
-  const year_month_day date{y, m, d};
-  exists = reader.good() && date.ok();
-  return exists ? sys_days(date).time_since_epoch().count() * 86400.0 : 0;
+  const auto y = scanner.takeNumber(4, 9999);
+  if (!y || !scanner.take("-")) return std::nullopt;
+  const auto m = scanner.takeNumber(2, 12);
+  if (!m || !scanner.take("-")) return std::nullopt;
+  const auto d = scanner.takeNumber(2, 31);
+  if (!d) return std::nullopt;
+  const year_month_day date{year{*y}, month{static_cast<unsigned>(*m)}, day{static_cast<unsigned>(*d)}};
+  if (!date.ok()) return std::nullopt;
+  return sys_days(date).time_since_epoch().count() * 86400.0;
 }
 
-double readClock(Reader& reader) {
-  const int hour = reader.number(2, 23);
-  reader.expect(':');
-  const int minute = reader.number(2, 59);
-  reader.expect(':');
-  double second = reader.number(2, 59);
-  if (reader.skip('.')) second += reader.fraction();
-  return hour * 3600 + minute * 60 + second;
+std::optional<double> takeClock(Scanner& scanner) {
+  const auto hour = scanner.takeNumber(2, 23);
+  if (!hour || !scanner.take(":")) return std::nullopt;
+  const auto minute = scanner.takeNumber(2, 59);
+  if (!minute) return std::nullopt;
+  const double seconds = *hour * 3600.0 + *minute * 60.0;
+  if (!scanner.take(":")) return seconds;
+  const auto second = scanner.takeNumber(2, 60);  // 60: a leap second
+  if (!second) return std::nullopt;
+  const auto fraction = scanner.takeFraction();
+  return fraction ? std::optional(seconds + *second + *fraction) : std::nullopt;
 }
 
-std::optional<double> readOffset(Reader& reader) {
-  if (reader.skip('Z')) return 0;
-  const bool west = reader.skip('-');
-  if (!west && !reader.skip('+')) return std::nullopt;
-  const int hours = reader.number(2, 23);
-  reader.skip(':');
-  const double offset = hours * 3600 + reader.number(2, 59) * 60;
-  return west ? -offset : offset;
+// "+01:00", "+0100" or "+01".
+std::optional<double> takeOffset(Scanner& scanner) {
+  const double direction = scanner.rest.starts_with('-') ? -1 : 1;
+  if (!scanner.take("+-")) return std::nullopt;
+  const auto hours = scanner.takeNumber(2, 23);
+  if (!hours || scanner.rest.empty()) return hours ? std::optional(direction * *hours * 3600) : std::nullopt;
+  scanner.take(":");
+  const auto minutes = scanner.takeNumber(2, 59);
+  return minutes ? std::optional(direction * (*hours * 3600.0 + *minutes * 60.0)) : std::nullopt;
 }
 
 std::string isoOfLocal(double local) {
@@ -110,17 +103,32 @@ std::string isoOfLocal(double local) {
 
 }  // namespace
 
+std::optional<IsoTime> readIso(std::string_view text) {
+  Scanner scanner{text};
+  IsoTime time;
+  const auto date = takeDate(scanner);
+  if (!date) return std::nullopt;
+  time.local = *date;
+  if (scanner.rest.empty()) return time;
+  if (!scanner.take("Tt ")) return std::nullopt;
+  const auto clock = takeClock(scanner);
+  if (!clock) return std::nullopt;
+  time.local += *clock;
+  time.hasClock = true;
+  time.isUtc = scanner.take("Zz");
+  if (!time.isUtc && !scanner.rest.empty()) {
+    time.offset = takeOffset(scanner);
+    if (!time.offset) return std::nullopt;
+  }
+  return scanner.rest.empty() ? std::optional(time) : std::nullopt;
+}
+
 std::optional<double> timeFromIso(std::string_view text) {
-  Reader reader(text);
-  bool exists = false;
-  double local = readDate(reader, exists);
-  if (!exists) return std::nullopt;
-  if (reader.atEnd()) return currentZoneRanges()->instantOfLocal(local, RepeatedTime::first);
-  reader.expect('T');
-  local += readClock(reader);
-  const std::optional<double> offset = readOffset(reader);
-  if (!reader.good() || !reader.atEnd()) return std::nullopt;
-  return offset ? local - *offset : currentZoneRanges()->instantOfLocal(local, RepeatedTime::last);
+  const auto time = readIso(text);
+  if (!time) return std::nullopt;
+  if (time->isUtc || time->offset) return time->local - time->offset.value_or(0);
+  return currentZoneRanges()->instantOfLocal(time->local,
+                                             time->hasClock ? RepeatedTime::last : RepeatedTime::first);
 }
 
 std::string isoFromTime(double time) {

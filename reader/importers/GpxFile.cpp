@@ -1,6 +1,5 @@
 #include "reader/importers/GpxFile.h"
 
-#include "reader/importers/IsoTime.h"
 #include "reader/importers/PointFigures.h"
 #include "reader/importers/RouteMeasures.h"
 #include "reader/importers/Sport.h"
@@ -46,11 +45,10 @@ TrackPoint readPoint(pugi::xml_node node, double time) {
 void appendSegment(pugi::xml_node node, WorkoutActivity& activity) {
   PointRange range{.first = activity.points.size()};
   for (const pugi::xml_node point : childrenNamed(node, "trkpt")) {
-    const std::string text = textOf(childNamed(point, "time"));
-    const auto time = parseIsoTime(text);
+    const auto time = parseTime(textOf(childNamed(point, "time")));
     if (!time) continue;
-    if (activity.points.empty()) activity.secondsEastOfUtc = offsetOfIsoTime(text);
-    activity.points.push_back(readPoint(point, *time));
+    if (activity.points.empty()) activity.secondsEastOfUtc = time->secondsEastOfUtc;
+    activity.points.push_back(readPoint(point, time->time));
   }
   range.count = activity.points.size() - range.first;
   if (range.count > 0) activity.segments.push_back(range);

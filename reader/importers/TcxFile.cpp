@@ -1,6 +1,5 @@
 #include "reader/importers/TcxFile.h"
 
-#include "reader/importers/IsoTime.h"
 #include "reader/importers/PointFigures.h"
 #include "reader/importers/RouteMeasures.h"
 #include "reader/importers/Sport.h"
@@ -58,12 +57,11 @@ std::optional<double> amountIn(pugi::xml_node node, std::string_view path) {
 PointRange appendTrack(pugi::xml_node track, WorkoutActivity& activity) {
   const std::size_t first = activity.points.size();
   for (const pugi::xml_node node : childrenNamed(track, "Trackpoint")) {
-    const std::string text = textOf(childNamed(node, "Time"));
-    const auto time = parseIsoTime(text);
+    const auto time = parseTime(textOf(childNamed(node, "Time")));
     if (!time) continue;
-    if (activity.points.empty()) activity.secondsEastOfUtc = offsetOfIsoTime(text);
+    if (activity.points.empty()) activity.secondsEastOfUtc = time->secondsEastOfUtc;
     TrackPoint point;
-    point.time = *time;
+    point.time = time->time;
     for (const PointField& each : pointFields) {
       point.*each.field = parseNumber(textOf(childAt(node, each.path)), each.limits);
     }
@@ -101,9 +99,9 @@ void appendLap(pugi::xml_node node, WorkoutActivity& activity) {
   lap.points.first = activity.points.size();
   const double trackSeconds = appendTracks(node, activity);
   lap.points.count = activity.points.size() - lap.points.first;
-  const auto start = parseIsoTime(node.attribute("StartTime").value());
+  const auto start = parseTime(node.attribute("StartTime").value());
   if (!start && lap.points.count == 0) return;
-  lap.start = start.value_or(activity.points.empty() ? 0 : activity.points[lap.points.first].time);
+  lap.start = start ? start->time : activity.points[lap.points.first].time;
   const double clock = amountIn(node, "TotalTimeSeconds").value_or(0);
   lap.seconds = clock > 0 ? clock : trackSeconds;
   lap.metres = amountIn(node, "DistanceMeters").value_or(0);

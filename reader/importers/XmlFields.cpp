@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <charconv>
 
+#include "platform/formatting/IsoTime.h"
 #include "reader/importers/TextEncoding.h"
 
 namespace ax::reader {
@@ -80,6 +81,12 @@ std::optional<double> parseNumber(std::string_view text, NumberLimits limits) {
 std::optional<float> parseShort(std::string_view text, NumberLimits limits) {
   const auto value = parseNumber(text, limits);
   return value ? std::optional(static_cast<float>(*value)) : std::nullopt;
+}
+
+std::optional<FileTime> parseTime(std::string_view text) {
+  const auto read = formatting::readIso(trimmed(text));
+  if (!read || !read->hasClock) return std::nullopt;
+  return FileTime{read->local - read->offset.value_or(0), read->offset};
 }
 
 }  // namespace ax::reader

@@ -46,4 +46,12 @@ std::optional<double> parseNumber(std::string_view text, NumberLimits limits);
 // The same, for fields that need no more digits.
 std::optional<float> parseShort(std::string_view text, NumberLimits limits);
 
+// Seconds since 1970-01-01 00:00 UTC; a time without an offset is in UTC.
+struct FileTime {
+  double time = 0;
+  std::optional<double> secondsEastOfUtc = {};  // as the text tells; "Z" tells no local time
+};
+// A date with its time of the day, with nothing but blanks around it.
+std::optional<FileTime> parseTime(std::string_view text);
+
 }  // namespace ax::reader
