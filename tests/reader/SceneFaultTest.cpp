@@ -108,7 +108,7 @@ TEST(SceneFault, ValuesAreOfTheKindThatTheMemberTakes) {
       probeSetting("_styled", "\"0:42\"", "", "a value of class AttributedString"),
       probeSetting("note", "5", "", "a value of class Number for note"),
       probeSetting("frame", R"({"point": [1, 2]})", "", "a rect"),
-      probeSetting("_anything", R"({"date": "2026-03-08 14:30"})", "/date", "a date"),
+      probeSetting("_anything", R"({"date": "2026-03-08 14h30"})", "/date", "a date"),
       probeSetting("_anything", R"({"quantity": [1, "stone"]})", "/quantity/1", "a unit"),
       probeSetting("_anything", R"({"rect": [1, 2, 3]})", "/rect", "a list of 3"),
       probeSetting("_anything", R"({"interval": [{"date": "x"}, "y"]})", "/interval/0", "expected a string"),
