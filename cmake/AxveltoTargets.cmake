@@ -31,6 +31,17 @@ if(AXVELTO_FUZZ)
   target_compile_options(axvelto-settings INTERFACE -fno-sanitize=function,vptr)
 endif()
 
+# What nearly every source includes, read once for each target: a build of everything takes a third less. Sources
+# still include what they use, which the other presets and the lints hold.
+option(AXVELTO_PRECOMPILE "Precompile the headers that nearly every source includes" OFF)
+macro(axvelto_precompile target visibility)
+  if(AXVELTO_PRECOMPILE)
+    target_precompile_headers(${target} ${visibility} ${ARGN})
+  endif()
+endmacro()
+axvelto_precompile(axvelto-settings INTERFACE <algorithm> <array> <atomic> <cmath> <functional> <map> <memory> <mutex>
+                   <optional> <set> <span> <string> <string_view> <unordered_map> <utility> <vector>)
+
 # All sources below this folder, without those of folders that are targets of their own.
 macro(axvelto_sources variable)
   file(GLOB_RECURSE ${variable} CONFIGURE_DEPENDS ${CMAKE_CURRENT_SOURCE_DIR}/*.cpp)
