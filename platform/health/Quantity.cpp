@@ -18,7 +18,11 @@ bool Quantity::isCompatibleWithUnit(const Ref<Unit>& unit) const {
 }
 
 double Quantity::doubleValueForUnit(const Ref<Unit>& unit) const {
-  if (unit && unit_ && unit->hasTextOf(*unit_)) return value_;
+  return unit && unit_ && unit->hasTextOf(*unit_) ? value_ : convertedTo(unit);
+}
+
+// Apart, so that a value in its own unit saves no registers for it.
+[[gnu::noinline]] double Quantity::convertedTo(const Ref<Unit>& unit) const {
   return isCompatibleWithUnit(unit) ? value_ * unit_->factor() / unit->factor() : 0;
 }
 

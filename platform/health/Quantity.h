@@ -21,6 +21,8 @@ class Quantity final : public Object {
   std::string description() const override;
 
  private:
+  double convertedTo(const Ref<Unit>& unit) const;
+
   double value_;
   Ref<Unit> unit_;
 };

@@ -29,11 +29,11 @@ std::deque<CategoryGraft>& grafts() {
   return *all;
 }
 
+}  // namespace
+
 const Method& replacedBy(const Method& grafted) {
   return grafted.former != nullptr ? *grafted.former : grafted.owner->lookUpInSuperclass(grafted.selector);
 }
-
-}  // namespace
 
 bool graftCategory(Class& category, Class& target) {
   if (category.graft() != nullptr) return false;
@@ -56,12 +56,6 @@ const CategoryGraft* graftOf(const Class& category) {
   return category.graft();
 }
 
-// A message that was never used names no entry, and need not be resolved to see it.
-const Method& superMethod(const Method& current, const MessageRecord& message) {
-  return current.selector == message.selectorIfUsed() ? replacedBy(current)
-                                                      : superMethod(current, message.selector());
-}
-
 const Method& superMethod(const Method& current, Selector selector) {
   if (current.selector == selector) return replacedBy(current);
   if (current.graft != nullptr) {
@@ -70,6 +64,10 @@ const Method& superMethod(const Method& current, Selector selector) {
     }
   }
   return current.owner->lookUp(selector);
+}
+
+const Method& superMethodOfAnother(const Method& current, const MessageRecord& message) {
+  return superMethod(current, message.selector());
 }
 
 }  // namespace ax

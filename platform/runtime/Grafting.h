@@ -35,8 +35,17 @@ bool graftCategory(Class& category, Class& target);
 // The graft of a category; null when it was never grafted.
 const CategoryGraft* graftOf(const Class& category);
 
-// The entry that a call to super reaches from inside a grafted one.
-const Method& superMethod(const Method& current, const MessageRecord& message);
+// What answered a grafted entry's message before it.
+const Method& replacedBy(const Method& grafted);
+
+// The entry that a call to super reaches from inside a grafted one. A message that was never used names no
+// entry, and need not be resolved to see it.
 const Method& superMethod(const Method& current, Selector selector);
+const Method& superMethodOfAnother(const Method& current, const MessageRecord& message);
+inline const Method& superMethod(const Method& current, const MessageRecord& message) {
+  if (current.selector == message.selectorIfUsed()) [[likely]]
+    return replacedBy(current);
+  return superMethodOfAnother(current, message);
+}
 
 }  // namespace ax

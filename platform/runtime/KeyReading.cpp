@@ -58,10 +58,19 @@ std::int64_t Object::safeIntForKey(Key key) const {
   return unboxInt(safeValueForKey(key));
 }
 // A method that answers a double is asked for it without a number in between.
+namespace {
+
+// Apart, so that the common read saves no registers for it.
+[[gnu::noinline]] double unboxedDoubleForKey(const Object& object, Key key) {
+  return unboxDouble(object.safeValueForKey(key));
+}
+
+}  // namespace
+
 double Object::safeDoubleForKey(Key key) const {
   const Method* method = key ? isa().readerForKey(key).method : nullptr;
   if (method == nullptr || method->signature != &signatureOf<double>())
-    return unboxDouble(safeValueForKey(key));
+    return unboxedDoubleForKey(*this, key);
   try {
     return reinterpret_cast<double (*)(Object&, const Method&)>(method->function)(const_cast<Object&>(*this),
                                                                                   *method);

@@ -16,4 +16,8 @@ const Method& MessageRecord::answerSlowly(const Object& object) const {
   return object.isa().lookUp(selector());
 }
 
+bool MessageRecord::hasTypeOnceResolved(const Method& method) const {
+  return method.signature == &signature();
+}
+
 }  // namespace ax

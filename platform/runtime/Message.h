@@ -52,7 +52,7 @@ class MessageRecord {
   bool hasTypeOf(const Method& method) const {
     if (method.signature == signature_.load(std::memory_order_relaxed)) [[likely]]
       return true;
-    return method.signature == &signature();
+    return hasTypeOnceResolved(method);
   }
   const void* result() const { return result_.load(std::memory_order_relaxed); }
 
@@ -61,6 +61,7 @@ class MessageRecord {
 
   Selector resolve() const;
   const Method& answerSlowly(const Object& object) const;
+  bool hasTypeOnceResolved(const Method& method) const;
 
   std::string_view name_;
   const Signature& (*makeSignature_)();
