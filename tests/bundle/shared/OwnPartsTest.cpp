@@ -70,6 +70,9 @@ struct RaisingMethod {
   void (*install)(ClassBuilder<Object>&);
   const char* title;  // what the achievement is called then
 };
+void PrintTo(const RaisingMethod& method, std::ostream* out) {
+  *out << method.name;
+}
 
 class RaisingProvider : public testing::TestWithParam<RaisingMethod> {};
 
