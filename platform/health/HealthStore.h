@@ -1,5 +1,8 @@
 #pragma once
 
+#include <functional>
+
+#include "platform/foundation/Environment.h"
 #include "platform/foundation/String.h"
 
 namespace ax {
@@ -24,6 +27,11 @@ class HealthStore final : public Object {
   // Nil, with `error` set, when the store cannot say.
   Ref<WheelchairUseObject> wheelchairUseWithError(Ref<Object>& error) const;
 };
+
+// What every store answers from now on in place of the environment's setting; it runs on the thread that
+// asks, so it may take its time and must be safe to call on several threads at once. None gives the
+// environment its say again. Any thread.
+void setWheelchairAnswer(std::function<WheelchairUse()> answer);
 
 // How many wheelchair queries all stores of the process have answered.
 std::size_t wheelchairQueries();
