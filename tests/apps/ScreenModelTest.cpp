@@ -212,7 +212,7 @@ TEST_F(ScreenModelTest, WhatCoversTheScreenGoesItsOwnWayElseItIsHidden) {
   EXPECT_EQ(cover->escapes, 2);
   EXPECT_TRUE(cover->isHidden());
   EXPECT_EQ(focused(), "one");
-  EXPECT_EQ(dismissModal(model, model.focus()).result, reader::ActionResult::unavailable);
+  EXPECT_EQ(dismissModal(model, model.focus()).announcements, Names{"Nothing happened"});
 }
 
 TEST_F(ScreenModelTest, PagesCountAsTheyAreSpoken) {

@@ -67,7 +67,11 @@ Effect operate(ScreenModel& model, reader::Action action, ItemId item) {
 
 Effect dismissModal(ScreenModel& model, ItemId item) {
   const Item* modal = model.find(model.modalAround(item));
-  if (modal == nullptr) return {};
+  if (modal == nullptr) {
+    Effect nothing;
+    tellWhatWentWrong(nothing);
+    return nothing;
+  }
   const Ref<Object> object = model.snapshot().object(modal->node.id);
   return effectOf(model, [&] { return escape(object); });
 }
