@@ -62,7 +62,8 @@ std::vector<Command> allCommands() {
                          {"menu.view", "view.smaller", "Ctrl+-", call<&ViewWindow::zoom>, back},
                          {"menu.view", "view.actual", "Ctrl+0", call<&ViewWindow::zoom>, 0},
                          {"menu.view", "window.close", "Ctrl+Q Ctrl+W", call<&ViewWindow::leave>},
-                         {"menu.help", "help.keys", "F1", call<&ViewWindow::showKeys>}});
+                         {"menu.help", "help.keys", "F1", call<&ViewWindow::showKeys>},
+                         {"menu.help", "help.menus", "F10", call<&ViewWindow::openMenus>}});
   return all;
 }
 

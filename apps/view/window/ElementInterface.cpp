@@ -122,13 +122,15 @@ QVariant ElementInterface::minimumValue() const {
   return item() == nullptr ? QVariant() : QVariant(qlonglong(item()->position.least));
 }
 
-// Step by step, as far as the host follows.
+// Step by step, as far as the host follows in this direction.
 void ElementInterface::setCurrentValue(const QVariant& value) {
-  const std::int64_t wanted = value.toLongLong();
-  for (std::int64_t now = currentValue().toLongLong(); item() != nullptr && wanted != now;) {
-    tree_.requestAction(wanted > now ? Action::increment : Action::decrement, id_);
-    if (currentValue().toLongLong() == now) return;
-    now = currentValue().toLongLong();
+  std::int64_t left = value.toLongLong() - currentValue().toLongLong();
+  const std::int64_t direction = left > 0 ? 1 : -1;
+  while (item() != nullptr && left * direction > 0) {
+    const std::int64_t before = left;
+    tree_.requestAction(direction > 0 ? Action::increment : Action::decrement, id_);
+    left = value.toLongLong() - currentValue().toLongLong();
+    if (left * direction >= before * direction) return;
   }
 }
 

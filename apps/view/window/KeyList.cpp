@@ -2,11 +2,25 @@
 
 #include <QLabel>
 #include <QListWidget>
+#include <QScreen>
 #include <QVBoxLayout>
 
 #include "apps/view/window/ViewStrings.h"
 
 namespace ax::view {
+
+namespace {
+
+constexpr QSize usualSize(420, 560);
+constexpr double shareOfDesktop = 0.85;
+
+// The signs of a key keep their order in text that runs from right to left.
+QString isolated(const QString& key) {
+  constexpr QChar leftToRightIsolate(0x2066), endOfIsolate(0x2069);
+  return leftToRightIsolate + key + endOfIsolate;
+}
+
+}  // namespace
 
 QList<QKeySequence> keysOf(const Command& command) {
   QList<QKeySequence> keys;
@@ -21,7 +35,8 @@ KeyList::KeyList(QWidget* parent) : QDialog(parent) {
   list->setAccessibleName(windowTitle());
   for (const Command& command : commands()) {
     const QString key = keysOf(command).front().toString(QKeySequence::NativeText);
-    list->addItem(commandText(command) + ": " + key);
+    auto* row = new QListWidgetItem(commandText(command) + ": " + isolated(key), list);
+    row->setData(Qt::AccessibleTextRole, QString(commandText(command) + ": " + key));
   }
   list->setCurrentRow(0);
   auto* arrows = new QLabel(viewText("help.arrows"));
@@ -29,7 +44,7 @@ KeyList::KeyList(QWidget* parent) : QDialog(parent) {
   auto* column = new QVBoxLayout(this);
   column->addWidget(list);
   column->addWidget(arrows);
-  resize(420, 520);
+  resize(usualSize.boundedTo(screen()->availableSize() * shareOfDesktop));
 }
 
 }  // namespace ax::view

@@ -6,10 +6,23 @@
 
 namespace ax::view {
 
+namespace {
+
+constexpr double sizeToDesktop = 1.1;
+
+}  // namespace
+
 Notice::Notice() {
+  QFont large = font();
+  large.setPointSizeF(large.pointSizeF() * sizeToDesktop);
+  setFont(large);
   setWordWrap(true);
   setTextFormat(Qt::PlainText);
-  setMargin(fontMetrics().height() / 2);
+  setMargin(fontMetrics().height() / 3);
+  // The picture stays in its place when a line comes and goes.
+  QSizePolicy policy = sizePolicy();
+  policy.setRetainSizeWhenHidden(true);
+  setSizePolicy(policy);
   hide();
 }
 

@@ -11,6 +11,9 @@ namespace {
 
 constexpr QRectF emptyScreen(0, 0, 320, 200);
 constexpr double outlineWidth = 4;
+constexpr int bandHeight = 2048;  // pixels
+constexpr std::size_t mostBands = 4;
+constexpr float veilStrength = 0.75F;
 // In points of the screen.
 constexpr double typeSize = 13, roomForNumber = 28, textMargin = 3, narrowestText = 80;
 
@@ -46,7 +49,13 @@ void ScreenCanvas::setPicture(const std::string& svg, const PictureColours& colo
 
 void ScreenCanvas::setZoom(double zoom) {
   zoom_ = zoom;
+  bands_.clear();
   setFixedSize(sizeHint());
+  update();
+}
+
+void ScreenCanvas::setMark(std::optional<Point> mark) {
+  mark_ = mark;
   update();
 }
 
@@ -69,9 +78,32 @@ Point ScreenCanvas::pointOf(QPointF pixel) const {
 void ScreenCanvas::paintEvent(QPaintEvent* event) {
   QPainter painter(this);
   painter.setRenderHint(QPainter::Antialiasing);
-  if (picture_.isValid()) picture_.render(&painter, QRectF(rect()));
+  if (picture_.isValid()) paintPicture(painter, event->rect());
   paintTexts(painter, event->rect());
   paintFocus(painter);
+  paintMark(painter);
+}
+
+// Drawing takes as long as the whole picture is, however little of it is seen, and the focus moves often.
+void ScreenCanvas::paintPicture(QPainter& painter, const QRect& exposed) {
+  for (int number = exposed.top() / bandHeight; number * bandHeight <= exposed.bottom(); ++number) {
+    painter.drawPixmap(0, number * bandHeight, band(number));
+  }
+}
+
+const QPixmap& ScreenCanvas::band(int number) {
+  const auto known = bands_.find(number);
+  const double density = devicePixelRatioF();
+  if (known != bands_.end() && known->second.devicePixelRatio() == density) return known->second;
+  if (bands_.size() >= mostBands) bands_.clear();
+  QPixmap drawn((QSizeF(width(), bandHeight) * density).toSize());
+  drawn.setDevicePixelRatio(density);
+  drawn.fill(colours_.ground);
+  QPainter painter(&drawn);
+  painter.setRenderHint(QPainter::Antialiasing);
+  painter.translate(0, -number * bandHeight);
+  picture_.render(&painter, QRectF(rect()));
+  return bands_.insert_or_assign(number, drawn).first->second;
 }
 
 // Beside the numbers, which stand in the corners where reading begins.
@@ -94,13 +126,17 @@ void ScreenCanvas::paintTexts(QPainter& painter, const QRectF& exposed) {
   painter.setClipping(false);
 }
 
-// Charts have their name at the top, on ground of its own, since their lines run anywhere.
+// Charts have their name at the top, on ground that their lines still show through.
 void ScreenCanvas::paintText(QPainter& painter, const QRectF& room, const Item& item) {
   const QString text =
       brokenText(QString::fromStdString(item.name), painter.font(), room.width(), room.height());
   const bool isChart = item.node.series.has_value();
   const int flags = int(Qt::AlignLeading | (isChart ? Qt::AlignTop : Qt::AlignVCenter));
-  if (isChart) painter.fillRect(painter.boundingRect(room, flags, text), colours_.ground);
+  if (isChart) {
+    QColor veil = colours_.ground;
+    veil.setAlphaF(veilStrength);
+    painter.fillRect(painter.boundingRect(room, flags, text), veil);
+  }
   painter.drawText(room, flags, text);
 }
 
@@ -117,6 +153,14 @@ void ScreenCanvas::paintFocus(QPainter& painter) {
   painter.drawRoundedRect(frame, outlineWidth, outlineWidth);
   painter.setPen(QPen(palette().color(QPalette::Highlight), outlineWidth));
   painter.drawRoundedRect(frame, outlineWidth, outlineWidth);
+}
+
+void ScreenCanvas::paintMark(QPainter& painter) {
+  if (!mark_) return;
+  const QPointF centre = rectOf({mark_->x, mark_->y, 0, 0}).topLeft();
+  painter.setPen(QPen(colours_.ground, outlineWidth / 2));
+  painter.setBrush(palette().color(QPalette::Highlight));
+  painter.drawEllipse(centre, 2 * outlineWidth, 2 * outlineWidth);
 }
 
 void ScreenCanvas::mousePressEvent(QMouseEvent* event) {

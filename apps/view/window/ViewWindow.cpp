@@ -12,7 +12,6 @@
 
 #include "apps/shared/Complaint.h"
 #include "apps/view/model/ItemWords.h"
-#include "apps/view/model/StepNote.h"
 #include "apps/view/window/Commands.h"
 #include "apps/view/window/KeyList.h"
 #include "apps/view/window/Picture.h"
@@ -45,6 +44,11 @@ std::string newsOf(const ScreenChange& change, const Item& item) {
   return reader::joined({needsName ? item.name : std::string(), state});
 }
 
+std::optional<Point> placeOfNote(const std::optional<StepNote>& note, const Rect& chart) {
+  if (!note) return {};
+  return Point{chart.x + note->place * chart.width, chart.maxY() - note->height * chart.height};
+}
+
 QString screenTitle(const std::string& title) {
   return QString::fromStdString(title.empty() ? reader::readerText("screen.untitled")
                                               : reader::readerText("screen.title", {title}));
@@ -71,7 +75,8 @@ ViewWindow::ViewWindow(app::Presentation& presentation, Voice voice)
   draw();
   const QSize room = screen()->availableSize() * shareOfDesktop;
   const int beside = area_->verticalScrollBar()->sizeHint().width() + 2 * area_->frameWidth();
-  const int beneath = menuBar()->sizeHint().height() + caption_->minimumHeight() + beside;
+  const int beneath =
+      menuBar()->sizeHint().height() + caption_->minimumHeight() + notice_->sizeHint().height() + beside;
   resize((canvas_->size() + QSize(beside, beneath)).boundedTo(room).expandedTo({leastWidth, 0}));
   showFocus();
   // Once the window is there.
@@ -84,7 +89,9 @@ void ViewWindow::layOut() {
   column->setContentsMargins(0, 0, 0, 0);
   column->setSpacing(0);
   area_->setWidget(canvas_);
-  area_->setAlignment(Qt::AlignCenter);
+  // What stays on the screen stays in its place when the screen becomes shorter.
+  area_->setAlignment(Qt::AlignHCenter | Qt::AlignTop);
+  area_->viewport()->installEventFilter(this);
   area_->setFocusPolicy(Qt::NoFocus);
   area_->setSizeAdjustPolicy(QAbstractScrollArea::AdjustToContents);
   column->addWidget(area_, 1);
@@ -123,12 +130,23 @@ void ViewWindow::changeEvent(QEvent* event) {
   if (event->type() == QEvent::PaletteChange) draw();
 }
 
-void ViewWindow::focusOn(ItemId item) {
-  if (!model_.setFocus(item)) return;
-  tour_.leave();
+bool ViewWindow::eventFilter(QObject* object, QEvent* event) {
+  // After the bars have their new ranges.
+  if (event->type() == QEvent::Resize) QTimer::singleShot(0, this, [this] { scrollToFocus(); });
+  return QMainWindow::eventFilter(object, event);
+}
+
+void ViewWindow::moveFocus(ItemId item) {
+  model_.setFocus(item);
   notice_->clearAway();
   showFocus();
   tree_.tellFocus();
+}
+
+void ViewWindow::focusOn(ItemId item) {
+  if (!model_.setFocus(item)) return;
+  tour_.leave();
+  moveFocus(item);
   notify({say(focusedLine())});
 }
 
@@ -137,9 +155,13 @@ std::string ViewWindow::focusedLine() const {
 }
 
 void ViewWindow::showFocus() {
-  const Item* item = focused();
   caption_->show(QString::fromStdString(focusedLine()));
-  canvas_->update();
+  canvas_->setMark({});
+  scrollToFocus();
+}
+
+void ViewWindow::scrollToFocus() {
+  const Item* item = focused();
   if (item != nullptr) {
     const QRect frame = canvas_->rectOf(item->node.frame).toRect();
     area_->ensureVisible(frame.center().x(), frame.center().y(), frame.width() / 2 + roomAround,
@@ -226,23 +248,20 @@ void ViewWindow::stepInChart(int direction) {
   if (model_.chartAround(model_.focus()) == 0) return go(direction, [](const Item&) { return true; });
   const ChartStep* step = tour_.step(model_, model_.focus(), direction);
   if (step == nullptr) return announce(viewText("nothing.more"));
-  const Item* element = model_.find(step->item);
+  const Item *element = model_.find(step->item), *chart = model_.find(tour_.chart());
+  const std::optional<StepNote> note = noteOfStep(model_, *chart, tour_.steps(), tour_.at());
   if (element != nullptr) {
-    model_.setFocus(element->id);
-    notice_->clearAway();
-    showFocus();
-    tree_.tellFocus();
+    moveFocus(element->id);
+  } else {
+    canvas_->setMark(placeOfNote(note, chart->node.frame));
   }
-  const std::string silence = soundStep(element != nullptr ? element->line : step->line);
+  const std::string silence = soundStep(element != nullptr ? element->line : step->line, note);
   notify({element != nullptr ? std::string() : step->line, silence});
 }
 
-std::string ViewWindow::soundStep(const std::string& line) {
+std::string ViewWindow::soundStep(const std::string& line, const std::optional<StepNote>& note) {
   reader::Sound sound;
-  const Item* chart = model_.find(tour_.chart());
-  if (const std::optional<StepNote> note = noteOfStep(model_, *chart, tour_.steps(), tour_.at())) {
-    sound = reader::note(reader::pitchOf(note->height), note->place);
-  }
+  if (note) sound = reader::note(reader::pitchOf(note->height), note->place);
   if (voice_ == Voice::own) {
     if (const auto spoken = reader::spokenSound(line, formatting::currentRegion().locale)) sound.add(*spoken);
   }
@@ -274,6 +293,10 @@ void ViewWindow::zoom(int direction) {
 
 void ViewWindow::showKeys() {
   (new KeyList(this))->open();
+}
+
+void ViewWindow::openMenus() {
+  menuBar()->setActiveAction(menuBar()->actions().front());
 }
 
 void ViewWindow::leave() {

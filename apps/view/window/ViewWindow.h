@@ -6,6 +6,7 @@
 #include "apps/shared/Presentation.h"
 #include "apps/view/model/ChartTour.h"
 #include "apps/view/model/Operating.h"
+#include "apps/view/model/StepNote.h"
 #include "apps/view/window/AccessibleTree.h"
 #include "apps/view/window/Caption.h"
 #include "apps/view/window/Loudspeaker.h"
@@ -36,10 +37,12 @@ class ViewWindow : public QMainWindow {
   void askSlice(int slice);
   void zoom(int direction);
   void showKeys();
+  void openMenus();
   void leave();
 
  protected:
   void changeEvent(QEvent* event) override;
+  bool eventFilter(QObject* object, QEvent* event) override;
 
  private:
   void layOut();
@@ -47,12 +50,14 @@ class ViewWindow : public QMainWindow {
   void listen();
   void draw();
   void focusOn(ItemId item);
+  void moveFocus(ItemId item);
   void showFocus();
+  void scrollToFocus();
   void follow(const Effect& effect);
   // Answer what is to be told of it: once, that no device takes a sound; else nothing.
   std::string say(const std::string& line);
   std::string play(const reader::Sound& sound);
-  std::string soundStep(const std::string& line);
+  std::string soundStep(const std::string& line, const std::optional<StepNote>& note);
   // One notice in place of the last.
   void notify(const std::vector<std::string>& lines);
   void announce(const std::vector<std::string>& lines);
