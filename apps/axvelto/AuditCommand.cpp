@@ -53,7 +53,7 @@ std::vector<std::string> tableFolders() {
   return folders;
 }
 
-// One of every language that the words of the house stand in, English first.
+// One of every language that the words of the project stand in, English first.
 std::vector<std::string> spokenLocales() {
   std::vector<std::string> locales;
   for (const std::string& language : formatting::tableLanguages(tableFolders().front())) {

@@ -12,7 +12,7 @@ constexpr double width = 320;
 void show(View& parent, Ref<Label>& label, const char* key, double y) {
   if (!label) {
     label = make<Label>();
-    label->setText(HostStrings::textForKey(string(key)));
+    label->setText(hostText(key));
   }
   if (label->frame() == Rect()) label->setFrame({0, y, width, 30});
   parent.addSubview(label);

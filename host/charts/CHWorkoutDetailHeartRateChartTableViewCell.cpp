@@ -46,10 +46,10 @@ void CHWorkoutDetailHeartRateChartTableViewCell::layoutSubviews() {
 void CHWorkoutDetailHeartRateChartTableViewCell::_createAndConstraintNoDataOverlay() {
   if (!noDataOverlayView_) {
     const Ref<Label> title = make<Label>();
-    title->setText(HostStrings::textForKey(string("no.heart.rate.title")));
+    title->setText(hostText("no.heart.rate.title"));
     title->setFrame({0, 0, frame().width, 40});
     const Ref<Button> button = make<Button>();
-    button->setTitle(HostStrings::textForKey(string("no.heart.rate.link")));
+    button->setTitle(hostText("no.heart.rate.link"));
     button->setFrame({0, 40, frame().width, 40});
     button->setTargetAction(*this, Selector::intern("overlayButtonTapped:"));
     noDataOverlayView_ = make<View>();

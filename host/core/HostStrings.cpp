@@ -1,6 +1,7 @@
 #include "host/core/HostStrings.h"
 
 #include "platform/foundation/Bundle.h"
+#include "platform/foundation/Formatters.h"
 #include "platform/runtime/ClassBuilder.h"
 
 namespace ax::host {
@@ -28,6 +29,12 @@ Class& HostStrings::staticClass() {
 Ref<String> HostStrings::textForKey(const Ref<String>& key) {
   if (!key) return nullptr;
   return Bundle::bundleForClass(&staticClass())->localizedStringForKey(key->text(), nullptr, "Host");
+}
+
+Ref<String> hostText(std::string_view key, std::initializer_list<Ref<Object>> arguments) {
+  const Ref<String> text = HostStrings::textForKey(string(std::string(key)));
+  if (!text) return emptyString();
+  return arguments.size() == 0 ? text : stringWithFormat(text, arguments);
 }
 
 static const RegisteredClass<HostStrings> registered;

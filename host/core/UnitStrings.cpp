@@ -1,6 +1,5 @@
 #include "host/core/HostStrings.h"
 #include "platform/foundation/AttributedString.h"
-#include "platform/foundation/Formatters.h"
 #include "platform/runtime/ClassBuilder.h"
 
 // What the app adds to the platform's String: figures with a small unit behind them.
@@ -9,8 +8,7 @@ namespace ax::host {
 namespace {
 
 Ref<AttributedString> attrStringWithValueUnit(Ref<Object> value, Ref<String> unit) {
-  return make<AttributedString>(
-      stringWithFormat(HostStrings::textForKey(string("value.with.unit")), {value, unit}));
+  return make<AttributedString>(hostText("value.with.unit", {value, unit}));
 }
 
 struct HostExtensions {

@@ -53,10 +53,9 @@ void ChartDetailCell::layoutSubviews() {
 void ChartDetailCell::showFigure(double amount, double goal, std::string_view unitKey, double percent) {
   percent_ = percent;
   if (!value_) value_ = make<Label>();
-  const Ref<String> unit = HostStrings::textForKey(string(std::string(unitKey)));
   value_->setText(string(formatFloat(FloatFormat::whole, static_cast<float>(amount))->text() + "/" +
-                         formatFloat(FloatFormat::whole, static_cast<float>(goal))->text() +
-                         (unit ? " " + unit->text() : "")));
+                         formatFloat(FloatFormat::whole, static_cast<float>(goal))->text() + " " +
+                         hostText(unitKey)->text()));
 }
 
 Class& MoveChartDetailCell::staticClass() {

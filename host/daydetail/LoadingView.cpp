@@ -16,7 +16,7 @@ Class& LoadingView::staticClass() {
 void LoadingView::layoutSubviews() {
   if (!label_) {
     label_ = make<Label>();
-    label_->setText(HostStrings::textForKey(string("loading")));
+    label_->setText(hostText("loading"));
     label_->setFrame({0, frame().height / 2, frame().width, 20});
   }
   addUnplaced(*this, {label_});

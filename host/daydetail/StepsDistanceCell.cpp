@@ -19,7 +19,7 @@ Ref<Label> labelAt(const View& cell, int column, double y) {
 void makePair(const View& cell, Ref<Label>& title, Ref<Label>& value, const char* key, int column) {
   if (!title) {
     title = labelAt(cell, column, 8);
-    title->setText(HostStrings::textForKey(string(key)));
+    title->setText(hostText(key));
   }
   if (!value) value = labelAt(cell, column, 30);
 }

@@ -17,8 +17,7 @@ Class& ASCompetitionScoreView::staticClass() {
 }
 
 Ref<String> ASCompetitionScoreView::defaultLabel() {
-  return stringWithFormat(HostStrings::textForKey(string("friends.score")),
-                          {formatInteger(myScore_), formatInteger(friendScore_)});
+  return hostText("friends.score", {formatInteger(myScore_), formatInteger(friendScore_)});
 }
 
 Class& CHFriendListCompetitionTableViewCell::staticClass() {

@@ -17,7 +17,7 @@ Class& CHFriendListViewController::staticClass() {
 void CHFriendListViewController::viewDidLoad() {
   if (!sortBarButtonItem_) {
     sortBarButtonItem_ = make<BarButtonItem>();
-    sortBarButtonItem_->setTitle(HostStrings::textForKey(string("friends.sort.by.name")));
+    sortBarButtonItem_->setTitle(hostText("friends.sort.by.name"));
   }
   if (!navigationItem()->rightBarButtonItems()) navigationItem()->setRightBarButtonItem(sortBarButtonItem_);
 }

@@ -7,7 +7,7 @@ namespace ax::host {
 void addMessageButton(ViewController& controller) {
   if (controller.navigationItem()->rightBarButtonItems()) return;
   const Ref<BarButtonItem> button = make<BarButtonItem>();
-  button->setTitle(HostStrings::textForKey(string("friends.messages.short")));
+  button->setTitle(hostText("friends.messages.short"));
   button->setTarget(Ref<Object>(&controller));
   button->setAction(selectorFromString("_sendMessageButtonTapped:"));
   controller.navigationItem()->setRightBarButtonItem(button);

@@ -140,12 +140,6 @@ Ref<String> distanceInWords(const Ref<Quantity>& distance) {
   return hostText("value.with.unit", {number, distance->unit()});
 }
 
-Ref<String> hostText(std::string_view key, std::initializer_list<Ref<Object>> arguments) {
-  const Ref<String> text = HostStrings::textForKey(string(std::string(key)));
-  if (!text) return emptyString();
-  return arguments.size() == 0 ? text : stringWithFormat(text, arguments);
-}
-
 Ref<String> titleOf(const Workout& workout) {
   return hostText("workout." + std::string(nameOfWorkoutActivityType(workout.workoutActivityType())));
 }

@@ -2,6 +2,7 @@
 
 #include <span>
 
+#include "host/core/HostStrings.h"
 #include "platform/foundation/AttributedString.h"
 #include "platform/health/Workout.h"
 
@@ -29,9 +30,6 @@ Ref<String> textWithSpokenForm(std::string text, const Ref<String>& spoken);
 
 // A distance in full words: "1.61 kilometers".
 Ref<String> distanceInWords(const Ref<Quantity>& distance);
-
-// The app's text of a key, its pattern filled; empty for a key that it lacks.
-Ref<String> hostText(std::string_view key, std::initializer_list<Ref<Object>> arguments = {});
 
 // "Running".
 Ref<String> titleOf(const Workout& workout);

@@ -11,7 +11,7 @@
 namespace ax::tour {
 
 std::filesystem::path samplesFolder();
-// The sample scenes of the house, sorted by name.
+// The sample scenes, sorted by name.
 std::vector<std::filesystem::path> sampleScenes();
 std::string fileText(const std::filesystem::path& file);
 // The module as the build lays it out beside the tests.
