@@ -16,7 +16,9 @@ bool isWholeUnit(const Ref<Quantity>& distance) {
       ->isEqual(*formatInteger(1));
 }
 
+// Who rests in a pool swims no length then, and counts none.
 Ref<String> nameOf(const CHWorkoutSplit& split) {
+  if (split.isRest() && split.isLength()) return hostText("split.rest.between.lengths");
   const Ref<String> name =
       hostText(split.isLength() ? "split.length" : "split.number", {formatInteger(split.index())});
   if (split.isRest()) return hostText("split.rest", {name});

@@ -117,8 +117,10 @@ std::vector<Json> splitsOf(const WorkoutActivity& activity, const DistanceUnit& 
   std::vector<Json> splits;
   if (activity.metres <= 0) return splits;
   if (activity.poolMetres > 0) {
+    std::size_t swum = 0;
     for (const PoolLength& length : activity.lengths) {
-      splits.push_back(lengthRow(length, splits.size() + 1, activity, unit));
+      if (!length.isRest) ++swum;
+      splits.push_back(lengthRow(length, swum, activity, unit));
     }
   }
   if (splits.empty()) {
