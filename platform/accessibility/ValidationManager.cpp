@@ -195,13 +195,28 @@ bool ValidationManager::installCategory(std::string_view name) {
   return true;
 }
 
+namespace {
+
+// Where the host answers nothing beneath the categories, the method is that of the one that added it.
+std::string keeperOf(const Method& answering) {
+  const Method* method = &answering;
+  std::string added;
+  while (method->graft != nullptr) {
+    added = method->graft->category->name();
+    method = &superMethod(*method, method->selector);
+  }
+  return method->function != nullptr ? "the host" : added;
+}
+
+}  // namespace
+
 void ValidationManager::recordLeftToHost(const CategoryGraft& graft) {
   for (const LeftToHost& left : graft.leftToHost) {
-    checks_.push_back({left.isClassMethod ? CheckKind::overriddenClassMethod : CheckKind::overriddenMethod,
-                       graft.category->name(), graft.target->name(),
-                       std::string(left.override->selector.name()),
-                       joined(left.override->signature->encodings),
-                       joined(left.hostMethod->signature->encodings) + ", left to the host", false});
+    checks_.push_back(
+        {left.isClassMethod ? CheckKind::overriddenClassMethod : CheckKind::overriddenMethod,
+         graft.category->name(), graft.target->name(), std::string(left.override->selector.name()),
+         joined(left.override->signature->encodings),
+         joined(left.hostMethod->signature->encodings) + ", left to " + keeperOf(*left.hostMethod), false});
   }
 }
 

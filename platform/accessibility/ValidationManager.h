@@ -48,8 +48,8 @@ struct InstallationRequest {
 // Checks host contracts and installs safe categories. There is one for the process; it is used on the thread
 // that runs start-up and may be read once that is over. A check that fails is recorded and never stops
 // anything; a category whose checks failed is installed all the same, and says less. An override that the
-// host answers with another type is left to the host and recorded as a failed check, whether checks run or
-// not.
+// host answers with another type is left to the host, or to the category that added such a method, and
+// recorded as a failed check, whether checks run or not.
 class ValidationManager final : public Object {
  public:
   using BoolHandler = std::function<bool(ValidationManager&)>;

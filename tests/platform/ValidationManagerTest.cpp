@@ -209,6 +209,22 @@ TEST(ValidationManager, tellsWhatIsLeftToTheHost) {
   EXPECT_EQ(left.found, "B d, left to the host");
 }
 
+// Nobody but another category answers the selector.
+TEST(ValidationManager, tellsWhatIsLeftToAnotherCategory) {
+  static constexpr auto answer = [](Object&, const Method&, double seconds) { return seconds > 1; };
+  Class& target = Class::add("ValidationTestBare", &Object::staticClass(), nullptr);
+  addCategory({"ValidationTestAdding", target.name()})
+      .addMethod(registration::record<bool, double>(reply.selector(), answer));
+  registerNumbered<6>("ValidationTestSix", "ValidationTestBare");
+  const Ref<ValidationManager> manager = make<ValidationManager>();
+  manager->installSafeCategoryCanInteractWithTargetClass("ValidationTestAdding", true);
+  manager->installSafeCategoryCanInteractWithTargetClass("ValidationTestSix", true);
+  const ContractCheck left = manager->failedChecks().back();
+  EXPECT_EQ(left.category, "ValidationTestSix");
+  EXPECT_EQ(left.expected, "@");
+  EXPECT_EQ(left.found, "B d, left to ValidationTestAdding");
+}
+
 TEST(ValidationManager, installsWithoutChecksWhenTheyAreOff) {
   registerNumbered<4>("ValidationTestFour", subScreen);
   const Ref<ValidationManager> owned = make<ValidationManager>();
