@@ -31,8 +31,20 @@ bool isHidden(const fs::path& path) {
   return path.filename().string().starts_with('.');
 }
 
-// Every file below a folder that is not hidden, in the order of their names.
+reader::Fault unreadable(const std::string& folder) {
+  return {folder, "", "the folder may not be read", "permission to read it"};
+}
+
+bool mayBeListed(const fs::path& folder) {
+  std::error_code error;
+  const fs::directory_iterator first(folder, error);
+  return !error;
+}
+
+// Every file below a folder that is not hidden, in the order of their names, and the folders that may not be
+// read.
 std::vector<std::string> filesBelow(const std::string& folder) {
+  if (!mayBeListed(folder)) return {folder};
   std::vector<std::string> files;
   std::error_code error;
   fs::recursive_directory_iterator at(folder, fs::directory_options::skip_permission_denied, error);
@@ -40,11 +52,11 @@ std::vector<std::string> filesBelow(const std::string& folder) {
     const bool isBelow = at->is_directory(error);
     if (isHidden(at->path())) {
       if (isBelow) at.disable_recursion_pending();
-    } else if (!isBelow) {
+    } else if (!isBelow || !mayBeListed(at->path())) {
       files.push_back(at->path().string());
     }
   }
-  if (error) throw reader::Fault{folder, "", "the folder may not be read", "permission to read it"};
+  if (error) throw unreadable(folder);
   std::ranges::sort(files);
   return files;
 }
@@ -56,6 +68,7 @@ bool addAll(const std::vector<std::string>& files, const Arguments& arguments, W
   for (std::size_t i = 0; i < files.size(); ++i) {
     if (files.size() > 1) progress.show(i, files.size());
     try {
+      if (isFolder(files[i])) throw unreadable(files[i]);
       const auto add = [&](const std::string& name, std::string_view bytes) { workouts.add(name, bytes); };
       isWhole = forEachUnpacked(files[i], arguments, add) && isWhole;
     } catch (const reader::Fault& fault) {

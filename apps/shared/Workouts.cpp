@@ -63,6 +63,7 @@ void Workouts::add(const std::string& name, std::string_view bytes) {
   if (file.damage)
     complain(Fault{name, file.damage->place, file.damage->what + ", read as far as it goes",
                    file.damage->expected});
+  ++files_;
   for (WorkoutActivity& activity : file.activities) {
     if (!isKnown(name, activity)) keep(name, std::move(activity));
   }
@@ -72,12 +73,12 @@ void Workouts::keep(const std::string& file, WorkoutActivity activity) {
   const std::size_t number = kept_.size() + 1;
   if (opening_.workout != 0 ? number != opening_.workout : number > 1) reader::keepForList(activity);
   if (number == 2 && opening_.workout != 1) reader::keepForList(kept_.front().activity);
-  kept_.push_back({file, std::move(activity)});
+  kept_.push_back({file, files_, std::move(activity)});
 }
 
 bool Workouts::isKnown(const std::string& file, const WorkoutActivity& activity) {
   const auto same = std::ranges::find_if(
-      kept_, [&](const Kept& each) { return each.file != file && areSame(each.activity, activity); });
+      kept_, [&](const Kept& each) { return each.number != files_ && areSame(each.activity, activity); });
   if (same == kept_.end()) return false;
   complain(file + ": the same workout as in " + same->file + ", counted once");
   if (toldBy(activity) > toldBy(same->activity)) {

@@ -28,12 +28,14 @@ class Workouts {
  private:
   struct Kept {
     std::string file;
+    std::size_t number;  // of the file: two may have one name, and workouts of one file are never the same
     reader::WorkoutActivity activity;
   };
   void keep(const std::string& file, reader::WorkoutActivity activity);
   bool isKnown(const std::string& file, const reader::WorkoutActivity& activity);
 
   const Opening& opening_;
+  std::size_t files_ = 0;
   std::vector<Kept> kept_;
 };
 

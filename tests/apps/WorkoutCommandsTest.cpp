@@ -76,6 +76,25 @@ TEST_F(WorkoutCommands, ImportAFolderAndGoOnBehindWhatCannotBeRead) {
                            "/2026/run.tcx, counted once\n");
   EXPECT_NE(run("speak -", whole.out).out.find("Workouts, Total, 2"), std::string::npos);
 
+  const std::string ridden = top + "/ride.gpx";
+  const Outcome twice = run("import " + ridden + " " + ridden);
+  EXPECT_EQ(twice.out, run("import " + ridden).out) << "one file named twice";
+  EXPECT_EQ(twice.err, "axvelto: " + ridden + ": the same workout as in " + ridden + ", counted once\n");
+
+  if (geteuid() != 0) {
+    const std::string locked = top + "/locked";
+    std::filesystem::create_directory(locked);
+    std::filesystem::permissions(locked, std::filesystem::perms::none);
+    const Outcome others = run("import " + top);
+    const std::string message =
+        "axvelto: " + locked + ": the folder may not be read, expected permission to read it\n";
+    EXPECT_EQ(others.code, 1);
+    EXPECT_NE(others.err.find(message), std::string::npos) << others.err;
+    EXPECT_EQ(others.out, whole.out);
+    EXPECT_EQ(run("import " + locked).err, message);
+    std::filesystem::remove(locked);
+  }
+
   const std::string note = file("folder-of-workouts/note.txt", "Dear diary");
   const Outcome some = run("import " + top);
   EXPECT_EQ(some.code, 1);
