@@ -12,6 +12,11 @@
 #include "tests/proof/Proofs.h"
 #include "tests/tour/Samples.h"
 
+#ifdef __SANITIZE_ADDRESS__
+// The address sanitizer has an allocator of its own; g++ has no header for it.
+extern "C" std::size_t __sanitizer_get_current_allocated_bytes();
+#endif
+
 namespace ax::proof {
 
 namespace {
@@ -79,7 +84,11 @@ bool proveScreens(const std::string& module) {
 }
 
 std::size_t bytesInUse() {
+#ifdef __SANITIZE_ADDRESS__
+  return __sanitizer_get_current_allocated_bytes();
+#else
   return mallinfo2().uordblks;
+#endif
 }
 
 // A list of cells, each with its parts: made, laid out, loaded, read, and dropped.
