@@ -53,7 +53,7 @@ bool isHook(const Method& method) {
 }
 
 Ref<Object> argument(std::string_view code, std::size_t round, Object& receiver) {
-  if (code == "@") return round == 0 ? nullptr : Ref<Object>(&receiver);
+  if (code == "@") return round == 0 ? Ref<Object>(&receiver) : nullptr;  // nil last: what keeps itself leaks
   if (code == "B") return number(round == 0);
   if (code == "d" || code == "f") return number(0.5 * static_cast<double>(round));
   if (code == encodingOf<Point>()) return box(Point{20, 20});
