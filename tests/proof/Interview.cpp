@@ -52,8 +52,8 @@ bool isHook(const Method& method) {
   return method.signature->encodings[0] == "v" || name == "accessibilityActivate";
 }
 
-Ref<Object> argument(std::string_view code, std::size_t round, Object& receiver) {
-  if (code == "@") return round == 0 ? Ref<Object>(&receiver) : nullptr;  // nil last: what keeps itself leaks
+Ref<Object> argument(std::string_view code, std::size_t round, bool last, Object& receiver) {
+  if (code == "@") return last ? nullptr : Ref<Object>(&receiver);  // nil last: what keeps itself leaks
   if (code == "B") return number(round == 0);
   if (code == "d" || code == "f") return number(0.5 * static_cast<double>(round));
   if (code == encodingOf<Point>()) return box(Point{20, 20});
@@ -81,16 +81,17 @@ class Asking {
       if (method.signature != override->signature || isHook(method) != hooks) continue;
       const std::size_t rounds = method.signature->encodings.size() > 1 ? most : 1;
       for (std::size_t round = 0; round < rounds; ++round) {
-        text.append(method.selector.name()).append(": ").append(ask(method, round)).append("\n");
+        const std::string answer = ask(method, round, round + 1 == rounds);
+        text.append(method.selector.name()).append(": ").append(answer).append("\n");
       }
     }
   }
 
  private:
-  std::string ask(const Method& method, std::size_t round) {
+  std::string ask(const Method& method, std::size_t round, bool last) {
     std::vector<Ref<Object>> arguments;
     for (std::size_t i = 1; i < method.signature->encodings.size(); ++i)
-      arguments.push_back(argument(method.signature->encodings[i], round, object_));
+      arguments.push_back(argument(method.signature->encodings[i], round, last, object_));
     ++into_.questions;
     try {
       return described(method.signature->invoke(object_, method, arguments));
