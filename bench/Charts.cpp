@@ -6,7 +6,7 @@
 #include "host/charts/ActivityStandChartView.h"
 #include "host/charts/TrendDetailChartView.h"
 #include "platform/formatting/Region.h"
-#include "platform/foundation/Value.h"
+#include "platform/runtime/Value.h"
 #include "platform/toolkit/DataSeriesMessages.h"
 
 // A chart told that its points have changed, then asked for its elements.

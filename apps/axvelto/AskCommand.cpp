@@ -2,7 +2,7 @@
 #include "apps/axvelto/Expectations.h"
 #include "apps/axvelto/NodeActions.h"
 #include "apps/axvelto/Output.h"
-#include "apps/shared/Presentation.h"
+#include "apps/shared/ShownScene.h"
 
 namespace ax::app {
 
@@ -25,12 +25,12 @@ void declare(CLI::App& app, Arguments& arguments) {
 }
 
 ExitCode run(const Arguments& arguments) {
-  Presentation presentation(arguments);
-  if (isNodeAction(arguments)) return runNodeAction(presentation, arguments);
-  const Outcome outcome = runScene(presentation);
-  if (arguments.accepts) return accept(presentation.scene(), outcome);
+  ShownScene shown(arguments);
+  if (isNodeAction(arguments)) return runNodeAction(shown, arguments);
+  const Outcome outcome = runScene(shown);
+  if (arguments.accepts) return accept(shown.scene(), outcome);
   print(outcome.document);
-  return holds(presentation.scene(), outcome) ? exitDone : exitFallsShort;
+  return holds(shown.scene(), outcome) ? exitDone : exitFallsShort;
 }
 
 }  // namespace

@@ -6,7 +6,7 @@
 #include "apps/axvelto/Output.h"
 #include "apps/axvelto/Progress.h"
 #include "apps/shared/Input.h"
-#include "apps/shared/Presentation.h"
+#include "apps/shared/ShownScene.h"
 #include "platform/formatting/Region.h"
 #include "platform/formatting/StringTable.h"
 #include "reader/audit/AuditReport.h"
@@ -65,14 +65,14 @@ std::vector<std::string> spokenLocales() {
 }
 
 AuditScreen screenOf(const Arguments& one) {
-  Presentation presentation(one);
-  reader::Snapshot snapshot = presentation.snapshot();
-  const auto names = [&](const Object& object) { return presentation.run().idOf(object); };
-  reader::ShownContent shown = reader::readShownContent(snapshot, presentation.run().screen(), names);
+  ShownScene scene(one);
+  reader::Snapshot snapshot = scene.snapshot();
+  const auto names = [&](const Object& object) { return scene.run().idOf(object); };
+  reader::ShownContent shown = reader::readShownContent(snapshot, scene.run().screen(), names);
   AuditScreen screen =
       reader::readAuditScreen(std::move(snapshot), std::move(shown), reader::LanguageWords(tableFolders()));
   screen.file = one.files.front();
-  screen.names = {presentation.scene().names.begin(), presentation.scene().names.end()};
+  screen.names = {scene.scene().names.begin(), scene.scene().names.end()};
   return screen;
 }
 

@@ -3,7 +3,7 @@
 #include "apps/axvelto/Command.h"
 #include "apps/axvelto/Output.h"
 #include "apps/shared/Input.h"
-#include "apps/shared/Presentation.h"
+#include "apps/shared/ShownScene.h"
 #include "reader/contract/ContractReport.h"
 
 namespace ax::app {

@@ -82,15 +82,15 @@ void write(const std::string& file, const std::string& text) {
 
 }  // namespace
 
-Outcome runScene(Presentation& presentation) {
-  const Scene& scene = presentation.scene();
+Outcome runScene(ShownScene& shown) {
+  const Scene& scene = shown.scene();
   Outcome outcome;
   for (const ScreenReading& reading : screenReadings) {
-    if (!isWanted(scene, reading) || !presentation.run().screen()) continue;
-    outcome.whole[reading.key] = reading.read(presentation.snapshot(), presentation.run().title());
+    if (!isWanted(scene, reading) || !shown.run().screen()) continue;
+    outcome.whole[reading.key] = reading.read(shown.snapshot(), shown.run().title());
   }
-  outcome.document = presentation.run().runSteps();
-  outcome.replies = presentation.run().replies();
+  outcome.document = shown.run().runSteps();
+  outcome.replies = shown.run().replies();
   for (const char* key : reportKeys) outcome.whole[key] = outcome.document[key];
   return outcome;
 }

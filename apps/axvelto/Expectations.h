@@ -5,7 +5,7 @@
 #include <vector>
 
 #include "apps/axvelto/Command.h"
-#include "apps/shared/Presentation.h"
+#include "apps/shared/ShownScene.h"
 
 namespace ax::app {
 
@@ -17,7 +17,7 @@ struct Outcome {
 };
 
 // Reads what the screen says when it is presented, as far as the scene expects it, and then runs the steps.
-Outcome runScene(Presentation& presentation);
+Outcome runScene(ShownScene& shown);
 
 // Whether everything is as the scene expects. What differs goes to standard error, a line each: its pointer,
 // what was expected and what was found.

@@ -37,8 +37,8 @@ void printJson(const SceneCharts::Found& charts) {
 }
 
 ExitCode run(const Arguments& arguments) {
-  Presentation presentation(arguments);
-  const SceneCharts charts(presentation, arguments.chart);
+  ShownScene shown(arguments);
+  const SceneCharts charts(shown, arguments.chart);
   (arguments.asJson ? printJson : printCharts)(charts.found());
   return charts.found().empty() && !arguments.chart.empty() ? exitFallsShort : exitDone;
 }

@@ -51,9 +51,9 @@ struct Change {
   }
 };
 
-void printOutcome(Presentation& presentation, const Snapshot& before, const Ref<Object>& acted) {
-  const std::string& title = presentation.run().title();
-  const Snapshot after = presentation.snapshot();
+void printOutcome(ShownScene& shown, const Snapshot& before, const Ref<Object>& acted) {
+  const std::string& title = shown.run().title();
+  const Snapshot after = shown.snapshot();
   const Change change{transcript(before, title), transcript(after, title)};
   const Node* node = after.nodeOf(*acted);
   const std::string line = node == nullptr ? readerText("element.gone") : spokenLine(*node);
@@ -85,9 +85,9 @@ ExitCode fail(ActionResult result, const WantedAction& wanted, const Node& node,
   return exitFallsShort;
 }
 
-ExitCode act(Presentation& presentation, const WantedAction& wanted) {
-  const std::string& file = presentation.scene().file;
-  const Snapshot before = presentation.snapshot();
+ExitCode act(ShownScene& shown, const WantedAction& wanted) {
+  const std::string& file = shown.scene().file;
+  const Snapshot before = shown.snapshot();
   const Node* node = findNode(before, wanted.target);
   if (node == nullptr) {
     throw Fault{file, "the screen", "no element \"" + wanted.target + "\"", "a label or an id"};
@@ -96,15 +96,15 @@ ExitCode act(Presentation& presentation, const WantedAction& wanted) {
   forgetReports();
   const ActionResult result = before.perform(wanted.action, node->id);
   if (result != ActionResult::done) return fail(result, wanted, *node, file);
-  printOutcome(presentation, before, acted);
+  printOutcome(shown, before, acted);
   return exitDone;
 }
 
-ExitCode speakAt(Presentation& presentation, Point point) {
-  const Snapshot snapshot = presentation.snapshot();
+ExitCode speakAt(ShownScene& shown, Point point) {
+  const Snapshot snapshot = shown.snapshot();
   HostQuestions questions;
   const Node* node = snapshot.hitTest(point, questions);
-  presentation.tellOf(questions.raised());
+  shown.tellOf(questions.raised());
   printText(node == nullptr ? readerText("screen.empty") : spokenLine(*node));
   return node == nullptr ? exitFallsShort : exitDone;
 }
@@ -115,9 +115,9 @@ bool isNodeAction(const Arguments& arguments) {
   return !arguments.point.empty() || wantedAction(arguments);
 }
 
-ExitCode runNodeAction(Presentation& presentation, const Arguments& arguments) {
-  if (const std::optional<WantedAction> wanted = wantedAction(arguments)) return act(presentation, *wanted);
-  return speakAt(presentation, {arguments.point[0], arguments.point[1]});
+ExitCode runNodeAction(ShownScene& shown, const Arguments& arguments) {
+  if (const std::optional<WantedAction> wanted = wantedAction(arguments)) return act(shown, *wanted);
+  return speakAt(shown, {arguments.point[0], arguments.point[1]});
 }
 
 }  // namespace ax::app

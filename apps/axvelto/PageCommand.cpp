@@ -3,7 +3,7 @@
 
 #include "apps/axvelto/Command.h"
 #include "apps/axvelto/Progress.h"
-#include "apps/shared/Presentation.h"
+#include "apps/shared/ShownScene.h"
 #include "reader/page/Page.h"
 #include "reader/picture/ScreenPicture.h"
 #include "reader/text/Fault.h"
@@ -33,9 +33,9 @@ void write(const std::string& text, const std::string& file) {
 
 ExitCode drawPicture(const Arguments& arguments) {
   if (arguments.files.size() != 1) throw reader::Fault{"FILE", "", "several screens", "one for a picture"};
-  Presentation presentation(arguments);
-  const reader::Snapshot snapshot = presentation.snapshot();
-  write(reader::screenPicture(snapshot, reader::ReadingOrder(snapshot), presentation.run().title()),
+  ShownScene shown(arguments);
+  const reader::Snapshot snapshot = shown.snapshot();
+  write(reader::screenPicture(snapshot, reader::ReadingOrder(snapshot), shown.run().title()),
         arguments.output);
   return exitDone;
 }
@@ -48,8 +48,8 @@ ExitCode run(const Arguments& arguments) {
     progress.show(i + 1, arguments.files.size());
     Arguments one = arguments;
     one.files = {arguments.files[i]};
-    Presentation presentation(one);
-    page.add(presentation.snapshot(), presentation.run().title());
+    ShownScene shown(one);
+    page.add(shown.snapshot(), shown.run().title());
   }
   write(page.html(), arguments.output);
   return exitDone;

@@ -4,18 +4,17 @@
 
 namespace ax::app {
 
-SceneCharts::SceneCharts(Presentation& presentation, const std::string& id) {
+SceneCharts::SceneCharts(ShownScene& shown, const std::string& id) {
   if (!id.empty()) {
-    const Ref<Object> object = presentation.run().objectWithId(id);
+    const Ref<Object> object = shown.run().objectWithId(id);
     if (!object) {
-      throw reader::Fault{presentation.scene().file, "--of", "no object \"" + id + "\"",
-                          "an id of the scene"};
+      throw reader::Fault{shown.scene().file, "--of", "no object \"" + id + "\"", "an id of the scene"};
     }
-    add(presentation.snapshotOf(object));
+    add(shown.snapshotOf(object));
     return;
   }
-  if (presentation.run().screen()) add(presentation.snapshot());
-  for (const Ref<Object>& object : presentation.run().objects()) add(presentation.snapshotOf(object));
+  if (shown.run().screen()) add(shown.snapshot());
+  for (const Ref<Object>& object : shown.run().objects()) add(shown.snapshotOf(object));
 }
 
 void SceneCharts::add(reader::Snapshot snapshot) {

@@ -5,7 +5,7 @@
 #include <utility>
 #include <vector>
 
-#include "apps/shared/Presentation.h"
+#include "apps/shared/ShownScene.h"
 
 namespace ax::app {
 
@@ -16,7 +16,7 @@ class SceneCharts {
 
   // All of the scene: on the screen, and in what is made beside it; or only those in the object with an id.
   // Throws a Fault for an id that the scene does not have.
-  SceneCharts(Presentation& presentation, const std::string& id);
+  SceneCharts(ShownScene& shown, const std::string& id);
 
   const Found& found() const { return found_; }
 

@@ -23,9 +23,9 @@ void declare(CLI::App& app, Arguments& arguments) {
 
 ExitCode run(const Arguments& arguments) {
   SoundOutput output(arguments.output);
-  Presentation presentation(arguments);
-  const SceneCharts charts(presentation, arguments.chart);
-  const std::string& file = presentation.scene().file;
+  ShownScene shown(arguments);
+  const SceneCharts charts(shown, arguments.chart);
+  const std::string& file = shown.scene().file;
   if (charts.found().empty()) {
     complain(file + ": no chart, so there is nothing to hear");
     return exitFallsShort;

@@ -4,7 +4,7 @@
 #include "apps/axvelto/Output.h"
 #include "apps/axvelto/Progress.h"
 #include "apps/axvelto/SoundOutput.h"
-#include "apps/shared/Presentation.h"
+#include "apps/shared/ShownScene.h"
 #include "reader/sound/ScreenSound.h"
 #include "reader/transcript/Transcript.h"
 
@@ -20,11 +20,11 @@ void declare(CLI::App& app, Arguments& arguments) {
   declareWithout(app, arguments);
 }
 
-ExitCode speakInto(SoundOutput& output, Presentation& presentation) {
-  const reader::Snapshot snapshot = presentation.snapshot();
-  tellOfMissingVoice(presentation.scene().file);
+ExitCode speakInto(SoundOutput& output, ShownScene& shown) {
+  const reader::Snapshot snapshot = shown.snapshot();
+  tellOfMissingVoice(shown.scene().file);
   const Progress progress("Line");
-  reader::soundScreen(snapshot, presentation.run().title(),
+  reader::soundScreen(snapshot, shown.run().title(),
                       [&](const reader::Sound& sound, std::size_t before, std::size_t all) {
                         progress.show(before + 1, all);
                         output.add(sound);
@@ -36,9 +36,9 @@ ExitCode speakInto(SoundOutput& output, Presentation& presentation) {
 ExitCode run(const Arguments& arguments) {
   std::optional<SoundOutput> output;
   if (!arguments.output.empty()) output.emplace(arguments.output);
-  Presentation presentation(arguments);
-  if (output) return speakInto(*output, presentation);
-  print(reader::transcript(presentation.snapshot(), presentation.run().title()));
+  ShownScene shown(arguments);
+  if (output) return speakInto(*output, shown);
+  print(reader::transcript(shown.snapshot(), shown.run().title()));
   return exitDone;
 }
 

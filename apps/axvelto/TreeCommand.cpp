@@ -1,6 +1,6 @@
 #include "apps/axvelto/Command.h"
 #include "apps/axvelto/Output.h"
-#include "apps/shared/Presentation.h"
+#include "apps/shared/ShownScene.h"
 #include "reader/transcript/TreeJson.h"
 
 namespace ax::app {
@@ -15,9 +15,9 @@ void declare(CLI::App& app, Arguments& arguments) {
 }
 
 ExitCode run(const Arguments& arguments) {
-  Presentation presentation(arguments);
-  print(nlohmann::ordered_json{{"title", presentation.run().title()},
-                               {"elements", reader::treeAsJson(presentation.snapshot())}});
+  ShownScene shown(arguments);
+  print(nlohmann::ordered_json{{"title", shown.run().title()},
+                               {"elements", reader::treeAsJson(shown.snapshot())}});
   return exitDone;
 }
 

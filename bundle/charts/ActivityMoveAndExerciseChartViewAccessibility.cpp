@@ -3,7 +3,7 @@
 #include "bundle/charts/DataSeriesChart.h"
 #include "bundle/charts/DaySpans.h"
 #include "bundle/shared/LocalizedString.h"
-#include "platform/foundation/Value.h"
+#include "platform/runtime/Value.h"
 #include "platform/toolkit/View.h"
 
 namespace ax {

@@ -1,8 +1,8 @@
 #include "bundle/charts/GraphData.h"
 
 #include "bundle/shared/LocalizedString.h"
-#include "platform/foundation/Number.h"
 #include "platform/runtime/Boxing.h"
+#include "platform/runtime/Number.h"
 
 namespace ax {
 

@@ -1,6 +1,6 @@
 #include "bundle/core/Category.h"
 #include "platform/foundation/AttributedString.h"
-#include "platform/foundation/Number.h"
+#include "platform/runtime/Number.h"
 
 namespace ax {
 

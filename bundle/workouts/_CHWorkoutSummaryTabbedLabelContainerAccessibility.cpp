@@ -2,7 +2,7 @@
 #include "bundle/shared/LocalizedString.h"
 #include "bundle/workouts/SummaryLabelAttribute.h"
 #include "platform/foundation/AttributedString.h"
-#include "platform/foundation/Number.h"
+#include "platform/runtime/Number.h"
 
 namespace ax {
 

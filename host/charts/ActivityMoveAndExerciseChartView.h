@@ -1,7 +1,7 @@
 #pragma once
 
 #include "platform/foundation/Array.h"
-#include "platform/foundation/Number.h"
+#include "platform/runtime/Number.h"
 #include "platform/toolkit/View.h"
 
 namespace ax::host {

@@ -1,8 +1,8 @@
 #pragma once
 
 #include "platform/foundation/Array.h"
-#include "platform/foundation/Number.h"
 #include "platform/health/Quantity.h"
+#include "platform/runtime/Number.h"
 #include "platform/toolkit/Label.h"
 
 namespace ax::host {

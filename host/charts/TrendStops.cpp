@@ -1,6 +1,6 @@
 #include "host/charts/TrendStops.h"
 
-#include "platform/foundation/Number.h"
+#include "platform/runtime/Number.h"
 
 namespace ax::host {
 

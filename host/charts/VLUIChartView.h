@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/foundation/Number.h"
+#include "platform/runtime/Number.h"
 #include "platform/toolkit/View.h"
 
 namespace ax::host {

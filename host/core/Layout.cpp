@@ -37,6 +37,10 @@ void stackIn(View& parent, std::initializer_list<Ref<View>> parts) {
   stackIn(parent, {parent.frame().width, parent.frame().height}, parts);
 }
 
+void stackIn(TableViewCell& cell, std::initializer_list<Ref<View>> parts) {
+  stackIn(*cell.contentView(), {cell.frame().width, cell.frame().height}, parts);
+}
+
 Rect inDirection(const View& view, Rect frame) {
   const bool turns = view.changesSides() && formatting::currentLanguageIsRightToLeft();
   if (turns) frame.x = view.frame().width - frame.maxX();

@@ -2,7 +2,7 @@
 
 #include <initializer_list>
 
-#include "platform/toolkit/View.h"
+#include "platform/toolkit/TableViewCell.h"
 
 namespace ax::host {
 
@@ -21,6 +21,15 @@ void showIn(View& parent, const Ref<View>& part, Rect frame);
 void stackIn(View& parent, Size size, std::initializer_list<Ref<View>> parts);
 // In shares of the parent's own size.
 void stackIn(View& parent, std::initializer_list<Ref<View>> parts);
+// In a cell's content, in shares of the cell.
+void stackIn(TableViewCell& cell, std::initializer_list<Ref<View>> parts);
+
+// The part, made when there is none yet.
+template <class T>
+T& ensure(Ref<T>& part) {
+  if (!part) part = make<T>();
+  return *part;
+}
 
 // A frame in a view as the language has it: it is meant for one that is written from the left, and is turned
 // around for one that is written from the right.

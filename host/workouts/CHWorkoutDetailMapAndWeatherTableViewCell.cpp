@@ -1,6 +1,6 @@
 #include "host/workouts/CHWorkoutDetailMapAndWeatherTableViewCell.h"
 
-#include "host/workouts/Placement.h"
+#include "host/core/Layout.h"
 #include "platform/runtime/ClassBuilder.h"
 
 namespace ax::host {

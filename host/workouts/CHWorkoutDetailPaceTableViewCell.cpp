@@ -1,7 +1,7 @@
 #include "host/workouts/CHWorkoutDetailPaceTableViewCell.h"
 
+#include "host/core/Layout.h"
 #include "host/workouts/CHWorkoutDataCalculator.h"
-#include "host/workouts/Placement.h"
 #include "host/workouts/WorkoutFigures.h"
 #include "platform/runtime/ClassBuilder.h"
 

@@ -1,7 +1,7 @@
 #include "host/workouts/CHWorkoutDetailSplitTableViewCell.h"
 
+#include "host/core/Layout.h"
 #include "host/workouts/CHWorkoutDataCalculator.h"
-#include "host/workouts/Placement.h"
 #include "host/workouts/WorkoutFigures.h"
 #include "platform/foundation/Formatters.h"
 #include "platform/runtime/ClassBuilder.h"

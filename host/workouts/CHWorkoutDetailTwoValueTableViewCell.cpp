@@ -1,7 +1,7 @@
 #include "host/workouts/CHWorkoutDetailTwoValueTableViewCell.h"
 
+#include "host/core/Layout.h"
 #include "host/workouts/CHWorkoutFormattingManager.h"
-#include "host/workouts/Placement.h"
 #include "host/workouts/WorkoutFigures.h"
 #include "platform/foundation/Formatters.h"
 #include "platform/runtime/ClassBuilder.h"

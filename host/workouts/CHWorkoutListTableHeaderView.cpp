@@ -1,6 +1,6 @@
 #include "host/workouts/CHWorkoutListTableHeaderView.h"
 
-#include "host/workouts/Placement.h"
+#include "host/core/Layout.h"
 #include "host/workouts/WorkoutFigures.h"
 #include "platform/foundation/Formatters.h"
 #include "platform/runtime/ClassBuilder.h"

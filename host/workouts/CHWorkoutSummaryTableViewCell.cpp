@@ -1,6 +1,6 @@
 #include "host/workouts/CHWorkoutSummaryTableViewCell.h"
 
-#include "host/workouts/Placement.h"
+#include "host/core/Layout.h"
 #include "host/workouts/WorkoutFigures.h"
 #include "host/workouts/WorkoutTotals.h"
 #include "platform/runtime/ClassBuilder.h"

@@ -4,8 +4,8 @@
 
 #include "platform/foundation/Array.h"
 #include "platform/foundation/Date.h"
-#include "platform/foundation/Number.h"
 #include "platform/foundation/String.h"
+#include "platform/runtime/Number.h"
 
 // Formatter objects as the bundle makes and sets them. They are cheap: the formatters proper are shared and
 // kept by language, zone and template. Main thread only. All answer in the environment's language and zone.

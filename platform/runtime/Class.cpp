@@ -86,7 +86,7 @@ const Method& Class::findMethod(Selector selector) const {
     }
   }
   methodCache_.insert(result);
-  firstMethods_.remember(*result);
+  cachedMethods_.remember(*result);
   return *result;
 }
 
@@ -126,7 +126,7 @@ const KeyReader& Class::findReader(Key key) const {
     if (isReadable) reader.method = &method;
   }
   keyCache_.insert(&reader);
-  firstReaders_.remember(reader);
+  cachedReaders_.remember(reader);
   return reader;
 }
 
@@ -176,11 +176,11 @@ void Class::addInstanceVariable(InstanceVariable variable) {
 void Class::forgetCaches() {
   if (methodCache_.size() != 0) {
     methodCache_.clear();
-    firstMethods_.clear();
+    cachedMethods_.clear();
   }
   if (keyCache_.size() != 0) {
     keyCache_.clear();
-    firstReaders_.clear();
+    cachedReaders_.clear();
   }
   for (Class* subclass : subclasses_) subclass->forgetCaches();
 }

@@ -7,7 +7,7 @@
 #include <string>
 #include <vector>
 
-#include "platform/runtime/FirstTable.h"
+#include "platform/runtime/LookUpCache.h"
 #include "platform/runtime/Method.h"
 #include "platform/runtime/Object.h"
 #include "platform/runtime/SelectorTable.h"
@@ -78,11 +78,11 @@ class Class final : public Object {
     return lookUpSlowly(selector);
   }
   // For a sender that keeps the selector's place: its entry, or that of another selector, which is never nil.
-  const Method& firstAnswer(std::size_t place) const { return firstMethods_.at(place); }
-  static std::size_t placeOf(Selector selector) { return FirstMethods::placeOf(selector); }
+  const Method& firstAnswer(std::size_t place) const { return cachedMethods_.at(place); }
+  static std::size_t placeOf(Selector selector) { return CachedMethods::placeOf(selector); }
   // Whether it is known that this entry answers its message: false also before the first look-up.
   bool isKnownToAnswerWith(const Method& method) const {
-    return &firstMethods_.find(method.selector) == &method;
+    return &cachedMethods_.find(method.selector) == &method;
   }
   // What the superclass answers at this moment.
   const Method& lookUpInSuperclass(Selector selector) const {
@@ -93,7 +93,7 @@ class Class final : public Object {
   const InstanceVariable* instanceVariable(Selector selector) const;
   const InstanceVariable* instanceVariableEvenIfHidden(Selector selector) const;
   const KeyReader& readerForKey(Key key) const {
-    const KeyReader& reader = firstReaders_.find(key);
+    const KeyReader& reader = cachedReaders_.find(key);
     return reader.selector == key ? reader : readerForKeySlowly(key);
   }
   bool conformsTo(std::string_view protocol) const;
@@ -126,7 +126,7 @@ class Class final : public Object {
   std::string description() const override { return name_; }
 
  private:
-  using FirstMethods = FirstTable<Method, 32>;
+  using CachedMethods = LookUpCache<Method, 32>;
 
   Class(std::string name, Class* superclass, Ref<Object> (*factory)());
   const Method& lookUpSlowly(Selector selector) const;
@@ -149,8 +149,8 @@ class Class final : public Object {
   SelectorTable<InstanceVariable> hiddenVariables_;
   SelectorTable<Method> hiddenMethods_;
   std::vector<std::string> protocols_;
-  mutable FirstMethods firstMethods_;
-  mutable FirstTable<KeyReader, 32> firstReaders_;
+  mutable CachedMethods cachedMethods_;
+  mutable LookUpCache<KeyReader, 32> cachedReaders_;
   mutable SelectorTable<Method> methodCache_;
   mutable SelectorTable<KeyReader> keyCache_;
   const CategoryRecord* categoryRecord_ = nullptr;

@@ -3,9 +3,9 @@
 #include <cstdint>
 
 #include "platform/foundation/Array.h"
-#include "platform/foundation/Number.h"
 #include "platform/foundation/String.h"
 #include "platform/runtime/Message.h"
+#include "platform/runtime/Number.h"
 
 // How a chart describes itself as a data series with two axes, and as a row of equal time slices. What a
 // chart leaves out is nil, NO or 0.

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "platform/foundation/AttributedString.h"
-#include "platform/toolkit/TextLabels.h"
+#include "platform/toolkit/PlainTextLabel.h"
 #include "platform/toolkit/View.h"
 
 namespace ax {

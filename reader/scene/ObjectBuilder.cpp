@@ -2,7 +2,7 @@
 
 #include <stdexcept>
 
-#include "platform/foundation/Number.h"
+#include "platform/runtime/Number.h"
 #include "platform/runtime/ScriptedAnswers.h"
 #include "platform/runtime/Signature.h"
 #include "platform/runtime/Weak.h"

@@ -8,8 +8,8 @@
 #include "reader/scene/Mirroring.h"
 #include "reader/scene/ObjectBuilder.h"
 #include "reader/scene/Omissions.h"
-#include "reader/scene/Presentation.h"
 #include "reader/scene/Raised.h"
+#include "reader/scene/ScreenPresenter.h"
 #include "reader/scene/StepRunner.h"
 
 namespace ax::reader {
@@ -80,9 +80,9 @@ SceneRun::SceneRun(const Scene& scene, const SceneRunOptions& options)
   if (scene.isMirrored) {
     mirror(screen_, [this](const Object& object) { return builder_->isPlaced(object); });
   }
-  Presentation presentation;
-  presentation.present(screen_);
-  hostFaults_.insert(hostFaults_.end(), presentation.hostFaults().begin(), presentation.hostFaults().end());
+  ScreenPresenter presenter;
+  presenter.present(screen_);
+  hostFaults_.insert(hostFaults_.end(), presenter.hostFaults().begin(), presenter.hostFaults().end());
 }
 
 SceneRun::~SceneRun() {

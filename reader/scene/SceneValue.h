@@ -6,8 +6,8 @@
 #include <variant>
 #include <vector>
 
-#include "platform/foundation/Number.h"
 #include "platform/runtime/Geometry.h"
+#include "platform/runtime/Number.h"
 #include "platform/runtime/Selector.h"
 
 namespace ax::reader {

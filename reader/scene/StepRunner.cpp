@@ -1,6 +1,6 @@
 #include "reader/scene/StepRunner.h"
 
-#include "platform/foundation/Number.h"
+#include "platform/runtime/Number.h"
 #include "platform/runtime/Signature.h"
 #include "reader/scene/ExportedFunctions.h"
 #include "reader/scene/HostNames.h"

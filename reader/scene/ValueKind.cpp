@@ -3,9 +3,9 @@
 #include <array>
 #include <limits>
 
-#include "platform/foundation/Number.h"
-#include "platform/foundation/Value.h"
 #include "platform/runtime/Boxing.h"
+#include "platform/runtime/Number.h"
+#include "platform/runtime/Value.h"
 
 namespace ax::reader {
 

@@ -5,9 +5,9 @@
 #include "platform/foundation/AttributedString.h"
 #include "platform/foundation/Date.h"
 #include "platform/foundation/Formatters.h"
-#include "platform/foundation/Value.h"
 #include "platform/health/Quantity.h"
 #include "platform/runtime/Message.h"
+#include "platform/runtime/Value.h"
 #include "platform/toolkit/AccessibilityMessages.h"
 
 namespace ax::reader {

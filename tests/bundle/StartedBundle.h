@@ -4,7 +4,6 @@
 #include <string>
 
 #include "platform/accessibility/BundleLoader.h"
-#include "platform/foundation/Environment.h"
 
 namespace ax {
 
@@ -21,15 +20,5 @@ template <class Function>
 Function* exported(const std::string& name) {
   return reinterpret_cast<Function*>(LoadedBundle::exportedSymbol(name));
 }
-
-// The environment for the length of a test.
-class EnvironmentScope {
- public:
-  explicit EnvironmentScope(Environment environment) { setEnvironment(std::move(environment)); }
-  ~EnvironmentScope() { setEnvironment(before_); }
-
- private:
-  Environment before_ = environment();
-};
 
 }  // namespace ax

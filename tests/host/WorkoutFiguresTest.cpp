@@ -11,6 +11,7 @@
 #include "tests/bundle/StartedBundle.h"
 #include "tests/bundle/workouts/SomeWorkout.h"
 #include "tests/formatting/RegionScope.h"
+#include "tests/platform/EnvironmentScope.h"
 
 // How the app shows and sums up workouts.
 namespace ax::host {

@@ -1,6 +1,6 @@
 #include <gtest/gtest.h>
 
-#include "platform/foundation/Number.h"
+#include "platform/runtime/Number.h"
 #include "platform/toolkit/AccessibilityElement.h"
 #include "platform/toolkit/Control.h"
 #include "platform/toolkit/Label.h"

@@ -7,7 +7,7 @@
 
 #include "platform/foundation/Calendar.h"
 #include "platform/health/ActivitySummary.h"
-#include "tests/bundle/StartedBundle.h"
+#include "tests/platform/EnvironmentScope.h"
 
 // The days of activity over two centuries and many zones, reckoned once more with the standard library.
 namespace ax {

@@ -13,10 +13,10 @@
 #include "platform/foundation/Date.h"
 #include "platform/foundation/Environment.h"
 #include "platform/foundation/Formatters.h"
-#include "platform/foundation/Number.h"
-#include "platform/foundation/Value.h"
 #include "platform/foundation/WeatherUtilities.h"
 #include "platform/runtime/Boxing.h"
+#include "platform/runtime/Number.h"
+#include "platform/runtime/Value.h"
 #include "platform/toolkit/AccessibilityMessages.h"
 #include "tests/formatting/RegionScope.h"
 

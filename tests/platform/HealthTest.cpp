@@ -5,11 +5,11 @@
 
 #include "platform/foundation/Environment.h"
 #include "platform/foundation/Formatters.h"
-#include "platform/foundation/Number.h"
 #include "platform/health/ActivitySummary.h"
 #include "platform/health/HealthStore.h"
 #include "platform/health/Quantity.h"
 #include "platform/runtime/KeyReading.h"
+#include "platform/runtime/Number.h"
 #include "tests/formatting/RegionScope.h"
 
 namespace ax {

@@ -2,9 +2,9 @@
 
 #include <stdexcept>
 
-#include "platform/foundation/Number.h"
 #include "platform/foundation/String.h"
 #include "platform/runtime/ClassBuilder.h"
+#include "platform/runtime/Number.h"
 #include "platform/runtime/ScriptedAnswers.h"
 #include "tests/platform/AddedCategory.h"
 

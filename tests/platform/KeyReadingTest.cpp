@@ -5,10 +5,10 @@
 #include <stdexcept>
 
 #include "platform/foundation/Array.h"
-#include "platform/foundation/Number.h"
 #include "platform/foundation/String.h"
-#include "platform/foundation/Value.h"
 #include "platform/runtime/ClassBuilder.h"
+#include "platform/runtime/Number.h"
+#include "platform/runtime/Value.h"
 #include "platform/toolkit/Label.h"
 
 namespace ax {

@@ -7,9 +7,9 @@
 #include <stdexcept>
 #include <thread>
 
-#include "platform/foundation/Number.h"
 #include "platform/foundation/String.h"
 #include "platform/runtime/ClassBuilder.h"
+#include "platform/runtime/Number.h"
 
 namespace ax {
 

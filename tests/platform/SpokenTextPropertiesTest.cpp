@@ -4,7 +4,7 @@
 #include <map>
 #include <random>
 
-#include "platform/foundation/Number.h"
+#include "platform/runtime/Number.h"
 #include "platform/toolkit/AccessibilityElement.h"
 #include "platform/toolkit/ElementTree.h"
 #include "platform/toolkit/Label.h"

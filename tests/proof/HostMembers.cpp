@@ -6,7 +6,7 @@
 #include <set>
 
 #include "platform/foundation/Array.h"
-#include "platform/foundation/Number.h"
+#include "platform/runtime/Number.h"
 #include "platform/runtime/Signature.h"
 
 namespace ax::proof {

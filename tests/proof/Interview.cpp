@@ -8,9 +8,9 @@
 
 #include "platform/accessibility/ValidationManager.h"
 #include "platform/foundation/AttributedString.h"
-#include "platform/foundation/Number.h"
 #include "platform/runtime/Boxing.h"
 #include "platform/runtime/Grafting.h"
+#include "platform/runtime/Number.h"
 #include "platform/toolkit/ElementTree.h"
 #include "platform/toolkit/ViewController.h"
 #include "reader/snapshot/Snapshot.h"

@@ -5,9 +5,9 @@
 #include <limits>
 
 #include "platform/foundation/Array.h"
-#include "platform/foundation/Number.h"
 #include "platform/runtime/Boxing.h"
 #include "platform/runtime/ClassBuilder.h"
+#include "platform/runtime/Number.h"
 #include "platform/runtime/ScriptedAnswers.h"
 
 namespace ax::proof {

@@ -4,8 +4,8 @@
 
 #include "platform/formatting/Durations.h"
 #include "platform/foundation/Array.h"
-#include "platform/foundation/Number.h"
 #include "platform/runtime/ClassBuilder.h"
+#include "platform/runtime/Number.h"
 #include "platform/toolkit/DataSeriesMessages.h"
 #include "reader/snapshot/Charts.h"
 #include "reader/sound/ChartSound.h"

@@ -8,8 +8,8 @@
 #include <random>
 
 #include "platform/foundation/Array.h"
-#include "platform/foundation/Value.h"
 #include "platform/health/Quantity.h"
+#include "platform/runtime/Value.h"
 #include "reader/scene/Reply.h"
 #include "reader/text/TraitNames.h"
 #include "tests/reader/SceneProbe.h"

@@ -4,8 +4,8 @@
 #include <stdexcept>
 
 #include "platform/foundation/Environment.h"
-#include "platform/foundation/Number.h"
 #include "platform/runtime/ClassBuilder.h"
+#include "platform/runtime/Number.h"
 #include "tests/reader/ScreenPieces.h"
 
 namespace ax::reader::testing {

@@ -2,7 +2,7 @@
 
 #include <random>
 
-#include "platform/foundation/Number.h"
+#include "platform/runtime/Number.h"
 #include "reader/speech/SpokenLine.h"
 #include "reader/speech/SpokenTime.h"
 #include "reader/transcript/Transcript.h"

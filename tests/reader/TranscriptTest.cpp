@@ -3,8 +3,8 @@
 #include <gtest/gtest.h>
 
 #include "platform/foundation/Environment.h"
-#include "platform/foundation/Number.h"
 #include "platform/runtime/ClassBuilder.h"
+#include "platform/runtime/Number.h"
 #include "reader/speech/SpokenLine.h"
 #include "reader/speech/SpokenTime.h"
 #include "tests/formatting/RegionScope.h"

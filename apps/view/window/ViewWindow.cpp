@@ -56,10 +56,10 @@ QString screenTitle(const std::string& title) {
 
 }  // namespace
 
-ViewWindow::ViewWindow(app::Presentation& presentation, Voice voice)
-    : presentation_(presentation),
+ViewWindow::ViewWindow(app::ShownScene& shown, Voice voice)
+    : shown_(shown),
       voice_(voice),
-      model_([&] { return presentation_.snapshot(); }),
+      model_([&] { return shown_.snapshot(); }),
       canvas_(new ScreenCanvas(model_)),
       area_(new QScrollArea),
       caption_(new Caption),
@@ -67,7 +67,7 @@ ViewWindow::ViewWindow(app::Presentation& presentation, Voice voice)
       tree_(model_, *canvas_,
             {[this](ItemId item) { focusOn(item); },
              [this](Action action, ItemId item) { follow(operate(model_, action, item)); }}) {
-  setWindowTitle(screenTitle(presentation_.run().title()));
+  setWindowTitle(screenTitle(shown_.run().title()));
   canvas_->setAccessibleName(windowTitle());
   layOut();
   fillMenus();
@@ -121,7 +121,7 @@ void ViewWindow::listen() {
 }
 
 void ViewWindow::draw() {
-  canvas_->setPicture(pictureOf(model_, presentation_.run().title(), palette()), pictureColours(palette()));
+  canvas_->setPicture(pictureOf(model_, shown_.run().title(), palette()), pictureColours(palette()));
 }
 
 // The desktop goes from light to dark at nightfall.
@@ -196,7 +196,7 @@ std::string ViewWindow::play(const reader::Sound& sound) {
 
 void ViewWindow::follow(const Effect& effect) {
   if (effect.result == reader::ActionResult::raised) {
-    app::complain(presentation_.scene().file + ": the host raised when it was acted on");
+    app::complain(shown_.scene().file + ": the host raised when it was acted on");
   }
   if (effect.change.isAny()) {
     tour_.leave();

@@ -3,7 +3,7 @@
 #include <QMainWindow>
 #include <QScrollArea>
 
-#include "apps/shared/Presentation.h"
+#include "apps/shared/ShownScene.h"
 #include "apps/view/model/ChartTour.h"
 #include "apps/view/model/Operating.h"
 #include "apps/view/model/StepNote.h"
@@ -22,8 +22,8 @@ class ViewWindow : public QMainWindow {
   enum class Voice { none, own };
 
   // With a voice of its own, it says the focused line and what happens. Throws a Fault for a scene without a
-  // screen. The presentation must outlive the window.
-  ViewWindow(app::Presentation& presentation, Voice voice);
+  // screen. The shown must outlive the window.
+  ViewWindow(app::ShownScene& shown, Voice voice);
 
   // What keys and menus run.
   void go(int direction, const ScreenModel::Test& test);
@@ -65,7 +65,7 @@ class ViewWindow : public QMainWindow {
   const Item* focused() const { return model_.find(model_.focus()); }
   std::string focusedLine() const;
 
-  app::Presentation& presentation_;
+  app::ShownScene& shown_;
   const Voice voice_;
   bool hasToldOfSilence_ = false;
   ScreenModel model_;

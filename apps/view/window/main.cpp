@@ -39,13 +39,13 @@ class Application : public QApplication {
 };
 
 int showScreen(const app::Opening& opening, view::ViewWindow::Voice voice) {
-  std::optional<app::Presentation> presentation;
+  std::optional<app::ShownScene> shown;
   std::optional<view::ViewWindow> window;
   try {
-    presentation.emplace(opening);
+    shown.emplace(opening);
     QApplication::setLayoutDirection(formatting::currentLanguageIsRightToLeft() ? Qt::RightToLeft
                                                                                 : Qt::LeftToRight);
-    window.emplace(*presentation, voice);
+    window.emplace(*shown, voice);
   } catch (const reader::Fault& fault) {
     return showFault(fault);
   }

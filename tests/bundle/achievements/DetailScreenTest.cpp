@@ -6,6 +6,7 @@
 #include "platform/toolkit/ElementTree.h"
 #include "tests/bundle/Answers.h"
 #include "tests/bundle/StartedBundle.h"
+#include "tests/platform/EnvironmentScope.h"
 
 namespace ax {
 

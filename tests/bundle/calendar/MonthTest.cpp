@@ -7,6 +7,7 @@
 #include "platform/formatting/FormatterStatistics.h"
 #include "platform/toolkit/ElementTree.h"
 #include "tests/bundle/StartedBundle.h"
+#include "tests/platform/EnvironmentScope.h"
 
 // What a scene cannot show of the month screen: tags that are never spoken, and what a month costs.
 namespace ax {

@@ -10,6 +10,7 @@
 #include "tests/bundle/Answers.h"
 #include "tests/bundle/Members.h"
 #include "tests/bundle/StartedBundle.h"
+#include "tests/platform/EnvironmentScope.h"
 
 // The weekday header over many weeks, sizes and settings, each compared with a reckoning of the test's own.
 namespace ax {

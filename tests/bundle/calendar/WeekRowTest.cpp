@@ -9,11 +9,12 @@
 #include "host/calendar/MonthWeekView.h"
 #include "host/calendar/QSCalendarDayCell.h"
 #include "host/core/ActivitySummaryCache.h"
-#include "platform/foundation/Number.h"
+#include "platform/runtime/Number.h"
 #include "platform/runtime/ScriptedAnswers.h"
 #include "tests/bundle/Answers.h"
 #include "tests/bundle/Members.h"
 #include "tests/bundle/StartedBundle.h"
+#include "tests/platform/EnvironmentScope.h"
 
 // The rows of the month: their order over many layouts, days that move, and days that go by.
 namespace ax {

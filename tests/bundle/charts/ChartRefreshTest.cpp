@@ -6,12 +6,13 @@
 #include "host/charts/ActivityStandChartView.h"
 #include "host/charts/TrendDetailChartView.h"
 #include "host/charts/TrendDetailDailyAverageView.h"
-#include "platform/foundation/Value.h"
 #include "platform/runtime/ScriptedAnswers.h"
+#include "platform/runtime/Value.h"
 #include "platform/toolkit/DataSeriesMessages.h"
 #include "tests/bundle/Answers.h"
 #include "tests/bundle/Members.h"
 #include "tests/bundle/StartedBundle.h"
+#include "tests/platform/EnvironmentScope.h"
 
 // What all charts of bars have in common: lists that are kept, renewed and dropped.
 namespace ax {

@@ -2,10 +2,11 @@
 
 #include "host/charts/ActivityMoveAndExerciseChartView.h"
 #include "host/charts/ActivityStandChartView.h"
-#include "platform/foundation/Value.h"
 #include "platform/runtime/ScriptedAnswers.h"
+#include "platform/runtime/Value.h"
 #include "tests/bundle/Answers.h"
 #include "tests/bundle/StartedBundle.h"
+#include "tests/platform/EnvironmentScope.h"
 
 // What a scene cannot show of the day's charts: how often they ask the host, what a query in the middle of a
 // build finds, and very long lists.

@@ -6,6 +6,7 @@
 #include "tests/bundle/Answers.h"
 #include "tests/bundle/Members.h"
 #include "tests/bundle/StartedBundle.h"
+#include "tests/platform/EnvironmentScope.h"
 
 // What stands in place of a heart rate: blocks that outlive what they were made for, and overlays that
 // change.

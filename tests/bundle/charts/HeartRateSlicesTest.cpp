@@ -8,6 +8,7 @@
 #include "platform/toolkit/DataSeriesMessages.h"
 #include "tests/bundle/Members.h"
 #include "tests/bundle/StartedBundle.h"
+#include "tests/platform/EnvironmentScope.h"
 
 // The summary of a workout's heart rate in slices, against readings counted by other means: whole seconds and
 // tenths of a beat, in integers.

@@ -7,6 +7,7 @@
 #include "platform/toolkit/DataSeriesMessages.h"
 #include "tests/bundle/Members.h"
 #include "tests/bundle/StartedBundle.h"
+#include "tests/platform/EnvironmentScope.h"
 
 // The slices of the day's charts where a scene cannot reach: charts that are cut otherwise, and precision.
 namespace ax {

@@ -7,10 +7,11 @@
 
 #include "host/charts/TrendDetailChartView.h"
 #include "host/charts/TrendDetailDailyAverageView.h"
-#include "platform/foundation/Number.h"
+#include "platform/runtime/Number.h"
 #include "platform/runtime/ScriptedAnswers.h"
 #include "platform/toolkit/DataSeriesMessages.h"
 #include "tests/bundle/StartedBundle.h"
+#include "tests/platform/EnvironmentScope.h"
 
 // What a scene cannot hold of a trend's charts: figures that no file can write, how the host is asked, and
 // very many bars.

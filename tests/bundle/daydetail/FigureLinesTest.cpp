@@ -6,6 +6,7 @@
 #include "platform/foundation/Formatters.h"
 #include "tests/bundle/Answers.h"
 #include "tests/bundle/StartedBundle.h"
+#include "tests/platform/EnvironmentScope.h"
 
 // The spoken figures of the move and exercise rings, in every language and around every step of rounding.
 namespace ax {

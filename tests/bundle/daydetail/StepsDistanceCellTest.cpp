@@ -3,6 +3,7 @@
 #include "host/daydetail/StepsDistanceCell.h"
 #include "tests/bundle/Answers.h"
 #include "tests/bundle/StartedBundle.h"
+#include "tests/platform/EnvironmentScope.h"
 
 namespace ax {
 

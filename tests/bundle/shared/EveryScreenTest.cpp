@@ -11,6 +11,7 @@
 #include "tests/bundle/Answers.h"
 #include "tests/bundle/StartedBundle.h"
 #include "tests/bundle/shared/FurnishedScreens.h"
+#include "tests/platform/EnvironmentScope.h"
 
 // What holds of every class that the bundle extends.
 namespace ax {

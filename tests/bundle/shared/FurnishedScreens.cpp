@@ -8,7 +8,7 @@
 #include "host/charts/DayViewTitleAndValueLabelPair.h"
 #include "platform/accessibility/CategoryRegistration.h"
 #include "platform/accessibility/ValidationManager.h"
-#include "platform/foundation/Number.h"
+#include "platform/runtime/Number.h"
 #include "platform/toolkit/Control.h"
 #include "platform/toolkit/DataSeriesMessages.h"
 #include "platform/toolkit/ElementTree.h"

@@ -4,6 +4,7 @@
 
 #include "platform/foundation/AttributedString.h"
 #include "tests/bundle/StartedBundle.h"
+#include "tests/platform/EnvironmentScope.h"
 
 namespace ax {
 

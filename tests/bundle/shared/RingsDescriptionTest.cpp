@@ -11,6 +11,7 @@
 #include "platform/runtime/Message.h"
 #include "platform/runtime/ScriptedAnswers.h"
 #include "tests/bundle/StartedBundle.h"
+#include "tests/platform/EnvironmentScope.h"
 
 // What a scene cannot show of the rings: fractions that no file can write, what is asked when, and hosts that
 // raise.

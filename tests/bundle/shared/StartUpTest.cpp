@@ -8,6 +8,7 @@
 #include "platform/foundation/Array.h"
 #include "platform/runtime/Message.h"
 #include "tests/bundle/StartedBundle.h"
+#include "tests/platform/EnvironmentScope.h"
 
 // A bundle starts once in a process, so each of these stands in a process of its own.
 namespace ax {

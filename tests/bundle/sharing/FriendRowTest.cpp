@@ -1,9 +1,10 @@
 #include <gtest/gtest.h>
 
 #include "host/sharing/CHFriendListTableViewCell.h"
-#include "platform/foundation/Number.h"
+#include "platform/runtime/Number.h"
 #include "tests/bundle/Answers.h"
 #include "tests/bundle/StartedBundle.h"
+#include "tests/platform/EnvironmentScope.h"
 
 // What a scene cannot show of a friend's row: what its blocks hold, and what becomes of marked texts.
 namespace ax {

@@ -7,6 +7,7 @@
 #include "platform/runtime/ScriptedAnswers.h"
 #include "tests/bundle/Answers.h"
 #include "tests/bundle/StartedBundle.h"
+#include "tests/platform/EnvironmentScope.h"
 
 namespace ax {
 

@@ -5,6 +5,7 @@
 #include "host/sharing/CHFriendListViewController.h"
 #include "tests/bundle/Answers.h"
 #include "tests/bundle/StartedBundle.h"
+#include "tests/platform/EnvironmentScope.h"
 
 // What scenes cannot show of the buttons in the friends' navigation bars: whose objects they keep, and bars
 // that hold other things than buttons.

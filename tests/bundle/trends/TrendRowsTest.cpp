@@ -9,6 +9,7 @@
 #include "platform/runtime/ScriptedAnswers.h"
 #include "tests/bundle/Answers.h"
 #include "tests/bundle/StartedBundle.h"
+#include "tests/platform/EnvironmentScope.h"
 
 // What scenes cannot show of the list of trends: rows that are used again, and what a row does to its parts.
 namespace ax {

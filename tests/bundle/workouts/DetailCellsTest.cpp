@@ -11,6 +11,7 @@
 #include "tests/bundle/Answers.h"
 #include "tests/bundle/StartedBundle.h"
 #include "tests/bundle/workouts/SomeWorkout.h"
+#include "tests/platform/EnvironmentScope.h"
 
 // What scenes cannot show of a workout's own screen: cells that are used again, who owns what, and what is
 // kept from one question to the next.

@@ -2,9 +2,9 @@
 
 #include <optional>
 
-#include "platform/foundation/Number.h"
 #include "platform/health/Quantity.h"
 #include "platform/health/Workout.h"
+#include "platform/runtime/Number.h"
 #include "tests/bundle/Members.h"
 
 namespace ax {

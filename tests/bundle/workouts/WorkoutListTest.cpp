@@ -11,6 +11,7 @@
 #include "tests/bundle/Answers.h"
 #include "tests/bundle/StartedBundle.h"
 #include "tests/bundle/workouts/SomeWorkout.h"
+#include "tests/platform/EnvironmentScope.h"
 
 // What scenes cannot show of the workout list: rows that are used again, hosts that raise, and every
 // combination of totals.

@@ -1,4 +1,4 @@
-#include "platform/toolkit/TextLabels.h"
+#include "platform/toolkit/PlainTextLabel.h"
 
 #include "platform/foundation/AttributedString.h"
 #include "platform/runtime/ClassBuilder.h"

@@ -1,4 +1,4 @@
-#include "platform/foundation/Number.h"
+#include "platform/runtime/Number.h"
 
 #include <charconv>
 #include <cmath>

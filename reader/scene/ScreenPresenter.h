@@ -10,7 +10,7 @@ namespace ax::reader {
 // Presents a screen as the system does: a controller is told to load its view and that it did, the views are
 // laid out, parents first, and then everything, children first, is told once to load its accessibility. What
 // the host raises meanwhile is noted and stops nothing.
-class Presentation {
+class ScreenPresenter {
  public:
   void present(const Ref<Object>& screen);
   // "CHCell layoutSubviews: why"

@@ -13,7 +13,7 @@ namespace ax {
 // right only as long as that table holds the same record. Any thread may find; who remembers or clears holds
 // the lock under which the whole table changes.
 template <class Record, std::size_t Size>
-class FirstTable {
+class LookUpCache {
  public:
   // A record of the selector, or one of another.
   const Record& find(Selector selector) const { return at(placeOf(selector)); }

@@ -13,10 +13,10 @@ namespace ax::app {
 std::string modulePath();
 
 // A scene that stands with the bundle in it, and its screen. A process makes one.
-class Presentation {
+class ShownScene {
  public:
   // Throws a Fault. What the host raised meanwhile goes to standard error.
-  explicit Presentation(const Opening& opening);
+  explicit ShownScene(const Opening& opening);
 
   const reader::Scene& scene() const { return *scene_; }
   reader::SceneRun& run() { return *run_; }

@@ -1,20 +1,10 @@
 #include "platform/runtime/Boxing.h"
 
-#include "platform/foundation/Number.h"
-#include "platform/foundation/Value.h"
-#include "platform/runtime/ClassBuilder.h"
+#include "platform/runtime/Class.h"
+#include "platform/runtime/Number.h"
+#include "platform/runtime/Value.h"
 
 namespace ax {
-
-Class& Value::staticClass() {
-  static Class& result = ClassBuilder<Value>("Value", Object::staticClass()).build();
-  return result;
-}
-
-bool Value::isEqual(const Object& other) const {
-  const Value* value = cast<Value>(&other);
-  return value != nullptr && value->content_ == content_;
-}
 
 Ref<Object> box(bool value) {
   return number(value);
@@ -119,7 +109,5 @@ template bool isValueOf<Size>(const Object&);
 template bool isValueOf<Rect>(const Object&);
 template bool isValueOf<Insets>(const Object&);
 template bool isValueOf<Selector>(const Object&);
-
-static const RegisteredClass<Value> registered;
 
 }  // namespace ax

@@ -1,4 +1,4 @@
-#include "apps/shared/Presentation.h"
+#include "apps/shared/ShownScene.h"
 
 #include "apps/shared/Complaint.h"
 #include "apps/shared/Input.h"
@@ -12,7 +12,7 @@ std::string modulePath() {
   return formatting::resourceFolderBeside(&inThisProgram, "../lib/AXVelto") + "/AXVelto.so";
 }
 
-Presentation::Presentation(const Opening& opening)
+ShownScene::ShownScene(const Opening& opening)
     : scene_(std::make_unique<reader::Scene>(sceneFor(opening))),
       run_(std::make_unique<reader::SceneRun>(
           *scene_, reader::SceneRunOptions{.modulePath = modulePath(), .without = opening.without})) {
@@ -22,19 +22,19 @@ Presentation::Presentation(const Opening& opening)
   tellOf(0);
 }
 
-reader::Snapshot Presentation::snapshot() const {
+reader::Snapshot ShownScene::snapshot() const {
   if (!run_->screen()) throw reader::Fault{scene_->file, "/screen", "no screen", "an object to present"};
   return snapshotOf(run_->screen());
 }
 
-reader::Snapshot Presentation::snapshotOf(Receiver object) const {
+reader::Snapshot ShownScene::snapshotOf(Receiver object) const {
   reader::Snapshot snapshot =
       reader::takeSnapshot(object, [this](const Object& named) { return run_->idOf(named); });
   tellOf(snapshot.timesRaised());
   return snapshot;
 }
 
-void Presentation::tellOf(std::size_t timesRaised) const {
+void ShownScene::tellOf(std::size_t timesRaised) const {
   const auto tell = [&](const std::string& what, std::size_t times) {
     if (times == 0) return;
     complain(scene_->file + ": " + what + ", " + std::to_string(times) + (times == 1 ? " time" : " times"));

@@ -1,4 +1,4 @@
-#include "reader/scene/Presentation.h"
+#include "reader/scene/ScreenPresenter.h"
 
 #include "platform/runtime/KeyReading.h"
 #include "platform/toolkit/TreeDepth.h"
@@ -8,14 +8,14 @@
 namespace ax::reader {
 
 template <class M>
-void Presentation::send(const M& message, const Ref<Object>& receiver) {
+void ScreenPresenter::send(const M& message, const Ref<Object>& receiver) {
   const auto raised = raisedBy([&] { message(receiver); });
   if (!raised) return;
   hostFaults_.push_back(receiver->isa().name() + " " + std::string(message.selector().name()) + ": " +
                         *raised);
 }
 
-void Presentation::present(const Ref<Object>& screen) {
+void ScreenPresenter::present(const Ref<Object>& screen) {
   const bool isController = cast<ViewController>(screen.get()) != nullptr;
   if (isController) {
     send(messages::loadView, screen);
@@ -29,14 +29,14 @@ void Presentation::present(const Ref<Object>& screen) {
   if (isController) send(messages::_accessibilityLoadAccessibilityInformation, screen);
 }
 
-void Presentation::layOut(const Ref<View>& view, std::size_t level) {
+void ScreenPresenter::layOut(const Ref<View>& view, std::size_t level) {
   if (!isWithinDepth(level)) return;
   send(messages::layoutSubviews, view);
   const std::vector<Ref<View>> children = view->subviews();
   for (const Ref<View>& child : children) layOut(child, level + 1);
 }
 
-void Presentation::loadAccessibility(const Ref<View>& view, std::size_t level) {
+void ScreenPresenter::loadAccessibility(const Ref<View>& view, std::size_t level) {
   if (!isWithinDepth(level)) return;
   const std::vector<Ref<View>> children = view->subviews();
   for (const Ref<View>& child : children) loadAccessibility(child, level + 1);
