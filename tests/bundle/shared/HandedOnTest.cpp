@@ -4,7 +4,7 @@
 
 #include "platform/accessibility/CategoryRegistration.h"
 #include "platform/accessibility/ValidationManager.h"
-#include "platform/foundation/Number.h"
+#include "platform/runtime/Number.h"
 #include "platform/runtime/ScriptedAnswers.h"
 #include "tests/bundle/StartedBundle.h"
 

@@ -12,6 +12,7 @@
 #include "platform/foundation/String.h"
 #include "platform/health/HealthStore.h"
 #include "tests/bundle/StartedBundle.h"
+#include "tests/platform/EnvironmentScope.h"
 
 // The start, and the wheelchair flag that is asked anew in the background, beside a health store that takes
 // its time. The first question is asked once in a process, so each of these stands in a process of its own.
