@@ -70,7 +70,8 @@ std::string onOneLine(const std::string& text) {
       line += text[i++];
       continue;
     }
-    const bool isBreak = text.find_first_of("\r\n", i) < end;
+    const std::string_view blank = std::string_view(text).substr(i, end - i);
+    const bool isBreak = blank.find_first_of("\r\n") != blank.npos;
     if (!line.empty() && end < text.size()) line += isBreak ? formatting::listSeparator() : " ";
     i = end;
   }
