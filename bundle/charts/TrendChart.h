@@ -70,10 +70,12 @@ class TrendChart : public GraphDataChart<C> {
     return cast<Number>(this->self._accessibilityValueForKey(C::rangeKeys().maximum));
   }
 
-  // The title as a header, then the columns.
+  // The title as a header, then the columns. A chart that answers itself is no part of the list that it
+  // keeps.
   Ref<Array> accessibilityElements() {
     return chartElements(this->self, [this](MutableArray& elements) {
-      const Ref<View> title = safeUIViewForKey(this->self, "titleLabel"_key);
+      Ref<View> title = safeUIViewForKey(this->self, "titleLabel"_key);
+      if (title.get() == &this->self) title = nullptr;
       _accessibilityAddTrait(title, TraitHeader);
       elements.axSafelyAddObject(title);
       static_cast<C*>(this)->addColumns(elements, messages::frame(title).height);
