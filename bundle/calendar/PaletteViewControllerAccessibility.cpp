@@ -22,9 +22,10 @@ class PaletteViewControllerAccessibility : public SafeCategory {
     super(messages::_accessibilityLoadAccessibilityInformation);
     const Ref<ViewController> controller = castAsClass<ViewController>(self);
     if (!controller) return;
-    messages::setAccessibilityElements(
-        messages::view(controller),
-        axArrayByIgnoringNilElementsWithCount(1, {self.safeValueForKey("_paletteView"_key)}));
+    Ref<Object> palette = self.safeValueForKey("_paletteView"_key);
+    if (palette.get() == &self) palette = nullptr;  // its view would keep the controller
+    messages::setAccessibilityElements(messages::view(controller),
+                                       axArrayByIgnoringNilElementsWithCount(1, {palette}));
   }
 };
 

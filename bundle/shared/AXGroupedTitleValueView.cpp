@@ -25,6 +25,8 @@ AXGroupedTitleValueView::AXGroupedTitleValueView(Receiver container, Ref<Object>
 
 Ref<AXGroupedTitleValueView> AXGroupedTitleValueView::initWithAccessibilityContainerTitleViewValueView(
     Receiver container, Ref<Object> titleView, Ref<Object> valueView) {
+  if (titleView.get() == container.get()) titleView = nullptr;
+  if (valueView.get() == container.get()) valueView = nullptr;
   return make<AXGroupedTitleValueView>(container, std::move(titleView), std::move(valueView));
 }
 

@@ -5,8 +5,8 @@
 namespace ax {
 
 // One stop for a caption and a figure that the host shows as two labels: the caption is its label, the figure
-// its value, both read anew at each query. It retains the two views; either may be nil. Unless both speak, it
-// is no element.
+// its value, both read anew at each query. It retains the two views; either may be nil, and one that is the
+// container, which owns it, counts as nil. Unless both speak, it is no element.
 class AXGroupedTitleValueView final : public AggregateElement {
  public:
   static Class& staticClass();
