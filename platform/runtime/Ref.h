@@ -50,6 +50,8 @@ class Ref {
     if (checksPreconditions && object_ == nullptr) [[unlikely]]
       preconditionFailed("the handle is nil: test it, or send a message, which nil answers too",
                          SourcePlace::current());
+    // Optimised builds check nothing.
+    // NOLINTNEXTLINE(clang-analyzer-core.uninitialized.UndefReturn)
     return *object_;
   }
   explicit operator bool() const { return object_ != nullptr; }
