@@ -8,6 +8,7 @@
 #include "reader/contract/ContractReport.h"
 #include "tests/bundle/StartedBundle.h"
 #include "tests/contract/InChild.h"
+#include "tests/contract/OwnProcess.h"
 #include "tests/tour/Samples.h"
 
 // The host contract with each of its rows taken away in turn. Every row gets a process of its own, since what
@@ -119,6 +120,7 @@ constexpr std::size_t shares = 4;
 class ContractRow : public testing::TestWithParam<std::size_t> {};
 
 TEST_P(ContractRow, IsOneThatTheAppLivesWithout) {
+  if (ranInOwnProcess()) return;
   std::vector<ContractCheck> rows;
   // The rows are read in a child, so that this process stays without a started bundle.
   const std::string listed = inChild([] {

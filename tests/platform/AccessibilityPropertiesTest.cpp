@@ -7,6 +7,7 @@
 #include "platform/toolkit/ScrollView.h"
 #include "platform/toolkit/TableViewCell.h"
 #include "platform/toolkit/ViewController.h"
+#include "tests/contract/OwnProcess.h"
 #include "tests/formatting/RegionScope.h"
 #include "tests/platform/AddedCategory.h"
 
@@ -111,6 +112,12 @@ TEST(AccessibilityProperties, speakTheSpokenFormOfATextFirst) {
   EXPECT_EQ(accessibilityLabel(label), nullptr);
   label->setText(string("plain"));
   EXPECT_EQ(accessibilityLabel(label), label->text());
+}
+
+TEST(AccessibilityProperties, askTheTextsOverride) {
+  if (ranInOwnProcess()) return;
+  const Ref<Label> label = make<Label>();
+  label->setText(string("plain"));
   graftCategory(textCategory(), String::staticClass());
   EXPECT_EQ(accessibilityLabel(label)->text(), "override") << "also of a text that carries nothing";
 }

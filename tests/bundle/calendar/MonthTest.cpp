@@ -3,9 +3,9 @@
 #include "host/calendar/MonthViewController.h"
 #include "host/calendar/MonthWeekView.h"
 #include "host/calendar/QSCalendarDayCell.h"
-#include "host/core/ActivitySummaryCache.h"
 #include "platform/formatting/FormatterStatistics.h"
 #include "platform/toolkit/ElementTree.h"
+#include "tests/bundle/GivenSummaries.h"
 #include "tests/bundle/StartedBundle.h"
 #include "tests/platform/EnvironmentScope.h"
 
@@ -22,10 +22,11 @@ class MonthTest : public testing::Test {
   void SetUp() override { ASSERT_NO_FATAL_FAILURE(startBundle()); }
 
   const EnvironmentScope environment_{Environment{.locale = "de_DE", .now = today}};
+  GivenSummaries summaries_;
 };
 
 // Six week rows whose last day is today, every day of them with rings.
-std::vector<Ref<View>> sixWeeks() {
+std::vector<Ref<View>> sixWeeks(GivenSummaries& summaries) {
   std::vector<Ref<View>> weeks;
   for (int i = 0; i < 42; ++i) {
     if (i % 7 == 0) {
@@ -34,10 +35,7 @@ std::vector<Ref<View>> sixWeeks() {
     }
     const auto cell = make<host::MonthDayCellLayer>();
     cell->setDate(date(today - (41 - i) * day));
-    const auto summary = make<ActivitySummary>();
-    summary->setFractions(0.01 * i, 0.5, 1);
-    host::ActivitySummaryCache::sharedInstance()->setSummaryForCacheIndex(
-        summary, static_cast<std::int64_t>(today / day) - (41 - i));
+    summaries.give(static_cast<std::int64_t>(today / day) - (41 - i), 0.01 * i, 0.5, 1);
     weeks.back()->layer()->addSublayer(cell);
     weeks.back()->layoutSubviews();
   }
@@ -57,7 +55,7 @@ std::vector<std::string> spoken(const std::vector<Ref<View>>& weeks) {
 }
 
 TEST_F(MonthTest, MakesNoFormatterOnceItHasBeenRead) {
-  const std::vector<Ref<View>> weeks = sixWeeks();
+  const std::vector<Ref<View>> weeks = sixWeeks(summaries_);
   const std::vector<std::string> first = spoken(weeks);
   ASSERT_EQ(first.size(), 42u);
   EXPECT_EQ(first.front(),

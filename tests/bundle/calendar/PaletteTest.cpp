@@ -5,9 +5,9 @@
 
 #include "host/calendar/PaletteViewController.h"
 #include "host/calendar/PaletteWeekdayHeaderView.h"
-#include "host/core/ActivitySummaryCache.h"
 #include "platform/runtime/ScriptedAnswers.h"
 #include "tests/bundle/Answers.h"
+#include "tests/bundle/GivenSummaries.h"
 #include "tests/bundle/Members.h"
 #include "tests/bundle/StartedBundle.h"
 #include "tests/platform/EnvironmentScope.h"
@@ -40,17 +40,14 @@ class PaletteTest : public testing::Test {
     return made;
   }
 
-  static void giveMove(std::int64_t dayIndex, double move) {
-    const auto summary = make<ActivitySummary>();
-    summary->setFractions(move, 0, 0);
-    host::ActivitySummaryCache::sharedInstance()->setSummaryForCacheIndex(summary, dayIndex);
-  }
+  void giveMove(std::int64_t dayIndex, double move) { summaries_.give(dayIndex, move, 0, 0); }
 
   static std::string moveOf(int percent) {
     return "Calories burned, " + std::to_string(percent) + "%, Exercise minutes, 0%, Stand hours, 0%";
   }
 
   const EnvironmentScope environment_{at(now)};
+  GivenSummaries summaries_;
 };
 
 TEST_F(PaletteTest, TellsTheWeekThatHoldsTheShownDate) {
@@ -65,9 +62,7 @@ TEST_F(PaletteTest, TellsTheWeekThatHoldsTheShownDate) {
     const Ref<Array> labels = messages::accessibilityElements(shown);
     for (std::size_t column = 0; column < 7; ++column)
       ASSERT_EQ(valueOf(labels->at(column)), moveOf(static_cast<int>(11 * column))) << dayIndex;
-    for (int column = 0; column < 7; ++column)
-      host::ActivitySummaryCache::sharedInstance()->setSummaryForCacheIndex(
-          nullptr, dayIndex - daysSinceMonday + column);
+    for (int column = 0; column < 7; ++column) GivenSummaries::take(dayIndex - daysSinceMonday + column);
   }
 }
 
@@ -123,7 +118,6 @@ TEST_F(PaletteTest, FillsItsValuesAnewOnlyAfterASetUp) {
   giveMove(20522, 0.75);
   messages::accessibilityElements(shown);
   EXPECT_EQ(valueOf(tuesday), moveOf(75)) << "one missing value renews all";
-  host::ActivitySummaryCache::sharedInstance()->setSummaryForCacheIndex(nullptr, 20522);
 }
 
 TEST_F(PaletteTest, KeepsItsDateWhenTheHostCannotShowAnother) {
@@ -136,7 +130,6 @@ TEST_F(PaletteTest, KeepsItsDateWhenTheHostCannotShowAnother) {
   EXPECT_THROW(highlight(shown, date(now)), std::runtime_error);
   load(shown);
   EXPECT_EQ(valueOf(messages::accessibilityElements(shown)->at(1)), "No data");
-  host::ActivitySummaryCache::sharedInstance()->setSummaryForCacheIndex(nullptr, 20522);
 }
 
 TEST_F(PaletteTest, TakesWhatIsNoDateForToday) {
@@ -148,7 +141,6 @@ TEST_F(PaletteTest, TakesWhatIsNoDateForToday) {
   highlight(shown, date(now - 70 * day));
   highlight(shown, nullptr);
   EXPECT_EQ(valueOf(messages::accessibilityElements(shown)->at(1)), moveOf(25));
-  host::ActivitySummaryCache::sharedInstance()->setSummaryForCacheIndex(nullptr, 20522);
 }
 
 TEST_F(PaletteTest, EndsWithItsDateButNotWithItsLabels) {

@@ -8,10 +8,10 @@
 #include "host/calendar/ActivityTappableDay.h"
 #include "host/calendar/MonthWeekView.h"
 #include "host/calendar/QSCalendarDayCell.h"
-#include "host/core/ActivitySummaryCache.h"
 #include "platform/runtime/Number.h"
 #include "platform/runtime/ScriptedAnswers.h"
 #include "tests/bundle/Answers.h"
+#include "tests/bundle/GivenSummaries.h"
 #include "tests/bundle/Members.h"
 #include "tests/bundle/StartedBundle.h"
 #include "tests/platform/EnvironmentScope.h"
@@ -116,14 +116,13 @@ TEST_F(WeekRowTest, ADayBecomesTodayAtItsMidnight) {
 
 TEST_F(WeekRowTest, AFutureDayHasNoDataYet) {
   const auto layer = dayAt(now + day);
-  const auto summary = make<ActivitySummary>();
-  summary->setFractions(1, 1, 1);
-  host::ActivitySummaryCache::sharedInstance()->setSummaryForCacheIndex(summary, 20523);
+  GivenSummaries summaries;
+  summaries.give(20523, 1, 1, 1);
   setMember(*layer, "_hasWorkout", number(true));
   EXPECT_EQ(valueOf(layer), "No data");
   const EnvironmentScope tomorrow(Environment{.now = now + day});
   EXPECT_EQ(valueOf(layer), "Worked out, All goals completed");
-  host::ActivitySummaryCache::sharedInstance()->setSummaryForCacheIndex(nullptr, 20523);
+  GivenSummaries::take(20523);
   EXPECT_EQ(valueOf(layer), "Worked out");
 }
 

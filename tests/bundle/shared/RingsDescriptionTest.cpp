@@ -10,7 +10,9 @@
 #include "platform/health/HealthStore.h"
 #include "platform/runtime/Message.h"
 #include "platform/runtime/ScriptedAnswers.h"
+#include "tests/bundle/GivenSummaries.h"
 #include "tests/bundle/StartedBundle.h"
+#include "tests/contract/OwnProcess.h"
 #include "tests/platform/EnvironmentScope.h"
 
 // What a scene cannot show of the rings: fractions that no file can write, what is asked when, and hosts that
@@ -60,15 +62,11 @@ TEST_F(RingsDescriptionTest, CountsWhatIsNoFractionAsNothing) {
 
 class WheelchairTest : public RingsDescriptionTest {
  protected:
-  void SetUp() override {
-    if (wheelchairQueries() != 0) GTEST_SKIP() << "the first question has been asked in this process";
-    RingsDescriptionTest::SetUp();
-  }
-
   const EnvironmentScope environment_{Environment{}};
 };
 
 TEST_F(WheelchairTest, IsAskedFirstWhenTheScreenReaderRunsAndThenInTheBackground) {
+  if (ranInOwnProcess()) return;
   setEnvironment(environmentWith(false, WheelchairUse::yes));
   EXPECT_EQ(standWord(), "stand");
   EXPECT_EQ(wheelchairQueries(), 0u) << "nobody listens";
@@ -89,6 +87,7 @@ TEST_F(WheelchairTest, IsAskedFirstWhenTheScreenReaderRunsAndThenInTheBackground
 }
 
 TEST_F(WheelchairTest, KeepsWhatItKnowsWhenTheStoreFails) {
+  if (ranInOwnProcess()) return;
   setEnvironment(environmentWith(true, WheelchairUse::error));
   EXPECT_EQ(standWord(), "stand");
   setEnvironment(environmentWith(true, WheelchairUse::yes));
@@ -124,14 +123,12 @@ class DayRingsTest : public RingsDescriptionTest {
   static std::int64_t dayIndex(const Ref<Date>& day) {
     return exported<std::int64_t(const Ref<Date>&)>("CHCacheIndexForDate")(day);
   }
-  static Ref<ActivitySummary> summary(double move, double exercise, double stand) {
-    const auto made = make<ActivitySummary>();
-    made->setFractions(move, exercise, stand);
-    host::ActivitySummaryCache::sharedInstance()->setSummaryForCacheIndex(made, dayIndex(day_));
-    return made;
+  Ref<ActivitySummary> summary(double move, double exercise, double stand) {
+    return summaries_.give(dayIndex(day_), move, exercise, stand);
   }
 
   static inline const Ref<Date> day_ = date(-86400.0 * 10);
+  GivenSummaries summaries_;
 };
 
 TEST_F(DayRingsTest, AreThoseOfTheLocalDayOnBothSidesOfTheEpoch) {
@@ -161,17 +158,13 @@ TEST_F(DayRingsTest, SayNothingOfADayThatHasNone) {
 
 TEST_F(DayRingsTest, AreNotOfTheFirstDayWhenThereIsNoDate) {
   const EnvironmentScope utc(Environment{.timeZone = "UTC"});
-  const auto made = make<ActivitySummary>();
-  made->setFractions(1, 1, 1);
-  host::ActivitySummaryCache::sharedInstance()->setSummaryForCacheIndex(made, 0);
+  summaries_.give(0, 1, 1, 1);
   EXPECT_EQ(textOf(rings(date(0))), "All goals completed");
   EXPECT_EQ(rings(nullptr), nullptr);
 }
 
 TEST_F(DayRingsTest, AbsorbWhatTheHostRaises) {
-  if (testing::UnitTest::GetInstance()->test_to_run_count() > 1) {
-    GTEST_SKIP() << "the host's one cache goes on raising";
-  }
+  if (ranInOwnProcess()) return;
   const ScriptedAnswer raise = [](auto) -> Ref<Object> { throw std::runtime_error("no activity"); };
   const Ref<ActivitySummary> day = summary(0.5, 0.5, 0.5);
   setScriptedAnswer(*day,
