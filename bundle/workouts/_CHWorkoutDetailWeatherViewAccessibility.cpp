@@ -24,7 +24,8 @@ class CHWorkoutDetailWeatherViewAccessibility : public SafeCategory {
   Ref<Array> accessibilityElements() {
     if (const Ref<Object> cached = self._accessibilityValueForKey(StorageKeyChildren.get()))
       return cast<Array>(cached);
-    const Ref<Object> button = self.safeValueForKey("_twcButton"_key);
+    Ref<Object> button = self.safeValueForKey("_twcButton"_key);
+    if (button.get() == &self) button = nullptr;  // the list would keep its keeper
     const Ref<Array> elements = axArrayByIgnoringNilElementsWithCount(2, {summaryWithout(button), button});
     self._accessibilitySetRetainedValueForKey(elements, StorageKeyChildren.get());
     return elements;
