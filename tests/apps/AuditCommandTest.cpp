@@ -94,7 +94,7 @@ std::string screenWith(const std::string& parts) {
          parts + "]}}";
 }
 
-class AuditCommand : public ProgramTest {
+class AuditCommandTest : public ProgramTest {
  protected:
   Json findings(const std::string& arguments, const std::string& screen, int code) const {
     const Outcome outcome = run("audit - --json " + arguments, screen);
@@ -103,7 +103,7 @@ class AuditCommand : public ProgramTest {
   }
 };
 
-TEST_F(AuditCommand, FindsTheFaultOfEachRuleAndNoOther) {
+TEST_F(AuditCommandTest, FindsTheFaultOfEachRuleAndNoOther) {
   for (const FaultyScreen& faulty : faultyScreens) {
     const bool isWarning = std::set<std::string>{"other-words", "long-line"}.contains(faulty.rule);
     const Json found = findings("", screenWith(faulty.parts), isWarning ? 0 : 1);
@@ -114,7 +114,7 @@ TEST_F(AuditCommand, FindsTheFaultOfEachRuleAndNoOther) {
   }
 }
 
-TEST_F(AuditCommand, FallsShortForErrorsAlone) {
+TEST_F(AuditCommandTest, FallsShortForErrorsAlone) {
   EXPECT_EQ(run("audit -", screenWith(faultyScreens[0].parts)).code, 1);
   EXPECT_EQ(run("audit -", screenWith(faultyScreens[1].parts)).code, 0);
   EXPECT_EQ(run("audit - --without unspoken-text", screenWith(faultyScreens[0].parts)).code, 0);
@@ -122,7 +122,7 @@ TEST_F(AuditCommand, FallsShortForErrorsAlone) {
   EXPECT_EQ(run("audit").code, 2);
 }
 
-TEST_F(AuditCommand, TellsForeignTextsFromNamesAndSharedWords) {
+TEST_F(AuditCommandTest, TellsForeignTextsFromNamesAndSharedWords) {
   const std::string screen = screenWith(
       R"({"class": "Label", "set": {"frame": {"rect": [0, 0, 90, 20]}, "text": "Log out"}},
          {"class": "Label", "set": {"frame": {"rect": [0, 30, 90, 20]}, "text": "Ada"}},
@@ -134,7 +134,7 @@ TEST_F(AuditCommand, TellsForeignTextsFromNamesAndSharedWords) {
   EXPECT_TRUE(findings("", screen, 0).empty());
 }
 
-TEST_F(AuditCommand, ReadsRowsInTheDirectionOfTheLanguage) {
+TEST_F(AuditCommandTest, ReadsRowsInTheDirectionOfTheLanguage) {
   const std::string row = screenWith(
       R"({"class": "View", "set": {"frame": {"rect": [0, 0, 300, 100]},
                                    "accessibilityElements": [{"ref": "left"}, {"ref": "right"}]}, "subviews": [

@@ -9,7 +9,7 @@ namespace {
 
 using Json = nlohmann::ordered_json;
 
-class CommandFaults : public ProgramTest {
+class CommandFaultsTest : public ProgramTest {
  protected:
   // The run fails with exactly this line after the program's name, and prints nothing.
   void expectRefusal(const std::string& arguments, const std::string& input, const std::string& line) const {
@@ -27,7 +27,7 @@ std::string scene(const std::string& members) {
 const std::string oneNote = scene(R"("title": "Notes", "screen": {"class": "View", "subviews": [
     {"class": "Label", "id": "note", "set": {"frame": {"rect": [0, 0, 50, 20]}, "text": "Note"}}]})");
 
-TEST_F(CommandFaults, TellWhatIsWrongWhereAndWhatWasExpected) {
+TEST_F(CommandFaultsTest, TellWhatIsWrongWhereAndWhatWasExpected) {
   expectRefusal(
       "speak -", "{\"format\":\n 1,,}",
       "-: syntax error while parsing object key - unexpected ',', at line 2, column 4, expected string "
@@ -54,7 +54,7 @@ TEST_F(CommandFaults, TellWhatIsWrongWhereAndWhatWasExpected) {
                 "-: no object \"nobody\", at --of, expected an id of the scene");
 }
 
-TEST_F(CommandFaults, AStepThatCannotBeTakenSpoilsTheWholeAnswer) {
+TEST_F(CommandFaultsTest, AStepThatCannotBeTakenSpoilsTheWholeAnswer) {
   expectRefusal(
       "ask -", scene(R"("objects": [{"class": "View", "id": "v"}], "steps": [
                     {"ask": "subviews", "of": "v", "as": "s"}, {"ask": "text", "of": "s.4"}])"),
@@ -62,7 +62,7 @@ TEST_F(CommandFaults, AStepThatCannotBeTakenSpoilsTheWholeAnswer) {
 }
 
 // Without a screen there is nothing to speak, and yet something to ask and to describe.
-TEST_F(CommandFaults, OnlySomeCommandsNeedAScreen) {
+TEST_F(CommandFaultsTest, OnlySomeCommandsNeedAScreen) {
   for (const char* command : {"speak -", "tree -", "ask - --at 1,1", "ask - --activate x"}) {
     expectRefusal(command, scene(""), "-: no screen, at /screen, expected an object to present");
   }
@@ -71,7 +71,7 @@ TEST_F(CommandFaults, OnlySomeCommandsNeedAScreen) {
   EXPECT_EQ(run("check -", scene("")).code, 0);
 }
 
-TEST_F(CommandFaults, BadUseIsToldBeforeAnyFileIsRead) {
+TEST_F(CommandFaultsTest, BadUseIsToldBeforeAnyFileIsRead) {
   for (const char* arguments :
        {"speak - -", "tree - --json", "speak - --locale", "import", "import - --json", "ask - --at x,y",
         "ask - --at 1,2,3", "ask - --activate a --at 1,1", "--loud"}) {
@@ -90,7 +90,7 @@ TEST_F(CommandFaults, BadUseIsToldBeforeAnyFileIsRead) {
 }
 
 // What the host does wrong is told beside the result, and does not take it away.
-TEST_F(CommandFaults, AHostThatRaisesIsToldOfAndSpeaksOn) {
+TEST_F(CommandFaultsTest, AHostThatRaisesIsToldOfAndSpeaksOn) {
   const Outcome outcome = run("speak -", scene(R"("title": "T", "screen": {"class": "View",
       "answers": {"layoutSubviews": {"raises": "no room"}}, "subviews": [
         {"class": "Label", "set": {"text": "a"}, "answers": {"accessibilityHint": {"raises": "no hint"}}}]})"));
@@ -102,7 +102,7 @@ TEST_F(CommandFaults, AHostThatRaisesIsToldOfAndSpeaksOn) {
 }
 
 // Neither one object that raises wherever it is asked nor objects without end keep the others from speaking.
-TEST_F(CommandFaults, WhatTheHostDoesWrongNeverEndsACommand) {
+TEST_F(CommandFaultsTest, WhatTheHostDoesWrongNeverEndsACommand) {
   const std::string raising = scene(R"("title": "T", "screen": {"class": "View",
       "set": {"frame": {"rect": [0, 0, 90, 90]}}, "subviews": [
         {"class": "Label", "set": {"text": "a", "frame": {"rect": [0, 0, 90, 40]}}},
@@ -131,7 +131,7 @@ TEST_F(CommandFaults, WhatTheHostDoesWrongNeverEndsACommand) {
 }
 
 // Files come from strangers: what they hold is shown and never obeyed, on one line each and not without end.
-TEST_F(CommandFaults, TextsOfAFileDoNotReachTheTerminalAsOrders) {
+TEST_F(CommandFaultsTest, TextsOfAFileDoNotReachTheTerminalAsOrders) {
   expectRefusal(
       "speak -", scene(R"("screen": {"class": "a\u001b[2J\n\u202eb"})"),
       "-: unknown class \"a\\u001b[2J\\u000a\\u202eb\", at /screen/class, expected a class of the host or "
@@ -151,7 +151,7 @@ TEST_F(CommandFaults, TextsOfAFileDoNotReachTheTerminalAsOrders) {
             "axvelto: unknown command \"sp\\u001beak\\u000a\" (axvelto --help tells the use)\n");
 }
 
-TEST_F(CommandFaults, AnActionThatCannotBeDoneFallsShort) {
+TEST_F(CommandFaultsTest, AnActionThatCannotBeDoneFallsShort) {
   const Outcome none = run("ask - --activate note", oneNote);
   EXPECT_EQ(none.code, 1);
   EXPECT_EQ(none.err, "axvelto: -: no activate of \"note\", expected an element that can be operated\n");
@@ -163,7 +163,7 @@ TEST_F(CommandFaults, AnActionThatCannotBeDoneFallsShort) {
 }
 
 // Every part of a tree is whole: the elements of it are what is spoken, whatever the language.
-TEST_F(CommandFaults, EverySampleIsSoundJsonInEveryForm) {
+TEST_F(CommandFaultsTest, EverySampleIsSoundJsonInEveryForm) {
   for (const auto& entry : std::filesystem::directory_iterator(sample(""))) {
     if (entry.path().extension() != ".json") continue;
     const std::string name = "'" + entry.path().string() + "'";
@@ -178,7 +178,7 @@ TEST_F(CommandFaults, EverySampleIsSoundJsonInEveryForm) {
 }
 
 // The screens at risk are those of the failed checks, and the text tells the same as the JSON.
-TEST_F(CommandFaults, AReportOfTheContractAddsUp) {
+TEST_F(CommandFaultsTest, AReportOfTheContractAddsUp) {
   const std::string without =
       "check --without LoadingView --without CHFriendDetailGoalCell --without "
       "ActivitySummaryCache.activitySummaryForCacheIndex:";

@@ -8,7 +8,7 @@ namespace {
 
 using Json = nlohmann::ordered_json;
 
-class Commands : public ProgramTest {};
+class CommandsTest : public ProgramTest {};
 
 constexpr const char* oneButton = R"({
   "format": "axvelto-scene/1", "title": "Deck",
@@ -20,7 +20,7 @@ std::string firstLine(const std::string& text) {
   return text.substr(0, text.find('\n'));
 }
 
-TEST_F(Commands, RefuseBadUseWithOneLineAndNothingElse) {
+TEST_F(CommandsTest, RefuseBadUseWithOneLineAndNothingElse) {
   const std::string scene = file("deck.json", oneButton);
   const std::string cut = file("cut.tcx", "  <?xml version=\"1.0\"?><TrainingCenterDatabase><Activ");
   for (const std::string& arguments :
@@ -39,7 +39,7 @@ TEST_F(Commands, RefuseBadUseWithOneLineAndNothingElse) {
   EXPECT_NE(run("shout x").err.find("\"shout\""), std::string::npos);
 }
 
-TEST_F(Commands, SpeakAndTreeReadAFileOrStandardInput) {
+TEST_F(CommandsTest, SpeakAndTreeReadAFileOrStandardInput) {
   const Outcome spoken = run("speak -", oneButton);
   EXPECT_EQ(spoken.code, 0);
   EXPECT_EQ(spoken.out, "Screen: Deck\nPage 1 of 3, adjustable\nNote\n");
@@ -52,7 +52,7 @@ TEST_F(Commands, SpeakAndTreeReadAFileOrStandardInput) {
   EXPECT_EQ(tree["elements"][1]["frame"], Json({0, 50, 100, 20}));
 }
 
-TEST_F(Commands, ALanguageOfTheOtherDirectionTurnsTheScreenAround) {
+TEST_F(CommandsTest, ALanguageOfTheOtherDirectionTurnsTheScreenAround) {
   const std::string row = R"({"format": "axvelto-scene/1", "screen": {"class": "View",
     "set": {"frame": {"rect": [0, 0, 300, 50]}}, "subviews": [
     {"class": "Label", "set": {"frame": {"rect": [10, 0, 80, 20]}, "text": "One"}},
@@ -69,7 +69,7 @@ TEST_F(Commands, ALanguageOfTheOtherDirectionTurnsTheScreenAround) {
 }
 
 // A touch on the header counts from the left in every language.
-TEST_F(Commands, TheWeekStaysBelowItsWeekdaysInEveryLanguage) {
+TEST_F(CommandsTest, TheWeekStaysBelowItsWeekdaysInEveryLanguage) {
   for (const char* locale : {"en_US", "ar_EG"}) {
     const Json week =
         Json::parse(run("tree " + sample("week-palette.json") + " --locale " + locale).out)["elements"];
@@ -84,7 +84,7 @@ TEST_F(Commands, TheWeekStaysBelowItsWeekdaysInEveryLanguage) {
   }
 }
 
-TEST_F(Commands, AskComparesWithWhatTheSceneExpectsAndWritesItIn) {
+TEST_F(CommandsTest, AskComparesWithWhatTheSceneExpectsAndWritesItIn) {
   const std::string start = oneButton;
   const auto scene = [&](const std::string& more) { return start.substr(0, start.size() - 1) + more + "}"; };
   const std::string wrong = scene(R"(, "steps": [
@@ -105,7 +105,7 @@ TEST_F(Commands, AskComparesWithWhatTheSceneExpectsAndWritesItIn) {
   EXPECT_EQ(run("ask --accept -", start).code, 2);
 }
 
-TEST_F(Commands, AskActsOnTheScreen) {
+TEST_F(CommandsTest, AskActsOnTheScreen) {
   const Outcome next = run("ask - --increment pages", oneButton);
   EXPECT_EQ(next.code, 0);
   EXPECT_EQ(firstLine(next.out), "Page 2 of 3, adjustable");
@@ -119,7 +119,7 @@ TEST_F(Commands, AskActsOnTheScreen) {
   EXPECT_EQ(run("ask - --at 50,99", oneButton).code, 1);
 }
 
-TEST_F(Commands, GraphDescribesChartsOnAndBesideTheScreen) {
+TEST_F(CommandsTest, GraphDescribesChartsOnAndBesideTheScreen) {
   const Outcome day = run("graph " + sample("day.json") + " --json");
   EXPECT_EQ(day.code, 0);
   EXPECT_GE(Json::parse(day.out)["charts"].size(), 4u);
@@ -134,7 +134,7 @@ TEST_F(Commands, GraphDescribesChartsOnAndBesideTheScreen) {
   EXPECT_EQ(run("graph -", oneButton).code, 0);
 }
 
-TEST_F(Commands, CheckTellsWhetherTheHostHolds) {
+TEST_F(CommandsTest, CheckTellsWhetherTheHostHolds) {
   EXPECT_EQ(run("check").code, 0);
   const Outcome broken = run("check --without CHFriendDetailGoalCell --json");
   EXPECT_EQ(broken.code, 1);
@@ -154,7 +154,7 @@ TEST_F(Commands, CheckTellsWhetherTheHostHolds) {
             1);
 }
 
-TEST_F(Commands, ImportGivesTheSceneThatSpeakSpeaks) {
+TEST_F(CommandsTest, ImportGivesTheSceneThatSpeakSpeaks) {
   const std::string run1 = sample("workouts/morning-run.tcx"), ride = sample("workouts/evening-ride.gpx");
   const Outcome scene = run("import " + run1);
   EXPECT_EQ(scene.code, 0);

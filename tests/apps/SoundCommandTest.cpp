@@ -58,7 +58,7 @@ std::string bytesOf(const std::string& path) {
   return {std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>()};
 }
 
-class SoundCommand : public ProgramTest {
+class SoundCommandTest : public ProgramTest {
  protected:
   // The samples of a file that the program makes of a scene.
   Samples made(const std::string& arguments, const std::string& ending, const std::string& scene = trend) {
@@ -74,7 +74,7 @@ class SoundCommand : public ProgramTest {
   std::string said, bytes;
 };
 
-TEST_F(SoundCommand, EndsWithTheNotesOfTheChartAndRestsInItsGaps) {
+TEST_F(SoundCommandTest, EndsWithTheNotesOfTheChartAndRestsInItsGaps) {
   const Samples sound = made("sound - -o", ".wav");
   EXPECT_EQ(said, "");
   const double notes = sound.seconds() - 5 * noteSeconds;
@@ -94,7 +94,7 @@ TEST_F(SoundCommand, EndsWithTheNotesOfTheChartAndRestsInItsGaps) {
   EXPECT_NEAR(spoken.pan, 0.5, 1e-3);
 }
 
-TEST_F(SoundCommand, WritesEachFormatTheSameEveryTime) {
+TEST_F(SoundCommandTest, WritesEachFormatTheSameEveryTime) {
   const double seconds = made("sound - --of chart -o", ".wav").seconds();
   for (const char* ending : {".wav", ".flac", ".ogg", ".OPUS"}) {
     const Samples sound = made("sound - -o", ending);
@@ -109,7 +109,7 @@ TEST_F(SoundCommand, WritesEachFormatTheSameEveryTime) {
   EXPECT_NE(bytes.find("OpusHead"), std::string::npos);
 }
 
-TEST_F(SoundCommand, SpeaksTheTranscriptAndPlaysTheChartWhereItStands) {
+TEST_F(SoundCommandTest, SpeaksTheTranscriptAndPlaysTheChartWhereItStands) {
   const std::string chartAlone = "sound - -o";
   const double chart = made(chartAlone, ".wav").seconds();
   const Samples sound = made("speak - --audio", ".wav");
@@ -126,7 +126,7 @@ TEST_F(SoundCommand, SpeaksTheTranscriptAndPlaysTheChartWhereItStands) {
   EXPECT_GT(sound.at(at + 5, sound.seconds() - at - 5).level, 0.01);
 }
 
-TEST_F(SoundCommand, PlaysTheTonesAloneWhereNoVoiceReadsTheLanguage) {
+TEST_F(SoundCommandTest, PlaysTheTonesAloneWhereNoVoiceReadsTheLanguage) {
   const Samples sound = made("sound - --locale ja_JP -o", ".wav");
   EXPECT_NE(said.find("no voice reads ja_JP"), std::string::npos) << said;
   EXPECT_NEAR(sound.seconds(), 1.4 + 5 * noteSeconds, 0.001);
@@ -134,7 +134,7 @@ TEST_F(SoundCommand, PlaysTheTonesAloneWhereNoVoiceReadsTheLanguage) {
   EXPECT_EQ(made("speak - --locale ja_JP --audio", ".wav").at(0, 0.4).pitch, sound.at(0, 0.4).pitch);
 }
 
-TEST_F(SoundCommand, RefusesWhatItCannotMake) {
+TEST_F(SoundCommandTest, RefusesWhatItCannotMake) {
   const std::string path = file("kept.wav", "before");
   const auto expect = [&](const std::string& arguments, const char* scene, int code, const char* what) {
     const Outcome outcome = run(arguments, scene);

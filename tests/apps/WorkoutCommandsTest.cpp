@@ -10,7 +10,7 @@ using Json = nlohmann::ordered_json;
 using reader::testing::gzipped;
 using reader::testing::zipped;
 
-class WorkoutCommands : public ProgramTest {
+class WorkoutCommandsTest : public ProgramTest {
  protected:
   std::string sampleText(const std::string& name) const {
     std::ifstream in(sample("workouts/" + name), std::ios::binary);
@@ -27,7 +27,7 @@ std::string gpx(const std::string& day, const std::string& offset = "Z") {
          "</time></trkpt></trkseg></trk></gpx>";
 }
 
-TEST_F(WorkoutCommands, OpenPackedFilesAsTheyOpenThemUnpacked) {
+TEST_F(WorkoutCommandsTest, OpenPackedFilesAsTheyOpenThemUnpacked) {
   const std::string spoken = run("speak -", run1).out;
   EXPECT_NE(spoken.find("Running"), std::string::npos);
   EXPECT_EQ(run("speak -", gzipped(run1)).out, spoken);
@@ -40,7 +40,7 @@ TEST_F(WorkoutCommands, OpenPackedFilesAsTheyOpenThemUnpacked) {
             "axvelto: -/run.tcx: there is no workout 3, at --workout, expected 1 to 2\n");
 }
 
-TEST_F(WorkoutCommands, NameWhatAFileIsThatTheyCannotOpen) {
+TEST_F(WorkoutCommandsTest, NameWhatAFileIsThatTheyCannotOpen) {
   const auto errorOf = [&](const std::string& command, const std::string& input = "") {
     const Outcome outcome = run(command, input);
     EXPECT_EQ(outcome.code, 2) << command;
@@ -62,7 +62,7 @@ TEST_F(WorkoutCommands, NameWhatAFileIsThatTheyCannotOpen) {
   }
 }
 
-TEST_F(WorkoutCommands, ImportAFolderAndGoOnBehindWhatCannotBeRead) {
+TEST_F(WorkoutCommandsTest, ImportAFolderAndGoOnBehindWhatCannotBeRead) {
   const std::string top = file("folder-of-workouts", "");
   std::filesystem::remove(top);
   std::filesystem::create_directories(top + "/2026");
@@ -104,7 +104,7 @@ TEST_F(WorkoutCommands, ImportAFolderAndGoOnBehindWhatCannotBeRead) {
   EXPECT_EQ(run("import " + note + " " + note).code, 2) << "there is nothing to print";
 }
 
-TEST_F(WorkoutCommands, TellTimesByTheClockThatIsAskedFor) {
+TEST_F(WorkoutCommandsTest, TellTimesByTheClockThatIsAskedFor) {
   const std::string evening = gpx("2026-03-08", "-05:00");
   EXPECT_NE(run("speak -", evening).out.find("March 8, 2026 at 9:44"), std::string::npos);
   for (const char* command : {"speak -", "tree -", "graph -", "ask -", "page -", "audit -"}) {
@@ -116,7 +116,7 @@ TEST_F(WorkoutCommands, TellTimesByTheClockThatIsAskedFor) {
   EXPECT_EQ(run("speak - --time-zone Mars/Olympus", evening).code, 2);
 }
 
-TEST_F(WorkoutCommands, ReadADamagedFileWhenAsked) {
+TEST_F(WorkoutCommandsTest, ReadADamagedFileWhenAsked) {
   const std::string cut = run1.substr(0, run1.size() / 2);
   EXPECT_EQ(run("speak -", cut).code, 2);
   const Outcome outcome = run("speak - --partial", cut);

@@ -139,7 +139,7 @@ std::vector<Overridden> allOverrides() {
   return rows;
 }
 
-TEST(ChangedSignature, IsLeftToTheHostInEveryRow) {
+TEST(ChangedSignatureTest, IsLeftToTheHostInEveryRow) {
   if (ranInOwnProcess()) return;
   const std::vector<Overridden> rows = allOverrides();
   ASSERT_GT(rows.size(), 200u);
@@ -150,7 +150,7 @@ TEST(ChangedSignature, IsLeftToTheHostInEveryRow) {
   }
 }
 
-TEST(ChangedSignature, OfAllMethodsAtOnceLeavesTheScreensStanding) {
+TEST(ChangedSignatureTest, OfAllMethodsAtOnceLeavesTheScreensStanding) {
   if (ranInOwnProcess()) return;
   const std::vector<Overridden> rows = allOverrides();
   EXPECT_EQ(inChild([&rows] {

@@ -101,7 +101,7 @@ std::string contractTable(const std::vector<ContractCheck>& rows) {
 
 }  // namespace
 
-TEST(ContractRows, AHealthyHostHoldsThemAll) {
+TEST(ContractRowsTest, AHealthyHostHoldsThemAll) {
   const std::vector<ContractCheck> rows = rowsOfHealthyHost();
   std::ifstream table(tour::samplesFolder().parent_path() / "tests/contract/checks.txt");
   const std::string expected{std::istreambuf_iterator<char>(table), {}};
@@ -117,9 +117,9 @@ TEST(ContractRows, AHealthyHostHoldsThemAll) {
 
 // In shares, so that they can run side by side.
 constexpr std::size_t shares = 4;
-class ContractRow : public testing::TestWithParam<std::size_t> {};
+class ContractRowTest : public testing::TestWithParam<std::size_t> {};
 
-TEST_P(ContractRow, IsOneThatTheAppLivesWithout) {
+TEST_P(ContractRowTest, IsOneThatTheAppLivesWithout) {
   if (ranInOwnProcess()) return;
   std::vector<ContractCheck> rows;
   // The rows are read in a child, so that this process stays without a started bundle.
@@ -152,6 +152,6 @@ TEST_P(ContractRow, IsOneThatTheAppLivesWithout) {
   }
 }
 
-INSTANTIATE_TEST_SUITE_P(Shares, ContractRow, testing::Range<std::size_t>(0, shares));
+INSTANTIATE_TEST_SUITE_P(Shares, ContractRowTest, testing::Range<std::size_t>(0, shares));
 
 }  // namespace ax

@@ -16,7 +16,7 @@ double at(const char* iso) {
 
 }  // namespace
 
-TEST(CalendarMath, startsDaysAtTheirFirstInstant) {
+TEST(CalendarMathTest, StartsDaysAtTheirFirstInstant) {
   const struct {
     const char* zone;
     const char* instant;
@@ -48,7 +48,7 @@ TEST(CalendarMath, startsDaysAtTheirFirstInstant) {
   }
 }
 
-TEST(CalendarMath, splitsTimesIntoLocalFields) {
+TEST(CalendarMathTest, SplitsTimesIntoLocalFields) {
   const RegionScope scope("en_US", "Asia/Kathmandu");
   const CalendarFields fields = calendarFields(at("2024-02-29T18:14:59.75Z"));
   EXPECT_EQ(std::vector({fields.year, fields.month, fields.day, fields.hour, fields.minute, fields.second}),
@@ -61,7 +61,7 @@ TEST(CalendarMath, splitsTimesIntoLocalFields) {
   EXPECT_EQ(calendarFields(-86400 * 4).weekday, 1);
 }
 
-TEST(CalendarMath, knowsOffsetsOnBothSidesOfAChange) {
+TEST(CalendarMathTest, KnowsOffsetsOnBothSidesOfAChange) {
   const RegionScope scope("en_US", "Europe/Berlin");
   const double change = at("2026-03-29T01:00:00Z");
   EXPECT_EQ(zoneOffset(change - 0.001), 3600);
@@ -75,7 +75,7 @@ TEST(CalendarMath, knowsOffsetsOnBothSidesOfAChange) {
 
 // Walks back and forth over more changes of clocks than are remembered, and compares with day
 // starts taken one step at a time.
-TEST(CalendarMath, agreesWithItselfOverManyYears) {
+TEST(CalendarMathTest, AgreesWithItselfOverManyYears) {
   const RegionScope scope("en_US", "America/Havana");
   const double first = at("1990-01-01T12:00:00");
   for (int i = 0; i < 12000; ++i) {
@@ -88,7 +88,7 @@ TEST(CalendarMath, agreesWithItselfOverManyYears) {
   }
 }
 
-TEST(CalendarMath, standsTimesThatAreNone) {
+TEST(CalendarMathTest, StandsTimesThatAreNone) {
   const RegionScope scope("en_US", "America/New_York");
   for (const double time : {std::nan(""), HUGE_VAL, -HUGE_VAL, 1e300}) {
     EXPECT_TRUE(std::isfinite(startOfDay(time)));
@@ -97,7 +97,7 @@ TEST(CalendarMath, standsTimesThatAreNone) {
   }
 }
 
-TEST(IsoTime, readsLocalTimesAndOffsets) {
+TEST(IsoTimeTest, ReadsLocalTimesAndOffsets) {
   const RegionScope scope("en_US", "America/New_York");
   EXPECT_EQ(timeFromIso("2026-03-07T12:00:00"), 1772902800.0);
   EXPECT_EQ(timeFromIso("2026-03-07T12:00:00"), timeFromIso("2026-03-07T17:00:00Z"));
@@ -118,7 +118,7 @@ TEST(IsoTime, readsLocalTimesAndOffsets) {
   EXPECT_EQ(isoWithOffset(at("2026-03-08")), "2026-03-08T01:00:00-04:00");
 }
 
-TEST(IsoTime, refusesEverythingElse) {
+TEST(IsoTimeTest, RefusesEverythingElse) {
   for (const char* text : {"",
                            "2026",
                            "2026-02-30",

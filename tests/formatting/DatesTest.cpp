@@ -12,7 +12,7 @@ namespace ax::formatting {
 
 constexpr double kInfinity = std::numeric_limits<double>::infinity();
 
-TEST(Dates, orderFieldsAsTheRegionDoes) {
+TEST(DatesTest, OrderFieldsAsTheRegionDoes) {
   const struct {
     const char* locale;
     const char* weekday;
@@ -33,7 +33,7 @@ TEST(Dates, orderFieldsAsTheRegionDoes) {
   }
 }
 
-TEST(Dates, areWrittenToBeSpoken) {
+TEST(DatesTest, AreWrittenToBeSpoken) {
   const double first = *timeFromIso("2026-03-01T09:05:00Z");
   const RegionScope scope("fr_FR");
   EXPECT_EQ(dateString(first, "dMMMM"), "1er mars");
@@ -45,7 +45,7 @@ TEST(Dates, areWrittenToBeSpoken) {
   EXPECT_EQ(dateString(first, "MMyyyy"), "03/2026");
 }
 
-TEST(Dates, belongToTheZoneAndTheGregorianCalendar) {
+TEST(DatesTest, BelongToTheZoneAndTheGregorianCalendar) {
   const double time = *timeFromIso("2026-03-08T02:00:00Z");
   const RegionScope newYork("en_US", "America/New_York");
   EXPECT_EQ(dateString(time, "EEEE"), "Saturday");
@@ -55,7 +55,7 @@ TEST(Dates, belongToTheZoneAndTheGregorianCalendar) {
   EXPECT_NE(dateString(time, "yyyy").find("2026"), std::string::npos);
 }
 
-TEST(Dates, haveFourStyles) {
+TEST(DatesTest, HaveFourStyles) {
   const RegionScope scope("en_US");
   const double time = *timeFromIso("2026-03-08");
   EXPECT_EQ(dateStyleString(time, DateStyle::shortStyle), "3/8/26");
@@ -69,14 +69,14 @@ TEST(Dates, haveFourStyles) {
   EXPECT_EQ(dateStyleString(*timeFromIso("2026-03-01"), DateStyle::mediumStyle), "1er mars 2026");
 }
 
-TEST(Dates, withoutATimeAreEmpty) {
+TEST(DatesTest, WithoutATimeAreEmpty) {
   EXPECT_EQ(dateString(kInfinity, "EEEE"), "");
   EXPECT_EQ(dateString(std::numeric_limits<double>::quiet_NaN(), "EEEE"), "");
   EXPECT_EQ(dateString(0, ""), "");
   EXPECT_EQ(dateIntervalString(0, kInfinity, "ha"), "");
 }
 
-TEST(Dates, readMonthNumbersAndNothingElse) {
+TEST(DatesTest, ReadMonthNumbersAndNothingElse) {
   for (const char* locale : {"en_US", "ar_EG", "ja_JP"}) {
     const RegionScope scope(locale, "America/New_York");
     EXPECT_EQ(parseDate("3", "MM"), timeFromIso("2000-03-01T12:00:00")) << locale;
@@ -88,13 +88,13 @@ TEST(Dates, readMonthNumbersAndNothingElse) {
   }
 }
 
-TEST(Dates, readMonthsWhoseFirstMidnightWasSkipped) {
+TEST(DatesTest, ReadMonthsWhoseFirstMidnightWasSkipped) {
   const RegionScope scope("en_US", "Asia/Damascus");
   ASSERT_TRUE(parseDate("04", "MM"));
   EXPECT_EQ(dateString(*parseDate("04", "MM"), "MMMM"), "April");
 }
 
-TEST(Dates, readWholeDates) {
+TEST(DatesTest, ReadWholeDates) {
   const RegionScope scope("en_US", "Europe/Berlin");
   EXPECT_EQ(parseDate("2026-03-29", "yyyy-MM-dd"), timeFromIso("2026-03-29T12:00:00"));
   EXPECT_EQ(parseDate("2026-02-30", "yyyy-MM-dd"), std::nullopt);
@@ -102,7 +102,7 @@ TEST(Dates, readWholeDates) {
   EXPECT_EQ(parseDate("March 50", "MMMM yy"), timeFromIso("1950-03-01T12:00:00"));
 }
 
-TEST(Dates, nameTheWeekdays) {
+TEST(DatesTest, NameTheWeekdays) {
   const RegionScope scope("en_US");
   ASSERT_EQ(weekdaySymbols().size(), 7u);
   EXPECT_EQ(weekdaySymbols().front(), "Sunday");
@@ -113,7 +113,7 @@ TEST(Dates, nameTheWeekdays) {
   EXPECT_EQ(weekdaySymbols().back(), "samedi");
 }
 
-TEST(DateIntervals, sayOnceWhatBothEndsShare) {
+TEST(DateIntervalsTest, SayOnceWhatBothEndsShare) {
   const RegionScope scope("en_US", "America/New_York");
   const auto span = [](const char* start, const char* end, const char* dateTemplate) {
     return plainSpaces(dateIntervalString(*timeFromIso(start), *timeFromIso(end), dateTemplate));
@@ -129,7 +129,7 @@ TEST(DateIntervals, sayOnceWhatBothEndsShare) {
   EXPECT_EQ(span("2026-03-07T05:00:00", "2026-03-07T02:00:00", "ha"), "5 – 2 AM");
 }
 
-TEST(DateIntervals, followTheLanguage) {
+TEST(DateIntervalsTest, FollowTheLanguage) {
   const struct {
     const char* locale;
     const char* hours;
@@ -146,7 +146,7 @@ TEST(DateIntervals, followTheLanguage) {
   }
 }
 
-TEST(DateIntervals, nameTheDaysThatTheirHoursLieIn) {
+TEST(DateIntervalsTest, NameTheDaysThatTheirHoursLieIn) {
   const RegionScope scope("en_US");
   const double evening = *timeFromIso("2026-12-30T22:00:00Z");
   EXPECT_EQ(plainSpaces(dateIntervalString(evening, evening + 10800, "h:mma")),

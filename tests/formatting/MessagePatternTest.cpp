@@ -11,7 +11,7 @@ namespace ax::formatting {
 
 using std::string;
 
-TEST(MessagePattern, fillsPlacesInAnyOrder) {
+TEST(MessagePatternTest, FillsPlacesInAnyOrder) {
   const RegionScope scope("en_US");
   EXPECT_EQ(formatMessage("{1} before {0}, {1}", {string("a"), string("b")}), "b before a, b");
   EXPECT_EQ(formatMessage("{0} of {1}", {std::int64_t{1500}, 2.5}), "1,500 of 2.5");
@@ -23,7 +23,7 @@ TEST(MessagePattern, fillsPlacesInAnyOrder) {
   EXPECT_EQ(formatMessage("{10}", std::vector<MessageArgument>(11, string("x"))), "x");
 }
 
-TEST(MessagePattern, choosesPluralForms) {
+TEST(MessagePatternTest, ChoosesPluralForms) {
   const char* const days = "{0, plural, one {# day} other {# days}} for {1}";
   const RegionScope english("en_US");
   EXPECT_EQ(formatMessage(days, {std::int64_t{0}, string("Ada")}), "0 days for Ada");
@@ -37,7 +37,7 @@ TEST(MessagePattern, choosesPluralForms) {
   EXPECT_EQ(all, "zotfmx");
 }
 
-TEST(MessagePattern, agreesWithANumberThatWasWrittenBefore) {
+TEST(MessagePatternTest, AgreesWithANumberThatWasWrittenBefore) {
   const char* const days = "{0, plural, one {# day} other {# days}}";
   const RegionScope english("en_US");
   EXPECT_EQ(formatMessage(days, {decimalNumber(1.004, 2)}), "1 day") << "by what is seen";
@@ -52,7 +52,7 @@ TEST(MessagePattern, agreesWithANumberThatWasWrittenBefore) {
       "1,5 jour");
 }
 
-TEST(MessagePattern, agreesWithTheNumberThatATextEndsWith) {
+TEST(MessagePatternTest, AgreesWithTheNumberThatATextEndsWith) {
   const RegionScope scope("ar_EG");
   const char* const days = "{0, plural, zero {z#} one {o} two {t} few {f#} many {m#} other {x#}}";
   const auto fraction = [](std::int64_t amount, std::int64_t goal) {
@@ -65,14 +65,14 @@ TEST(MessagePattern, agreesWithTheNumberThatATextEndsWith) {
             "x٣!");
 }
 
-TEST(MessagePattern, saysASignEvenWhereTheNumberIsAWord) {
+TEST(MessagePatternTest, SaysASignEvenWhereTheNumberIsAWord) {
   const char* const days = "{0, plural, zero {#} one {يوم} two {يومان} few {# أيام} many {#} other {#}}";
   const RegionScope scope("ar_EG");
   EXPECT_EQ(formatMessage(days, {std::int64_t{-1}}), "ناقص يوم");
   EXPECT_EQ(formatMessage(days, {decimalNumber(-3, 2)}), "\u061C\u2212٣ أيام");
 }
 
-TEST(MessagePattern, putsNumbersInTheirUnit) {
+TEST(MessagePatternTest, PutsNumbersInTheirUnit) {
   const RegionScope scope("en_US");
   const char* const pattern = "{0, unit, 1} a day";
   const CountedNoun mile{"miles", "{0, plural, one {# mile} other {# miles}}"};
@@ -85,7 +85,7 @@ TEST(MessagePattern, putsNumbersInTheirUnit) {
   EXPECT_EQ(formatMessage("in {1}", {1.5, mile}), "in miles");
 }
 
-TEST(MessagePattern, saysNoValueWithoutANoun) {
+TEST(MessagePatternTest, SaysNoValueWithoutANoun) {
   const double none = std::nan("");
   const char* const days = "for {0, plural, one {# day} other {# days}}";
   const CountedNoun mile{"miles", "{0, plural, one {# mile} other {# miles}}"};
@@ -99,7 +99,7 @@ TEST(MessagePattern, saysNoValueWithoutANoun) {
   EXPECT_EQ(formatMessage("{0, number, percent}", {none}), "no value");
 }
 
-TEST(MessagePattern, keepsTheNounBehindATextThatIsReady) {
+TEST(MessagePatternTest, KeepsTheNounBehindATextThatIsReady) {
   using Arguments = std::vector<MessageArgument>;
   const CountedNoun mile{"miles", "{0, plural, one {# mile} other {# miles}}"};
   const RegionScope scope("en_US");
@@ -113,7 +113,7 @@ TEST(MessagePattern, keepsTheNounBehindATextThatIsReady) {
   EXPECT_FALSE(line.isNoValue) << "the text is not lost in what stands around it";
 }
 
-TEST(MessagePattern, givesNothingForWhatCannotBeFilled) {
+TEST(MessagePatternTest, GivesNothingForWhatCannotBeFilled) {
   const RegionScope scope("en_US");
   for (const char* pattern : {"{0", "{0} }{", "{name}", "{0, plural, one {# day}}", "{0, nonsense}", "{}",
                               "{0, select, 1 {day} other {days}}", "{0, plural, =1 {a day} other {days}}",
@@ -131,7 +131,7 @@ string tableFolder() {
 
 }  // namespace
 
-TEST(StringTable, fallsBackFromLocaleToLanguageToRoot) {
+TEST(StringTableTest, FallsBackFromLocaleToLanguageToRoot) {
   const StringTable table(tableFolder());
   const RegionScope austria("de_AT");
   ASSERT_NE(table.find("greeting.hello"), nullptr);
@@ -143,7 +143,7 @@ TEST(StringTable, fallsBackFromLocaleToLanguageToRoot) {
   EXPECT_EQ(*table.find("greeting.hello"), "Hello, {0}");
 }
 
-TEST(StringTable, answersTheSameTextForAKeyAndLanguage) {
+TEST(StringTableTest, AnswersTheSameTextForAKeyAndLanguage) {
   const StringTable table(tableFolder());
   const RegionScope german("de_DE");
   const string* const text = table.find("greeting.hello");
@@ -155,7 +155,7 @@ TEST(StringTable, answersTheSameTextForAKeyAndLanguage) {
   EXPECT_EQ(table.find("greeting.hello", "de-DE"), text);
 }
 
-TEST(StringTable, listsTheKeysOfEachFile) {
+TEST(StringTableTest, ListsTheKeysOfEachFile) {
   const StringTable table(tableFolder());
   EXPECT_EQ(table.keys(), (std::vector<string>{"empty", "greeting.hello", "only.english", "zebra"}));
   EXPECT_EQ(table.keys("de"), std::vector<string>{"greeting.hello"});
@@ -163,7 +163,7 @@ TEST(StringTable, listsTheKeysOfEachFile) {
   EXPECT_TRUE(table.keys("../Table/de").empty());
 }
 
-TEST(StringTable, withoutAFolderIsEmpty) {
+TEST(StringTableTest, WithoutAFolderIsEmpty) {
   const StringTable table("/nonexistent");
   EXPECT_EQ(table.find("greeting.hello"), nullptr);
   EXPECT_TRUE(table.keys().empty());

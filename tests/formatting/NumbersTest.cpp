@@ -10,7 +10,7 @@
 
 namespace ax::formatting {
 
-TEST(Numbers, roundHalfAwayFromZeroWithoutTrailingZeros) {
+TEST(NumbersTest, RoundHalfAwayFromZeroWithoutTrailingZeros) {
   const RegionScope scope("en_US");
   const struct {
     double value;
@@ -23,7 +23,7 @@ TEST(Numbers, roundHalfAwayFromZeroWithoutTrailingZeros) {
   for (const auto& c : cases) EXPECT_EQ(decimalString(c.value, c.digits), c.text) << c.value;
 }
 
-TEST(Numbers, percentagesAreWhole) {
+TEST(NumbersTest, PercentagesAreWhole) {
   const RegionScope scope("en_US");
   EXPECT_EQ(percentString(1.0), "100%");
   EXPECT_EQ(percentString(1.5f), "150%");
@@ -32,7 +32,7 @@ TEST(Numbers, percentagesAreWhole) {
   EXPECT_EQ(percentString(12.345), "1,235%");
 }
 
-TEST(Numbers, followTheRegion) {
+TEST(NumbersTest, FollowTheRegion) {
   const struct {
     const char* locale;
     const char* decimal;
@@ -54,7 +54,7 @@ TEST(Numbers, followTheRegion) {
   }
 }
 
-TEST(Numbers, standTheEndsOfTheirTypes) {
+TEST(NumbersTest, StandTheEndsOfTheirTypes) {
   const RegionScope scope("en_US");
   const double infinity = std::numeric_limits<double>::infinity();
   EXPECT_EQ(decimalString(std::nan(""), 2), "no value");
@@ -63,7 +63,7 @@ TEST(Numbers, standTheEndsOfTheirTypes) {
   EXPECT_EQ(integerString(std::numeric_limits<std::int64_t>::min()), "−9,223,372,036,854,775,808");
 }
 
-TEST(Numbers, parseOnlyWholeTexts) {
+TEST(NumbersTest, ParseOnlyWholeTexts) {
   const RegionScope english("en_US");
   EXPECT_EQ(parseNumber("1,234.5"), 1234.5);
   EXPECT_EQ(parseNumber("-3"), -3.0);
@@ -80,7 +80,7 @@ TEST(Numbers, parseOnlyWholeTexts) {
   EXPECT_EQ(parseNumber("12"), 12.0);
 }
 
-TEST(Durations, leaveOutZeroPartsAndCarry) {
+TEST(DurationsTest, LeaveOutZeroPartsAndCarry) {
   const RegionScope scope("en_US");
   const struct {
     double seconds;
@@ -101,7 +101,7 @@ TEST(Durations, leaveOutZeroPartsAndCarry) {
   EXPECT_FALSE(spokenDuration(1e300).empty());
 }
 
-TEST(Durations, countInHours) {
+TEST(DurationsTest, CountInHours) {
   const RegionScope scope("en_US");
   EXPECT_EQ(spokenHours(0), "0 minutes");
   EXPECT_EQ(spokenHours(0.5), "30 minutes");
@@ -114,7 +114,7 @@ TEST(Durations, countInHours) {
   EXPECT_FALSE(spokenHours(-1e300).empty());
 }
 
-TEST(Durations, takeThePluralFormsOfTheLanguage) {
+TEST(DurationsTest, TakeThePluralFormsOfTheLanguage) {
   const struct {
     const char* locale;
     const char* one;

@@ -13,14 +13,14 @@
 
 namespace ax::formatting {
 
-TEST(Region, replacesWhatIsNotKnown) {
+TEST(RegionTest, ReplacesWhatIsNotKnown) {
   RegionScope scope("xx_YY", "Mars/Olympus");
   EXPECT_EQ(currentRegion(), (Region{"en_US", "UTC"}));
   setCurrentRegion({"", "Asia/Kathmandu"});
   EXPECT_EQ(currentRegion(), (Region{"en_US", "Asia/Kathmandu"}));
 }
 
-TEST(Region, tellsLanguageDirectionAndSeparator) {
+TEST(RegionTest, TellsLanguageDirectionAndSeparator) {
   const RegionScope english("en_US");
   EXPECT_EQ(currentLanguage(), "en");
   EXPECT_FALSE(currentLanguageIsRightToLeft());
@@ -33,7 +33,7 @@ TEST(Region, tellsLanguageDirectionAndSeparator) {
   EXPECT_EQ(listSeparator(), "、");
 }
 
-TEST(Region, knowsLocalesAndZones) {
+TEST(RegionTest, KnowsLocalesAndZones) {
   for (const char* locale : {"en", "de_AT", "pt-BR", "ar_EG", "zh_Hant_TW"})
     EXPECT_TRUE(isKnownLocale(locale));
   for (const char* locale : {"", "english", "xx", "../de", "C"})
@@ -69,7 +69,7 @@ void useEveryFormatter() {
 
 }  // namespace
 
-TEST(FormatterCache, makesNothingWhenWarmAndIsEmptiedByTheRegion) {
+TEST(FormatterCacheTest, MakesNothingWhenWarmAndIsEmptiedByTheRegion) {
   const RegionScope scope("fr_FR", "Europe/Berlin");
   EXPECT_EQ(formattersHeld(), 0u);
   useEveryFormatter();
@@ -82,7 +82,7 @@ TEST(FormatterCache, makesNothingWhenWarmAndIsEmptiedByTheRegion) {
   EXPECT_GT(formattersMade(), made);
 }
 
-TEST(FormatterCache, staysBoundedAndKeepsWhatIsUsed) {
+TEST(FormatterCacheTest, StaysBoundedAndKeepsWhatIsUsed) {
   const RegionScope scope("en_US");
   formatMessage("kept {0}", {std::int64_t{0}});
   for (std::int64_t i = 0; i < 1000; ++i) {

@@ -92,7 +92,7 @@ int compareYears(const char* zone, int first, int last) {
 
 }  // namespace
 
-TEST(ZoneRules, areTheSystemsAtEveryChange) {
+TEST(ZoneRulesTest, AreTheSystemsAtEveryChange) {
   int changes = 0;
   for (const char* zone : kZones) {
     changes += compareYears(zone, 2019, 2030);
@@ -102,7 +102,7 @@ TEST(ZoneRules, areTheSystemsAtEveryChange) {
 }
 
 // Where the files list no more changes, one rule holds for ever.
-TEST(ZoneRules, areTheSystemsAfterTheLastChangeListed) {
+TEST(ZoneRulesTest, AreTheSystemsAfterTheLastChangeListed) {
   for (const char* zone : kZones) {
     compareYears(zone, 2036, 2039);
     compareYears(zone, 2086, 2089);
@@ -110,7 +110,7 @@ TEST(ZoneRules, areTheSystemsAfterTheLastChangeListed) {
   }
 }
 
-TEST(ZoneRules, tellDaylightSavingAlsoWhereWinterIsMarked) {
+TEST(ZoneRulesTest, TellDaylightSavingAlsoWhereWinterIsMarked) {
   const struct {
     const char* zone;
     const char* summer;
@@ -136,7 +136,7 @@ TEST(ZoneRules, tellDaylightSavingAlsoWhereWinterIsMarked) {
 }
 
 // ICU knows names that the system has no file for.
-TEST(ZoneRules, areIcusWhereTheSystemHasNone) {
+TEST(ZoneRulesTest, AreIcusWhereTheSystemHasNone) {
   EXPECT_EQ(systemZoneRules("PST"), nullptr);
   EXPECT_EQ(systemZoneRules("GMT+5:30"), nullptr);
   EXPECT_EQ(systemZoneRules("localtime"), nullptr);
@@ -147,7 +147,7 @@ TEST(ZoneRules, areIcusWhereTheSystemHasNone) {
   EXPECT_EQ(dateString(0, "HHmm"), "5:30");
 }
 
-TEST(ZoneRules, readDatesByThem) {
+TEST(ZoneRulesTest, ReadDatesByThem) {
   const RegionScope scope("en_GB", "Africa/Cairo");
   EXPECT_EQ(parseDate("2026-04-24 00:30", "yyyy-MM-dd HH:mm"), std::nullopt) << "it never comes";
   EXPECT_EQ(isoWithOffset(parseDate("2026-10-29 23:30", "yyyy-MM-dd HH:mm").value()),

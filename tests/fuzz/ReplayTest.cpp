@@ -16,7 +16,7 @@ struct Target {
 constexpr Target targets[] = {{"dates", fuzzDates},   {"messages", fuzzMessages}, {"pace", fuzzPace},
                               {"scenes", fuzzScenes}, {"times", fuzzTimes},       {"workouts", fuzzWorkouts}};
 
-TEST(Fuzz, EveryInputOfAFaultIsTakenWithoutOne) {
+TEST(FuzzTest, EveryInputOfAFaultIsTakenWithoutOne) {
   for (const Target& target : targets) {
     const auto folder = tour::samplesFolder() / "../tests/fuzz/found" / target.name;
     std::size_t inputs = 0;

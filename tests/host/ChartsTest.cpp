@@ -88,7 +88,7 @@ TEST_F(HeartRateChartTest, HasNothingToDrawWithoutAStretchOfTime) {
   EXPECT_TRUE(chart_->subviews().empty());
 }
 
-TEST(Layout, PlacesWhatStandsNowhere) {
+TEST(LayoutTest, PlacesWhatStandsNowhere) {
   const auto parent = make<View>();
   parent->setFrame({10, 10, 100, 90});
   const auto placed = make<View>();
@@ -111,7 +111,7 @@ TEST(Layout, PlacesWhatStandsNowhere) {
   EXPECT_EQ(columnOf(*parent, 2, 4), (Rect{50, 0, 25, 90}));
 }
 
-TEST(Layout, SharesAWidthEvenly) {
+TEST(LayoutTest, SharesAWidthEvenly) {
   EXPECT_TRUE(evenStops(0, 100)->isEmpty());
   const Ref<Array> stops = evenStops(8, 100);
   ASSERT_EQ(stops->count(), 8u);

@@ -19,7 +19,7 @@ Ref<Friend> friendWith(const char* key, bool value) {
 
 }  // namespace
 
-TEST(FriendRow, IsUsedAgainWithoutTracesOfTheFormerFriend) {
+TEST(HostFriendRowTest, IsUsedAgainWithoutTracesOfTheFormerFriend) {
   const auto row = make<CHFriendListTableViewCell>();
   row->setFriendSnapshotFormattingManagerAnimated(friendWith("isCompeting", true), make<FriendSnapshot>(),
                                                   nullptr, false);
@@ -36,7 +36,7 @@ TEST(FriendRow, IsUsedAgainWithoutTracesOfTheFormerFriend) {
   EXPECT_EQ(row->contentView()->subviews().size(), 3u);
 }
 
-TEST(InboxBadge, IsHiddenWhileNothingWaits) {
+TEST(HostInboxBadgeTest, IsHiddenWhileNothingWaits) {
   const auto badge = make<CHFriendInboxBadgeView>();
   for (const auto& [text, hidden] : {std::pair{"", true}, {"3", false}, {"0", true}, {"10", false}}) {
     badge->setBadgeText(string(text));
@@ -44,7 +44,7 @@ TEST(InboxBadge, IsHiddenWhileNothingWaits) {
   }
 }
 
-TEST(UnitManager, AnswersAUnitOfEnergyInAnyCase) {
+TEST(UnitManagerTest, AnswersAUnitOfEnergyInAnyCase) {
   const Environment before = environment();
   for (const auto& [chosen, unit] :
        {std::pair{"kcal", "kcal"}, {"kJ", "kJ"}, {"km", "kcal"}, {"", "kcal"}, {"calories", "kcal"}}) {

@@ -48,7 +48,7 @@ Class& textCategory() {
                       {overrides<&TextAccessibility::accessibilityLabel>(messages::accessibilityLabel)}});
 }
 
-TEST(AccessibilityProperties, answerInTheirOrderOfPrecedence) {
+TEST(AccessibilityPropertiesTest, AnswerInTheirOrderOfPrecedence) {
   const Ref<Badge> badge = make<Badge>();
   badge->setText(string("default"));
   EXPECT_EQ(accessibilityLabel(badge)->text(), "default");
@@ -69,7 +69,7 @@ TEST(AccessibilityProperties, answerInTheirOrderOfPrecedence) {
   EXPECT_EQ(accessibilityLabel(badge)->text(), "badge changed") << "what is taken away uncovers the default";
 }
 
-TEST(AccessibilityProperties, haveADefaultForEachClass) {
+TEST(AccessibilityPropertiesTest, HaveADefaultForEachClass) {
   const Ref<Label> label = make<Label>();
   EXPECT_FALSE(isAccessibilityElement(label));
   label->setText(string(""));
@@ -98,7 +98,7 @@ TEST(AccessibilityProperties, haveADefaultForEachClass) {
   EXPECT_FALSE(isAccessibilityElement(image));
 }
 
-TEST(AccessibilityProperties, speakTheSpokenFormOfATextFirst) {
+TEST(AccessibilityPropertiesTest, SpeakTheSpokenFormOfATextFirst) {
   const Ref<Label> label = make<Label>();
   label->setText(string("5 km"));
   setAccessibilityLabel(label->text(), string("5 kilometers"));
@@ -114,7 +114,7 @@ TEST(AccessibilityProperties, speakTheSpokenFormOfATextFirst) {
   EXPECT_EQ(accessibilityLabel(label), label->text());
 }
 
-TEST(AccessibilityProperties, askTheTextsOverride) {
+TEST(AccessibilityPropertiesTest, AskTheTextsOverride) {
   if (ranInOwnProcess()) return;
   const Ref<Label> label = make<Label>();
   label->setText(string("plain"));
@@ -122,7 +122,7 @@ TEST(AccessibilityProperties, askTheTextsOverride) {
   EXPECT_EQ(accessibilityLabel(label)->text(), "override") << "also of a text that carries nothing";
 }
 
-TEST(AccessibilityProperties, letABlockReplaceItselfWhileItRuns) {
+TEST(AccessibilityPropertiesTest, LetABlockReplaceItselfWhileItRuns) {
   const Ref<View> view = make<View>();
   View* raw = view.get();
   const std::string kept(64, 'x');
@@ -136,7 +136,7 @@ TEST(AccessibilityProperties, letABlockReplaceItselfWhileItRuns) {
   _accessibilityAddTrait(nullptr, TraitButton);
 }
 
-TEST(AccessibilityProperties, doNotKeepTheContainer) {
+TEST(AccessibilityPropertiesTest, DoNotKeepTheContainer) {
   Ref<View> container = make<View>();
   const Weak<View> weak = container;
   const Ref<AccessibilityElement> element = AccessibilityElement::initWithAccessibilityContainer(container);
@@ -159,7 +159,7 @@ class Receiving : public Object {
   Ref<Object> last;
 };
 
-TEST(Control, tellsItsTarget) {
+TEST(ControlTest, TellsItsTarget) {
   Ref<Receiving> target = make<Receiving>();
   const Ref<Button> button = make<Button>();
   EXPECT_FALSE(button->sendAction());
@@ -179,7 +179,7 @@ TEST(Control, tellsItsTarget) {
   EXPECT_EQ(button->target(), nullptr);
 }
 
-TEST(PageControl, staysWithinItsPages) {
+TEST(PageControlPagesTest, StaysWithinItsPages) {
   const RegionScope scope("en_US");
   const Ref<PageControl> pages = make<PageControl>();
   EXPECT_EQ(pages->currentPage(), 0);
@@ -198,7 +198,7 @@ TEST(PageControl, staysWithinItsPages) {
   EXPECT_EQ(pages->currentPage(), 0);
 }
 
-TEST(TableViewCell, showsItsPartsInItsContent) {
+TEST(TableViewCellTest, ShowsItsPartsInItsContent) {
   const Ref<TableViewCell> cell = make<TableViewCell>();
   const Ref<Label> text = make<Label>();
   const Ref<Label> elsewhere = make<Label>();
@@ -213,7 +213,7 @@ TEST(TableViewCell, showsItsPartsInItsContent) {
   EXPECT_EQ(cell->safeValueForKey("imageView"_key), nullptr);
 }
 
-TEST(View, hasOneSuperviewAndNoCircle) {
+TEST(ViewTest, HasOneSuperviewAndNoCircle) {
   const Ref<View> first = make<View>();
   const Ref<View> second = make<View>();
   Ref<View> child = make<View>();
@@ -230,7 +230,7 @@ TEST(View, hasOneSuperviewAndNoCircle) {
   EXPECT_FALSE(weak);
 }
 
-TEST(Layer, hasOneSuperlayerAndNoCircle) {
+TEST(LayerTest, HasOneSuperlayerAndNoCircle) {
   const Ref<Layer> first = make<Layer>();
   const Ref<Layer> second = make<Layer>();
   first->addSublayer(make<Layer>());
@@ -241,7 +241,7 @@ TEST(Layer, hasOneSuperlayerAndNoCircle) {
   EXPECT_EQ(second->superlayer(), nullptr);
 }
 
-TEST(NavigationItem, countsFromTheRight) {
+TEST(NavigationItemTest, CountsFromTheRight) {
   const Ref<NavigationItem> item = make<ViewController>()->navigationItem();
   EXPECT_EQ(item->rightBarButtonItem(), nullptr);
   const Ref<BarButtonItem> share = make<BarButtonItem>();

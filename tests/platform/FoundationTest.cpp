@@ -28,7 +28,7 @@ constexpr double infinity = std::numeric_limits<double>::infinity();
 constexpr std::int64_t least = std::numeric_limits<std::int64_t>::min();
 constexpr std::int64_t most = std::numeric_limits<std::int64_t>::max();
 
-TEST(String, splitsAtEveryNewline) {
+TEST(StringTest, SplitsAtEveryNewline) {
   const auto pieces = [](std::string text) {
     std::vector<std::string> result;
     for (const Ref<String>& piece : componentsSeparatedByNewlines(*string(text)))
@@ -44,7 +44,7 @@ TEST(String, splitsAtEveryNewline) {
   EXPECT_EQ(pieces("\u2022 \u20AC"), Pieces{"\u2022 \u20AC"}) << "characters that share bytes with newlines";
 }
 
-TEST(String, losesEveryOccurrenceOfAPart) {
+TEST(StringTest, LosesEveryOccurrenceOfAPart) {
   EXPECT_EQ(stringByRemoving(string("a-b-c-"), "-")->text(), "abc");
   EXPECT_EQ(stringByRemoving(string("aab"), "ab")->text(), "a");
   const Ref<String> text = string("abc");
@@ -52,7 +52,7 @@ TEST(String, losesEveryOccurrenceOfAPart) {
   EXPECT_EQ(stringByRemoving(nullptr, "x"), nullptr);
 }
 
-TEST(String, carriesASpokenForm) {
+TEST(StringTest, CarriesASpokenForm) {
   const Ref<String> text = string("km");
   EXPECT_EQ(messages::accessibilityLabel(text), nullptr);
   messages::setAccessibilityLabel(text, string("kilometers"));
@@ -63,7 +63,7 @@ TEST(String, carriesASpokenForm) {
   EXPECT_EQ(messages::accessibilityLabel(styled)->text(), "per kilometer");
 }
 
-TEST(AttributedText, cutsRangesToTheText) {
+TEST(AttributedTextTest, CutsRangesToTheText) {
   const Ref<AccessibilityAttributedString> text =
       AccessibilityAttributedString::initWithString(string("12:34"));
   text->setAttributeForKey(number(true), DurationTimeMMSS);
@@ -77,7 +77,7 @@ TEST(AttributedText, cutsRangesToTheText) {
   EXPECT_TRUE(AccessibilityAttributedString::initWithString(nullptr)->isEmpty());
 }
 
-TEST(Number, convertsToTheNearestThereIs) {
+TEST(NumberTest, ConvertsToTheNearestThereIs) {
   const struct {
     Ref<Number> number;
     std::int32_t asInt;
@@ -104,7 +104,7 @@ TEST(Number, convertsToTheNearestThereIs) {
   }
 }
 
-TEST(Number, equalsWhatCountsTheSame) {
+TEST(NumberTest, EqualsWhatCountsTheSame) {
   EXPECT_TRUE(number(1)->isEqual(*number(1.0)));
   EXPECT_TRUE(number(true)->isEqual(*number(1u)));
   EXPECT_FALSE(number(most)->isEqual(*number(most - 1))) << "two numbers that are one as doubles";
@@ -114,7 +114,7 @@ TEST(Number, equalsWhatCountsTheSame) {
   EXPECT_EQ(number(false)->description(), "0");
 }
 
-TEST(Boxing, givesBackWhatWentIn) {
+TEST(BoxingTest, GivesBackWhatWentIn) {
   EXPECT_EQ(unbox<std::uint64_t>(box(~std::uint64_t(0))), ~std::uint64_t(0));
   EXPECT_EQ(unbox<std::int64_t>(box(least)), least);
   EXPECT_EQ(unbox<Insets>(box(Insets{1, 2, 3, 4})), (Insets{1, 2, 3, 4}));
@@ -124,7 +124,7 @@ TEST(Boxing, givesBackWhatWentIn) {
   EXPECT_EQ(unbox<double>(nullptr), 0);
 }
 
-TEST(DateInterval, holdsBothItsEnds) {
+TEST(DateIntervalTest, HoldsBothItsEnds) {
   const Ref<DateInterval> interval = make<DateInterval>(date(3600), date(7200));
   const DateInterval& hour = *interval;
   EXPECT_TRUE(hour.containsDate(*date(3600)));
@@ -136,7 +136,7 @@ TEST(DateInterval, holdsBothItsEnds) {
   EXPECT_TRUE(hour.isEqual(*make<DateInterval>(date(3600), date(7200))));
 }
 
-TEST(PercentText, isTheFormattersOfEveryFraction) {
+TEST(PercentTextTest, IsTheFormattersOfEveryFraction) {
   for (const char* locale : {"en_US", "ar_EG", "fr_FR"}) {
     const RegionScope scope(locale);
     for (int round = 0; round < 2; ++round) {
@@ -152,7 +152,7 @@ TEST(PercentText, isTheFormattersOfEveryFraction) {
   }
 }
 
-TEST(Array, leavesOutNil) {
+TEST(ArrayTest, LeavesOutNil) {
   const Ref<String> x = string("x");
   EXPECT_TRUE(array({nullptr, x, nullptr})->isEqual(*array({x})));
   EXPECT_EQ(make<MutableArray>(Array::Items{nullptr, x})->description(), "(x)");
@@ -183,7 +183,7 @@ struct Returning {
   std::atomic<int>* count;
 };
 
-TEST(BackgroundQueue, endsWhatATaskCapturedOutsideItsLock) {
+TEST(BackgroundQueueTest, EndsWhatATaskCapturedOutsideItsLock) {
   std::atomic<int> ended = 0;
   auto captured = std::make_shared<Returning>(ended);
   dispatchInBackground([kept = std::move(captured)] {});
@@ -191,7 +191,7 @@ TEST(BackgroundQueue, endsWhatATaskCapturedOutsideItsLock) {
   EXPECT_EQ(ended, 1);
 }
 
-TEST(BackgroundQueue, outlivesTasksThatRaise) {
+TEST(BackgroundQueueTest, OutlivesTasksThatRaise) {
   const std::size_t before = failedBackgroundTasks();
   std::atomic<int> done = 0;
   testing::internal::CaptureStderr();

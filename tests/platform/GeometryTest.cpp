@@ -25,7 +25,7 @@ Ref<T> at(Rect frame, const Ref<View>& superview = nullptr) {
   return view;
 }
 
-TEST(Geometry, convertsThroughScrolledContent) {
+TEST(GeometryTest, ConvertsThroughScrolledContent) {
   const Ref<View> window = at<View>({10, 20, 400, 800});
   const Ref<ScrollView> scroll = at<ScrollView>({5, 5, 300, 300}, window);
   const Ref<View> row = at<View>({0, 500, 300, 50}, scroll);
@@ -41,7 +41,7 @@ TEST(Geometry, convertsThroughScrolledContent) {
   EXPECT_EQ(accessibilityFrame(row), (Rect{1, 2, 3, 4}));
 }
 
-TEST(Geometry, convertsThroughLayers) {
+TEST(GeometryTest, ConvertsThroughLayers) {
   const Ref<View> view = at<View>({100, 100, 50, 50});
   const Ref<Layer> week = make<Layer>();
   const Ref<Layer> day = make<Layer>();
@@ -54,7 +54,7 @@ TEST(Geometry, convertsThroughLayers) {
   EXPECT_EQ(_accessibilityAncestorIsKindOf(day, &View::staticClass()), view);
 }
 
-TEST(Geometry, convertsElementsAtEachQuery) {
+TEST(GeometryTest, ConvertsElementsAtEachQuery) {
   const Ref<ScrollView> scroll = at<ScrollView>({10, 10, 100, 100});
   const Ref<AccessibilityElement> bar = AccessibilityElement::initWithAccessibilityContainer(scroll);
   bar->setAccessibilityFrameInContainerSpace({0, 50, 10, 10});
@@ -70,7 +70,7 @@ TEST(Geometry, convertsElementsAtEachQuery) {
   EXPECT_EQ(accessibilityFrame(bar), (Rect{10, -40, 2, 2}));
 }
 
-TEST(Geometry, unitesElements) {
+TEST(GeometryTest, UnitesElements) {
   const Ref<View> left = at<View>({10, 10, 10, 10});
   const Ref<View> right = at<View>({50, 0, 5, 5});
   EXPECT_EQ(frameForElements(array({left, right})), (Rect{10, 0, 45, 20}));
@@ -91,7 +91,7 @@ std::vector<int> order(const Array& sorted, const Array& all) {
   return result;
 }
 
-TEST(ReadingOrder, goesByRowsThenInTheDirectionOfTheLanguage) {
+TEST(ReadingOrderTest, GoesByRowsThenInTheDirectionOfTheLanguage) {
   // Two rows that are not quite straight, and one below them; what overlaps by half stands in one row.
   const Ref<Array> all =
       array({at<View>({100, 4, 50, 20}), at<View>({0, 30, 200, 20}), at<View>({0, 0, 50, 20}),
@@ -105,7 +105,7 @@ TEST(ReadingOrder, goesByRowsThenInTheDirectionOfTheLanguage) {
   EXPECT_GT(accessibilityCompareGeometry(*all->at(2), *all->at(0)), 0);
 }
 
-TEST(ReadingOrder, standsStrangeFrames) {
+TEST(ReadingOrderTest, StandsStrangeFrames) {
   const double nan = std::nan("");
   const Ref<Array> all = array({at<View>({nan, nan, nan, nan}), at<View>({5, 0, 0, 0}),
                                 at<View>({5, 0, 0, 0}), at<View>({0, 0, 0, 0}), at<View>({0, nan, 10, 10})});
@@ -115,7 +115,7 @@ TEST(ReadingOrder, standsStrangeFrames) {
       << "the same place keeps its order";
 }
 
-TEST(Visibility, followsTheAncestors) {
+TEST(VisibilityTest, FollowsTheAncestors) {
   const Ref<View> window = at<View>({});
   const Ref<View> panel = at<View>({}, window);
   const Ref<Label> label = at<Label>({}, panel);
@@ -135,7 +135,7 @@ TEST(Visibility, followsTheAncestors) {
   EXPECT_FALSE(_accessibilityViewIsVisible(nullptr));
 }
 
-TEST(ElementTree, findsRelatives) {
+TEST(ElementTreeTest, FindsRelatives) {
   const Ref<View> window = at<View>({});
   const Ref<ScrollView> scroll = at<ScrollView>({}, window);
   const Ref<Label> label = at<Label>({}, scroll);
@@ -178,7 +178,7 @@ class Endless : public View {
   Ref<Object> kept_;
 };
 
-TEST(ElementTree, endsWhereTheHostDoesNot) {
+TEST(ElementTreeTest, EndsWhereTheHostDoesNot) {
   const auto all = [](Object&) { return true; };
   const auto none = [](Object&) { return false; };
   const Ref<Endless> endless = make<Endless>();

@@ -107,7 +107,7 @@ void expectBothCategoriesTakePart() {
   EXPECT_EQ(countDown(base, 3), 403) << "the host's own recursion passes the override each time, no more";
 }
 
-TEST(Grafting, resolvesSuperWhenTheSuperclassComesFirst) {
+TEST(GraftingTest, ResolvesSuperWhenTheSuperclassComesFirst) {
   Class& base = Base<1>::staticClass();
   Class& derived = Derived<1>::staticClass();
   graftCategory(category<onBase>(1, base.name()), base);
@@ -115,7 +115,7 @@ TEST(Grafting, resolvesSuperWhenTheSuperclassComesFirst) {
   expectBothCategoriesTakePart<1>();
 }
 
-TEST(Grafting, resolvesSuperWhenTheSubclassComesFirst) {
+TEST(GraftingTest, ResolvesSuperWhenTheSubclassComesFirst) {
   Class& base = Base<2>::staticClass();
   Class& derived = Derived<2>::staticClass();
   const Ref<Derived<2>> asked = make<Derived<2>>();
@@ -130,7 +130,7 @@ TEST(Grafting, resolvesSuperWhenTheSubclassComesFirst) {
   expectBothCategoriesTakePart<2>();
 }
 
-TEST(Grafting, stacksTwoCategoriesOnOneClass) {
+TEST(GraftingTest, StacksTwoCategoriesOnOneClass) {
   Class& base = Base<3>::staticClass();
   EXPECT_TRUE(graftCategory(category<onBase>(3, base.name()), base));
   Class& upper = category<second>(3, base.name());
@@ -143,7 +143,7 @@ TEST(Grafting, stacksTwoCategoriesOnOneClass) {
   EXPECT_EQ(classWord(Derived<3>::staticClass())->text(), "Base+B+2");
 }
 
-TEST(Grafting, leavesTheCategorysOwnMethodsBehind) {
+TEST(GraftingTest, LeavesTheCategorysOwnMethodsBehind) {
   Class& base = Base<4>::staticClass();
   graftCategory(category<onBase>(4, base.name()), base);
   EXPECT_EQ(base.safeValueForKey("safeCategoryTargetClassName"), nullptr);
@@ -155,7 +155,7 @@ TEST(Grafting, leavesTheCategorysOwnMethodsBehind) {
   EXPECT_EQ(category.superclass()->name(), "__GraftingTest+B4_super");
 }
 
-TEST(Grafting, letsOtherThreadsSendMeanwhile) {
+TEST(GraftingTest, LetsOtherThreadsSendMeanwhile) {
   Class& base = Base<6>::staticClass();
   std::atomic<bool> ends = false;
   std::atomic<int> missed = 0;
@@ -202,7 +202,7 @@ std::array<Class*, sizeof...(N)> stackedCategories(const std::string& target, st
   return {make(std::integral_constant<std::size_t, N>())...};
 }
 
-TEST(Grafting, resolvesSuperOnOtherThreadsMeanwhile) {
+TEST(GraftingTest, ResolvesSuperOnOtherThreadsMeanwhile) {
   Class& base = Base<7>::staticClass();
   const auto categories = stackedCategories(base.name(), std::make_index_sequence<8>());
   std::atomic<bool> ends = false;
@@ -261,7 +261,7 @@ void expectBaseKeepsItsTypes() {
   EXPECT_EQ(countedClassWord(Derived<N>::staticClass(), string("six")), 3) << "inherited";
 }
 
-TEST(Grafting, leavesMethodsOfAnotherTypeToTheHost) {
+TEST(GraftingTest, LeavesMethodsOfAnotherTypeToTheHost) {
   changeTypes(Base<8>::staticClass());
   Class& onBaseFirst = category<onBase>(8, Base<8>::staticClass().name());
   Class& onDerivedThen = category<onDerived>(8, Derived<8>::staticClass().name());
@@ -272,7 +272,7 @@ TEST(Grafting, leavesMethodsOfAnotherTypeToTheHost) {
   EXPECT_EQ(namesLeftBy(onDerivedThen), (std::vector<std::string>{"+graftingTestClassWord"}));
 }
 
-TEST(Grafting, leavesThemInTheOtherOrderToo) {
+TEST(GraftingTest, LeavesThemInTheOtherOrderToo) {
   changeTypes(Base<9>::staticClass());
   Class& onDerivedFirst = category<onDerived>(9, Derived<9>::staticClass().name());
   Class& onBaseThen = category<onBase>(9, Base<9>::staticClass().name());
@@ -284,7 +284,7 @@ TEST(Grafting, leavesThemInTheOtherOrderToo) {
 }
 
 // The superclass's method is what the category expects, the subclass changed it.
-TEST(Grafting, leavesToASubclassWhatItChanged) {
+TEST(GraftingTest, LeavesToASubclassWhatItChanged) {
   changeTypes(Derived<10>::staticClass());
   Class& lower = category<onDerived>(10, Derived<10>::staticClass().name());
   graftCategory(category<onBase>(10, Base<10>::staticClass().name()), Base<10>::staticClass());
@@ -301,7 +301,7 @@ class Viewed : public SafeCategory {
   Text word() { return super(ax::word) + "+V"; }
 };
 
-TEST(Grafting, showsAnObjectAsACategory) {
+TEST(GraftingTest, ShowsAnObjectAsACategory) {
   const Selector name = "GraftingTestViewed"_key;
   const Ref<Object> derived = make<Derived<5>>();
   const std::size_t before = castMismatches();
@@ -339,7 +339,7 @@ class OnRaising : public SafeCategory {
   Text word() { return ax::inherited(make<Raising>()); }
   std::int64_t countDown(std::int64_t from) { return super(ax::countDown, from) + std::stoi("no number"); }
 };
-TEST(Grafting, letsNothingOutButWhatSuperRaises) {
+TEST(GraftingTest, LetsNothingOutButWhatSuperRaises) {
   using C = OnRaising;
   Class& category = addCategory({"GraftingTestOnRaising",
                                  "GraftingTest.Raising",

@@ -16,7 +16,7 @@ namespace ax {
 
 namespace {
 
-TEST(Unit, converts) {
+TEST(UnitTest, Converts) {
   const struct {
     double value;
     const char* from;
@@ -31,7 +31,7 @@ TEST(Unit, converts) {
   }
 }
 
-TEST(Unit, measuresNothingInAnother) {
+TEST(UnitTest, MeasuresNothingInAnother) {
   const Ref<Quantity> energy = quantity(5, Unit::kilocalorieUnit());
   for (const char* other : {"min", "count", "kcal/min", "m"}) {
     EXPECT_FALSE(energy->isCompatibleWithUnit(Unit::unitFromString(other))) << other;
@@ -45,7 +45,7 @@ TEST(Unit, measuresNothingInAnother) {
       std::isnan(quantity(std::nan(""), Unit::meterUnit())->doubleValueForUnit(Unit::unitFromString("km"))));
 }
 
-TEST(Unit, isReadFromItsTextAlone) {
+TEST(UnitTest, IsReadFromItsTextAlone) {
   for (const char* text : {"", "/", "kcal/", "/min", "KCAL", "ml/kg/", "ml kg", "min "}) {
     EXPECT_EQ(Unit::unitFromString(text), nullptr) << text;
   }
@@ -58,7 +58,7 @@ TEST(Unit, isReadFromItsTextAlone) {
   EXPECT_TRUE(Unit::unitFromString("km/m")->isCompatibleWithUnit(*Unit::countUnit()));
 }
 
-TEST(Unit, agreesWithItsNumber) {
+TEST(UnitTest, AgreesWithItsNumber) {
   const struct {
     const char* locale;
     float value;
@@ -94,7 +94,7 @@ TEST(Unit, agreesWithItsNumber) {
   EXPECT_EQ(quantity(1, Unit::unitFromString("mi"))->description(), "1 mile");
 }
 
-TEST(HealthStore, answersOrFails) {
+TEST(HealthStoreTest, AnswersOrFails) {
   const Ref<HealthStore> store = make<HealthStore>();
   Environment environment;
   environment.wheelchair = WheelchairUse::yes;
@@ -109,7 +109,7 @@ TEST(HealthStore, answersOrFails) {
   setEnvironment({});
 }
 
-TEST(ActivitySummary, knowsItsDay) {
+TEST(ActivitySummaryTest, KnowsItsDay) {
   Environment environment;
   environment.timeZone = "America/New_York";
   setEnvironment(environment);

@@ -59,7 +59,7 @@ Class& folderCategory() {
                       {overrides<&FolderAccessibility::nameOf>(nameOf)}});
 }
 
-TEST(ScriptedAnswers, standBelowGraftsForOneObject) {
+TEST(ScriptedAnswersTest, StandBelowGraftsForOneObject) {
   const Ref<Folder> plain = make<Folder>();
   const Ref<Folder> scripted = make<Archive>();
   const ScriptedAnswer echo = [](std::span<const Ref<Object>> arguments) {
@@ -76,7 +76,7 @@ TEST(ScriptedAnswers, standBelowGraftsForOneObject) {
   EXPECT_EQ(nameOf(late, 8)->text(), "spoken answer 8") << "a script that comes after the graft";
 }
 
-TEST(ScriptedAnswers, convertRaiseAndReplace) {
+TEST(ScriptedAnswersTest, ConvertRaiseAndReplace) {
   const Ref<Folder> folder = make<Archive>();
   EXPECT_FALSE(setScriptedAnswer(*folder, "scriptingTestNobodyDeclared"_key, nullptr));
   EXPECT_TRUE(setScriptedAnswer(*folder, size.selector(), [](auto) { return number(4.5); }));
@@ -112,7 +112,7 @@ class Vault : public Folder {
   Ref<String> lock = string("lock");
 };
 
-TEST(Hiding, takesMembersOutOfReach) {
+TEST(HidingTest, TakesMembersOutOfReach) {
   Class& vaults = Vault::staticClass();
   const Ref<Vault> vault = make<Vault>();
   EXPECT_NE(vault->safeValueForKey("_lock"_key), nullptr);
@@ -135,7 +135,7 @@ TEST(Hiding, takesMembersOutOfReach) {
   EXPECT_EQ(vault->lock->text(), "lock");
 }
 
-TEST(Hiding, takesAClassOutOfReach) {
+TEST(HidingTest, TakesAClassOutOfReach) {
   class Attic : public Folder {
    public:
     static Class& staticClass() {

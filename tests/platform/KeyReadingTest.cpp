@@ -77,7 +77,7 @@ Class& Alarm::staticClass() {
   return result;
 }
 
-TEST(KeyReading, findsMembersAndMethodsByTheirExactName) {
+TEST(KeyReadingTest, FindsMembersAndMethodsByTheirExactName) {
   const Ref<Clock> clock = make<Alarm>();
   EXPECT_EQ(clock->safeValueForKey("_label"_key), clock->label);
   EXPECT_EQ(clock->safeValueForKey("_label"), clock->label);
@@ -91,7 +91,7 @@ TEST(KeyReading, findsMembersAndMethodsByTheirExactName) {
   EXPECT_EQ(clock->safeValueForKey(Key()), nullptr);
 }
 
-TEST(KeyReading, neverCallsWhatOnlyActsOrWantsArguments) {
+TEST(KeyReadingTest, NeverCallsWhatOnlyActsOrWantsArguments) {
   const Ref<Clock> clock = make<Clock>();
   EXPECT_EQ(clock->safeValueForKey("wind"_key), nullptr);
   EXPECT_FALSE(clock->safeBoolForKey("wind"_key));
@@ -100,7 +100,7 @@ TEST(KeyReading, neverCallsWhatOnlyActsOrWantsArguments) {
   EXPECT_EQ(clock->safeValueForKey("nameForHour"_key), nullptr);
 }
 
-TEST(KeyReading, absorbsWhatMethodsRaise) {
+TEST(KeyReadingTest, AbsorbsWhatMethodsRaise) {
   const Ref<Clock> clock = make<Clock>();
   EXPECT_EQ(clock->safeValueForKey("broken"_key), nullptr);
   EXPECT_EQ(clock->safeIntForKey("broken"_key), 0);
@@ -114,7 +114,7 @@ TEST(KeyReading, absorbsWhatMethodsRaise) {
   EXPECT_EQ(stored, 1);
 }
 
-TEST(KeyReading, boxesScalars) {
+TEST(KeyReadingTest, BoxesScalars) {
   const Ref<Clock> clock = make<Clock>();
   EXPECT_EQ(clock->safeIntForKey("_hour"_key), -7);
   EXPECT_DOUBLE_EQ(clock->safeDoubleForKey("_hour"_key), -7);
@@ -130,7 +130,7 @@ TEST(KeyReading, boxesScalars) {
   EXPECT_EQ(clock->safeDoubleForKey("_label"_key), 0) << "an object is no number";
 }
 
-TEST(KeyReading, isNilForAnotherKind) {
+TEST(KeyReadingTest, IsNilForAnotherKind) {
   const Ref<Clock> clock = make<Clock>();
   EXPECT_EQ(safeArrayForKey(clock, "_hands"_key), clock->hands);
   EXPECT_EQ(safeStringForKey(clock, "_maker"_key), clock->maker);
@@ -143,7 +143,7 @@ TEST(KeyReading, isNilForAnotherKind) {
   EXPECT_EQ(safeIntForKey(nobody, "_hour"_key), 0);
 }
 
-TEST(KeyReading, followsPaths) {
+TEST(KeyReadingTest, FollowsPaths) {
   const Ref<Clock> clock = make<Clock>();
   clock->twin = make<Alarm>();
   clock->twin->owner = clock;
@@ -155,7 +155,7 @@ TEST(KeyReading, followsPaths) {
   EXPECT_EQ(clock->twin->safeValueForKey("_owner"_key), clock) << "a weak member reads as its object";
 }
 
-TEST(KeyReading, takesTheMemberWithAnUnderscoreInAPath) {
+TEST(KeyReadingTest, TakesTheMemberWithAnUnderscoreInAPath) {
   const Ref<Clock> clock = make<Clock>();
   clock->twin = make<Alarm>();
   EXPECT_EQ(clock->safeValueForKeyPath("twin.zone")->description(), "CET");
@@ -167,7 +167,7 @@ TEST(KeyReading, takesTheMemberWithAnUnderscoreInAPath) {
 }
 
 // A literal's class is asked for before it is there, while it is, and when it is hidden.
-TEST(Classes, areFoundByNameAsTheyComeAndGo) {
+TEST(ClassesTest, AreFoundByNameAsTheyComeAndGo) {
   const auto byLiteral = [] { return safeClassFromString("KeyReadingTest.Late"_key); };
   EXPECT_EQ(byLiteral(), nullptr);
   EXPECT_EQ(safeClassFromString("KeyReadingTest.Late"), nullptr);
@@ -181,7 +181,7 @@ TEST(Classes, areFoundByNameAsTheyComeAndGo) {
   EXPECT_EQ(Class::namedEvenIfHidden("KeyReadingTest.Late"), &late);
 }
 
-TEST(KeyReading, asksClassesForTheirClassMethods) {
+TEST(KeyReadingTest, AsksClassesForTheirClassMethods) {
   Class& clocks = Clock::staticClass();
   EXPECT_EQ(clocks.safeValueForKey("sharedName"_key)->description(), "Big Clock");
   EXPECT_EQ(safeStringForKey(Alarm::staticClass(), "sharedName"_key)->text(), "Big Clock");
@@ -189,7 +189,7 @@ TEST(KeyReading, asksClassesForTheirClassMethods) {
   EXPECT_EQ(clocks.safeValueForKey("_label"_key), nullptr);
 }
 
-TEST(KeyReading, writesOnlyWhatFits) {
+TEST(KeyReadingTest, WritesOnlyWhatFits) {
   const Ref<Clock> clock = make<Clock>();
   const auto write = [&](const char* name, const Ref<Object>& value) {
     return clock->isa().instanceVariable(Selector::find(name))->write(*clock, value);
@@ -210,7 +210,7 @@ TEST(KeyReading, writesOnlyWhatFits) {
   EXPECT_FALSE(clock->runs);
 }
 
-TEST(Casts, countAndReportMismatches) {
+TEST(CastsTest, CountAndReportMismatches) {
   const std::size_t before = castMismatches();
   const Ref<Object> clock = make<Clock>();
   bool mismatch = true;

@@ -46,7 +46,7 @@ class Adder : public Object {
   Ref<Object> title_;
 };
 
-TEST(Message, callsWithTypedArguments) {
+TEST(MessageTest, CallsWithTypedArguments) {
   const Ref<Adder> adder = make<Adder>();
   EXPECT_EQ(add(adder, 40), 40);
   EXPECT_EQ(add(*adder, 2), 42);
@@ -58,7 +58,7 @@ TEST(Message, callsWithTypedArguments) {
   EXPECT_FALSE(respondsTo(*adder, kind));
 }
 
-TEST(Message, yieldsNothingWhereNothingFits) {
+TEST(MessageTest, YieldsNothingWhereNothingFits) {
   const Ref<Adder> nobody;
   EXPECT_EQ(add(nobody, 1), 0);
   EXPECT_EQ(frame(nullptr), Rect());
@@ -75,7 +75,7 @@ TEST(Message, yieldsNothingWhereNothingFits) {
   setTitle(nobody, nullptr);
 }
 
-TEST(Message, narrowsObjectsToItsOwnType) {
+TEST(MessageTest, NarrowsObjectsToItsOwnType) {
   const Ref<Adder> adder = make<Adder>();
   adder->title_ = number(3);
   EXPECT_EQ(title(adder), nullptr) << "the answer is no String";
@@ -84,13 +84,13 @@ TEST(Message, narrowsObjectsToItsOwnType) {
   EXPECT_EQ(adder->title_, nullptr) << "the argument is no String";
 }
 
-TEST(Message, letsThroughWhatMethodsRaise) {
+TEST(MessageTest, LetsThroughWhatMethodsRaise) {
   const Ref<Adder> adder = make<Adder>();
   EXPECT_THROW(raise(adder), std::runtime_error);
 }
 
 // Nobody has sent these before, and their receivers live on the threads that send.
-TEST(Message, findsItsSelectorOnTheThreadThatSendsFirst) {
+TEST(MessageTest, FindsItsSelectorOnTheThreadThatSendsFirst) {
   static const Message<std::int64_t(std::int64_t)> first{"MessageTestAdd:"};
   static const Message<Ref<String>()> unanswered{"MessageTestNeverRegistered"};
   Adder::staticClass();
@@ -110,7 +110,7 @@ TEST(Message, findsItsSelectorOnTheThreadThatSendsFirst) {
   EXPECT_EQ(wrong, 0);
 }
 
-TEST(Message, thatNobodyUsedIsOfNoMethodsType) {
+TEST(MessageTest, ThatNobodyUsedIsOfNoMethodsType) {
   const Ref<Adder> adder = make<Adder>();
   const Message<std::int64_t(std::int64_t)> calledFirst{"MessageTestAdd:"};
   const Message<std::int64_t(std::int64_t)> calledWithNothing{"MessageTestAdd:"};
@@ -120,7 +120,7 @@ TEST(Message, thatNobodyUsedIsOfNoMethodsType) {
   EXPECT_FALSE(adder->isa().readerForKey(Selector()).isReadable());
 }
 
-TEST(Message, keepsItsObjectsCounted) {
+TEST(MessageTest, KeepsItsObjectsCounted) {
   const Ref<Adder> adder = make<Adder>();
   Ref<String> text = string("counted");
   const Weak<String> weak = text;
@@ -132,7 +132,7 @@ TEST(Message, keepsItsObjectsCounted) {
   EXPECT_FALSE(weak);
 }
 
-TEST(Method, isInvokedWithBoxedArguments) {
+TEST(MethodTest, IsInvokedWithBoxedArguments) {
   const Ref<Adder> adder = make<Adder>();
   const auto invoke = [&](Selector selector, std::vector<Ref<Object>> arguments) {
     const Method& method = adder->isa().lookUp(selector);
@@ -146,7 +146,7 @@ TEST(Method, isInvokedWithBoxedArguments) {
   EXPECT_FALSE(unboxBool(invoke(ask.selector(), {nullptr}))) << "blocks cannot be boxed";
 }
 
-TEST(Method, knowsItsSignatureFromItsType) {
+TEST(MethodTest, KnowsItsSignatureFromItsType) {
   const auto codes = [](const auto& message) {
     return std::vector<std::string>(message.signature().encodings.begin(),
                                     message.signature().encodings.end());

@@ -30,7 +30,7 @@ class Counted : public Object {
   std::function<void(Counted&)> atEnd;
 };
 
-TEST(Selector, isInternedByItsWholeText) {
+TEST(SelectorTest, IsInternedByItsWholeText) {
   const Selector selector = Selector::intern("_titleLabel");
   EXPECT_EQ(selector, Selector::intern(std::string("_title") + "Label"));
   EXPECT_EQ(selector, "_titleLabel"_key);
@@ -41,7 +41,7 @@ TEST(Selector, isInternedByItsWholeText) {
   EXPECT_EQ(Selector::find("_titleLabel").name(), "_titleLabel");
 }
 
-TEST(Selector, staysWhereItIsWhenTheTableGrows) {
+TEST(SelectorTest, StaysWhereItIsWhenTheTableGrows) {
   std::vector<Selector> all;
   for (int i = 0; i < 9000; ++i) all.push_back(Selector::intern("ObjectTest.grow" + std::to_string(i)));
   for (int i = 0; i < 9000; ++i) {
@@ -49,7 +49,7 @@ TEST(Selector, staysWhereItIsWhenTheTableGrows) {
   }
 }
 
-TEST(Object, endsWithItsLastHandle) {
+TEST(ObjectTest, EndsWithItsLastHandle) {
   Ref<Counted> first = make<Counted>();
   Ref<Object> second = first;
   const Weak<Counted> weak = first;
@@ -65,7 +65,7 @@ TEST(Object, endsWithItsLastHandle) {
   EXPECT_FALSE(weak);
 }
 
-TEST(Object, isGoneForWeakHandlesBeforeItEnds) {
+TEST(ObjectTest, IsGoneForWeakHandlesBeforeItEnds) {
   Ref<Counted> object = make<Counted>();
   Weak<Counted> weak = object;
   bool wasNil = false;
@@ -78,7 +78,7 @@ TEST(Object, isGoneForWeakHandlesBeforeItEnds) {
   EXPECT_EQ(living, 0) << "a handle made while the object ends must not end it twice";
 }
 
-TEST(Object, givesNoWeakHandleToItselfWhileItEnds) {
+TEST(ObjectTest, GivesNoWeakHandleToItselfWhileItEnds) {
   Weak<Counted> kept;
   Ref<Counted> object = make<Counted>();
   object->atEnd = [&](Counted& self) { kept = Weak<Counted>(self); };
@@ -87,7 +87,7 @@ TEST(Object, givesNoWeakHandleToItselfWhileItEnds) {
   EXPECT_EQ(kept.lock(), nullptr);
 }
 
-TEST(Object, isWholeWhileItsValuesEnd) {
+TEST(ObjectTest, IsWholeWhileItsValuesEnd) {
   std::string seen;
   const auto look = [&](Counted& owner) {
     return [&seen, &owner](Counted&) {
@@ -110,7 +110,7 @@ TEST(Object, isWholeWhileItsValuesEnd) {
   EXPECT_EQ(living, 0);
 }
 
-TEST(Object, keepsValuesUntilItEnds) {
+TEST(ObjectTest, KeepsValuesUntilItEnds) {
   Ref<Counted> owner = make<Counted>();
   Ref<Counted> value = make<Counted>();
   owner->_accessibilitySetRetainedValueForKey(value, "kAXObjectTest"_key);
@@ -134,7 +134,7 @@ TEST(Object, keepsValuesUntilItEnds) {
   EXPECT_EQ(living, 0);
 }
 
-TEST(Object, storesIntoItselfWhileAValueEnds) {
+TEST(ObjectTest, StoresIntoItselfWhileAValueEnds) {
   Ref<Counted> owner = make<Counted>();
   Ref<Counted> value = make<Counted>();
   value->atEnd = [&](Counted&) { setAssociatedObject(*owner, &staticKey, string("later")); };
@@ -143,7 +143,7 @@ TEST(Object, storesIntoItselfWhileAValueEnds) {
   EXPECT_EQ(getAssociatedObject(*owner, &staticKey)->description(), "later");
 }
 
-TEST(Object, copiesWhatCanChange) {
+TEST(ObjectTest, CopiesWhatCanChange) {
   const Ref<Counted> owner = make<Counted>();
   const Ref<MutableArray> list = make<MutableArray>(Array::Items{string("one")});
   const Ref<String> text = string("text");
@@ -158,7 +158,7 @@ TEST(Object, copiesWhatCanChange) {
   EXPECT_EQ(getAssociatedObject(*owner, &staticKey), nullptr);
 }
 
-TEST(Object, isCastToItsClassesAlone) {
+TEST(ObjectTest, IsCastToItsClassesAlone) {
   const Ref<Object> text = string("text");
   EXPECT_EQ(cast<String>(text), text);
   EXPECT_EQ(cast<Array>(text), nullptr);

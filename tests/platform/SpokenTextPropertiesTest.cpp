@@ -41,7 +41,7 @@ Ref<String> somePart(Random& random, int number, std::map<std::string, std::stri
   return marked;
 }
 
-TEST(ComposedText, keepsEveryMarkOnItsOwnText) {
+TEST(ComposedTextTest, KeepsEveryMarkOnItsOwnText) {
   Random random(1);
   for (int round = 0; round < 2000; ++round) {
     const RegionScope scope(round % 2 == 0 ? "en_US" : "ja_JP");
@@ -98,7 +98,7 @@ struct SomeTree {
   std::string spoken;
 };
 
-TEST(Walk, meetsEveryViewOnceAndSpeaksWhatShows) {
+TEST(WalkTest, MeetsEveryViewOnceAndSpeaksWhatShows) {
   const RegionScope scope("en_US");
   std::size_t views = 0;
   for (unsigned seed = 0; seed < 300; ++seed) {
@@ -118,7 +118,7 @@ TEST(Walk, meetsEveryViewOnceAndSpeaksWhatShows) {
   EXPECT_GT(views, 1000u);
 }
 
-TEST(Walk, followsAListInPlaceOfTheViews) {
+TEST(WalkTest, FollowsAListInPlaceOfTheViews) {
   const RegionScope scope("en_US");
   for (unsigned seed = 0; seed < 100; ++seed) {
     SomeTree tree(seed);
@@ -133,7 +133,7 @@ TEST(Walk, followsAListInPlaceOfTheViews) {
   }
 }
 
-TEST(ScreenOrder, isAPermutationThatDependsOnThePlacesAlone) {
+TEST(ScreenOrderTest, IsAPermutationThatDependsOnThePlacesAlone) {
   Random random(5);
   for (unsigned seed = 0; seed < 300; ++seed) {
     const RegionScope scope(seed % 2 == 0 ? "en_US" : "ar_EG");
@@ -153,7 +153,7 @@ TEST(ScreenOrder, isAPermutationThatDependsOnThePlacesAlone) {
   }
 }
 
-TEST(ScreenOrder, comparesEachPairOppositely) {
+TEST(ScreenOrderTest, ComparesEachPairOppositely) {
   for (unsigned seed = 0; seed < 100; ++seed) {
     const RegionScope scope(seed % 2 == 0 ? "en_US" : "ar_EG");
     SomeTree tree(seed);
@@ -165,7 +165,7 @@ TEST(ScreenOrder, comparesEachPairOppositely) {
   }
 }
 
-TEST(ScreenOrder, mirrorsWithTheLanguage) {
+TEST(ScreenOrderTest, MirrorsWithTheLanguage) {
   Random random(9);
   for (int round = 0; round < 100; ++round) {
     Array::Items leftward;

@@ -23,7 +23,7 @@ Ref<Label> label(const char* text, const Ref<View>& superview = nullptr) {
   return made;
 }
 
-TEST(StringForVariables, dropsWhatIsMissingWithItsSeparator) {
+TEST(StringForVariablesTest, DropsWhatIsMissingWithItsSeparator) {
   const RegionScope scope("en_US");
   EXPECT_EQ(stringForVariables({string("one"), nullptr, string(""), string("two"), end})->text(), "one, two");
   EXPECT_EQ(stringForVariables({nullptr, string(""), end})->text(), "");
@@ -36,7 +36,7 @@ TEST(StringForVariables, dropsWhatIsMissingWithItsSeparator) {
   EXPECT_EQ(stringForVariables({string("a"), string("b"), end})->text(), "a、b");
 }
 
-TEST(StringForVariables, keepsAttributesInTheirPlace) {
+TEST(StringForVariablesTest, KeepsAttributesInTheirPlace) {
   const RegionScope scope("en_US");
   const auto duration = AccessibilityAttributedString::initWithString(string("12:34"));
   duration->setAttributeForKeyWithRange(number(true), DurationTimeMMSS, {0, 2});
@@ -56,7 +56,7 @@ TEST(StringForVariables, keepsAttributesInTheirPlace) {
             nullptr);
 }
 
-TEST(LabelForElements, speaksLabelsAndTexts) {
+TEST(LabelForElementsTest, SpeaksLabelsAndTexts) {
   const RegionScope scope("en_US");
   const Ref<View> silent = make<View>();
   const Ref<String> abbreviated = string("km");
@@ -80,7 +80,7 @@ class Pair : public View {
   Ref<Label> days = label("3 days");
 };
 
-TEST(LabelKeyValues, speaksTheMembersInOrder) {
+TEST(LabelKeyValuesTest, SpeaksTheMembersInOrder) {
   const RegionScope scope("en_US");
   const Ref<Pair> pair = make<Pair>();
   const auto text = [&](const char* keys) {
@@ -118,7 +118,7 @@ Ref<View> panel() {
   return all;
 }
 
-TEST(SubhierarchyText, choosesHeadersAndFocusableItems) {
+TEST(SubhierarchyTextTest, ChoosesHeadersAndFocusableItems) {
   const RegionScope scope("en_US");
   const Ref<View> all = panel();
   const auto text = [&](bool headers, bool focusable, const Ref<Array>& exclusions = nullptr) {
@@ -133,7 +133,7 @@ TEST(SubhierarchyText, choosesHeadersAndFocusableItems) {
   EXPECT_EQ(text(true, true, array({all->subviews()[1]})), "header");
 }
 
-TEST(StringForAllChildren, speaksElementsBelow) {
+TEST(StringForAllChildrenTest, SpeaksElementsBelow) {
   const RegionScope scope("en_US");
   const Ref<View> all = panel();
   EXPECT_EQ(stringForAllChildren(all)->text(), "header, button, in note");

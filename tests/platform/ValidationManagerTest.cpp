@@ -61,7 +61,7 @@ constexpr const char* screen = "Velto.ValidationTestScreen";
 constexpr const char* subScreen = "ValidationTestSubScreen";
 constexpr const char* nobody = "ValidationTestNobody";
 
-TEST(ValidationManager, checksAndTellsWhatItFound) {
+TEST(ValidationManagerTest, ChecksAndTellsWhatItFound) {
   const Ref<ValidationManager> owned = make<ValidationManager>();
   ValidationManager& m = *owned;
   EXPECT_TRUE(m.validateClass(screen));
@@ -79,7 +79,7 @@ TEST(ValidationManager, checksAndTellsWhatItFound) {
   EXPECT_EQ(m.checks().size(), 9u);
 }
 
-TEST(ValidationManager, namesWhatFails) {
+TEST(ValidationManagerTest, NamesWhatFails) {
   const Ref<ValidationManager> owned = make<ValidationManager>();
   ValidationManager& m = *owned;
   const struct {
@@ -148,7 +148,7 @@ void startWith(ValidationManager& manager, bool checks, const ValidationManager:
       nullptr, installation);
 }
 
-TEST(ValidationManager, installsInOrderWhateverIsMissing) {
+TEST(ValidationManagerTest, InstallsInOrderWhateverIsMissing) {
   registerNumbered<1>("ValidationTestOne", screen);
   registerNumbered<2>("ValidationTestTwo", nobody);
   registerNumbered<3>("ValidationTestThree", screen);
@@ -180,7 +180,7 @@ TEST(ValidationManager, installsInOrderWhateverIsMissing) {
   EXPECT_EQ(categoryScreen(View::staticClass()) + categoryScreen(*Class::named("SafeCategory")), "");
 }
 
-TEST(ValidationManager, missesTheClassOfAMember) {
+TEST(ValidationManagerTest, MissesTheClassOfAMember) {
   const Ref<ValidationManager> owned = make<ValidationManager>();
   EXPECT_TRUE(owned->validateClassHasInstanceVariableWithType(screen, "_part", "ValidationTestPart"));
   Part::staticClass().hide();
@@ -189,7 +189,7 @@ TEST(ValidationManager, missesTheClassOfAMember) {
 }
 
 // Checks are off: what installation left out is told all the same.
-TEST(ValidationManager, tellsWhatIsLeftToTheHost) {
+TEST(ValidationManagerTest, TellsWhatIsLeftToTheHost) {
   static constexpr auto answer = [](Object&, const Method&, double seconds) { return seconds > 1; };
   Class& changed = Class::add("ValidationTestChanged", &Screen::staticClass(), nullptr);
   changed.addMethod(registration::record<bool, double>(reply.selector(), answer));
@@ -210,7 +210,7 @@ TEST(ValidationManager, tellsWhatIsLeftToTheHost) {
 }
 
 // Nobody but another category answers the selector.
-TEST(ValidationManager, tellsWhatIsLeftToAnotherCategory) {
+TEST(ValidationManagerTest, TellsWhatIsLeftToAnotherCategory) {
   static constexpr auto answer = [](Object&, const Method&, double seconds) { return seconds > 1; };
   Class& target = Class::add("ValidationTestBare", &Object::staticClass(), nullptr);
   addCategory({"ValidationTestAdding", target.name()})
@@ -225,7 +225,7 @@ TEST(ValidationManager, tellsWhatIsLeftToAnotherCategory) {
   EXPECT_EQ(left.found, "B d, left to ValidationTestAdding");
 }
 
-TEST(ValidationManager, installsWithoutChecksWhenTheyAreOff) {
+TEST(ValidationManagerTest, InstallsWithoutChecksWhenTheyAreOff) {
   registerNumbered<4>("ValidationTestFour", subScreen);
   const Ref<ValidationManager> owned = make<ValidationManager>();
   ValidationManager& m = *owned;
@@ -237,7 +237,7 @@ TEST(ValidationManager, installsWithoutChecksWhenTheyAreOff) {
   EXPECT_EQ(reply(make<SubScreen>())->text().back(), '4');
 }
 
-TEST(Reports, keepWhatWasPostedAndBroken) {
+TEST(ReportsTest, KeepWhatWasPostedAndBroken) {
   forgetReports();
   const Ref<String> about = string("about");
   postNotification(LayoutChangedNotification, about);
@@ -252,7 +252,7 @@ TEST(Reports, keepWhatWasPostedAndBroken) {
   EXPECT_TRUE(postedNotifications().empty());
 }
 
-TEST(Reports, keepTheLastOnesAndCountAll) {
+TEST(ReportsTest, KeepTheLastOnesAndCountAll) {
   forgetReports();
   Ref<String> first = string("first");
   const Weak<String> weak = first;

@@ -107,7 +107,7 @@ void expectHeights(const Ref<View>& chart, const Numbers& expected) {
     EXPECT_NEAR(heights[i], expected[i], 0.002) << "note " << i;
 }
 
-TEST(ChartSound, PlaysItsRangeAndThenEachValueFromLeftToRight) {
+TEST(ChartSoundTest, PlaysItsRangeAndThenEachValueFromLeftToRight) {
   const Ref<Points> chart = chartOf({0, 1, 2, 3, 4}, {60, 90, gap, 180, 240});
   const Sound sound = soundOf(chart);
   EXPECT_NEAR(sound.seconds(), notesBegin + 5 * noteSeconds, 1e-4);
@@ -119,7 +119,7 @@ TEST(ChartSound, PlaysItsRangeAndThenEachValueFromLeftToRight) {
   for (const std::size_t i : {0, 1, 3, 4}) EXPECT_NEAR(notes[i].pan, double(i) / 4, 0.001) << i;
 }
 
-TEST(ChartSound, TakesTheRangeOfItsValuesWhereItTellsNone) {
+TEST(ChartSoundTest, TakesTheRangeOfItsValuesWhereItTellsNone) {
   const Ref<Points> chart = chartOf({0, 1, 2}, {10, 30, 20});
   chart->hasRange = false;
   expectHeights(chart, {0, 1, 0.5});
@@ -129,7 +129,7 @@ TEST(ChartSound, TakesTheRangeOfItsValuesWhereItTellsNone) {
   EXPECT_EQ(soundOf(chart).pairs(), 0u);
 }
 
-TEST(ChartSound, RestsWhereValuesOfARegularStepAreLeftOut) {
+TEST(ChartSoundTest, RestsWhereValuesOfARegularStepAreLeftOut) {
   expectHeights(chartOf({0, 1, 2, 5, 6, 7, 8, 9}, {60, 60, 60, 180, 180, 180, 180, 180}),
                 {0, 0, 0, -1, -1, 1, 1, 1, 1, 1});
   // Two readings a day keep no step.
@@ -138,7 +138,7 @@ TEST(ChartSound, RestsWhereValuesOfARegularStepAreLeftOut) {
   expectHeights(chartOf({0, 5}, {60, 180, 60}), {0, 1, 0});
 }
 
-TEST(ChartSound, AveragesManyValuesInColumnsOfEqualTime) {
+TEST(ChartSoundTest, AveragesManyValuesInColumnsOfEqualTime) {
   // A reading a second for ten minutes: five a column higher for a while, one minute without any.
   Numbers x, y;
   for (int second = 0; second <= 600; ++second) {
@@ -163,7 +163,7 @@ TEST(ChartSound, AveragesManyValuesInColumnsOfEqualTime) {
             (Texts{"Chart without a title", "Horizontal axis: ", "Vertical axis: from 60 to 180"}));
 }
 
-TEST(ChartSound, PlaysTheLowAndTheHighOfEachSlice) {
+TEST(ChartSoundTest, PlaysTheLowAndTheHighOfEachSlice) {
   const Ref<SlicedDay> day = view<SlicedDay>({});
   day->texts = {"100 to 150 beats per minute", "", "200 beats per minute"};
   expectHeights(day, {0, 0.5, -1, -1, 1, 1});
@@ -174,7 +174,7 @@ TEST(ChartSound, PlaysTheLowAndTheHighOfEachSlice) {
                    "Vertical axis: from 100 to 200"}));
 }
 
-TEST(ChartSound, CountsLengthsOfTimeInMinutesInEachLanguage) {
+TEST(ChartSoundTest, CountsLengthsOfTimeInMinutesInEachLanguage) {
   const Ref<SlicedDay> day = view<SlicedDay>({});
   day->texts = {"0 minutes", "45 minutes", "1 hour, 15 minutes", "2 hours", "3 hours"};
   const Numbers heights = {0, 0, 0.25, 0.25, 75 / 180.0, 75 / 180.0, 120 / 180.0, 120 / 180.0, 1, 1};
@@ -186,7 +186,7 @@ TEST(ChartSound, CountsLengthsOfTimeInMinutesInEachLanguage) {
   expectHeights(day, {0, 1, 0.5, 0.5});
 }
 
-TEST(ChartSound, IsAsLoudAtEveryPitchAndNeverClips) {
+TEST(ChartSoundTest, IsAsLoudAtEveryPitchAndNeverClips) {
   const auto decibels = [](double pitch) {
     const Sound sound = note(pitch, 0.5);
     return 20 * std::log10(hear(sound.samples(), 0, noteSeconds).level);
@@ -203,7 +203,7 @@ TEST(ChartSound, IsAsLoudAtEveryPitchAndNeverClips) {
   }
 }
 
-TEST(ChartSound, BeginsAndEndsNotesSoftly) {
+TEST(ChartSoundTest, BeginsAndEndsNotesSoftly) {
   const Sound sound = note(1400, 0);
   const double end = sound.seconds();
   const double full = hear(sound.samples(), 0.05, 0.15).peak;

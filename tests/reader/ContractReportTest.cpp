@@ -19,7 +19,7 @@ void addCategories() {
   addCategory({"ReportTestHeaderAccessibility", "Tests.NoSuchHeader", {}, checkTitle, "Trends"});
 }
 
-TEST(ContractReport, GroupsChecksAndNamesTheScreens) {
+TEST(ContractReportTest, GroupsChecksAndNamesTheScreens) {
   addCategories();
   const Ref<ValidationManager> manager = make<ValidationManager>();
   manager->performValidationsWithPreValidationHandlerPostValidationHandlerSafeCategoryInstallationHandler(
@@ -54,7 +54,7 @@ TEST(ContractReport, GroupsChecksAndNamesTheScreens) {
   EXPECT_EQ(json["installed"], 2);
 }
 
-TEST(ContractReport, ChecksOfTheWholeBundleNameTheirScreens) {
+TEST(ContractReportTest, ChecksOfTheWholeBundleNameTheirScreens) {
   const Ref<ValidationManager> manager = make<ValidationManager>();
   manager->setValidationTargetScreens({"Month calendar", "Week palette"});
   manager->validateClass("Tests.NoSuchCache");
@@ -71,7 +71,7 @@ Ref<Object> categorys(Object&, const Method&) {
   return nullptr;
 }
 
-TEST(ContractReport, TellsWhatIsLeftToTheHost) {
+TEST(ContractReportTest, TellsWhatIsLeftToTheHost) {
   const Selector selector = Selector::intern("testsChangedMethod");
   Class& host = Class::add("Tests.ChangedHost", &Object::staticClass(), nullptr);
   host.addMethod(registration::record<double, bool>(selector, &hostsOwn));

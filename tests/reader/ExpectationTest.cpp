@@ -20,7 +20,7 @@ std::string differing(const char* expected, const char* found) {
   return places;
 }
 
-TEST(Expectation, LeavesMembersOutButNothingElse) {
+TEST(ExpectationTest, LeavesMembersOutButNothingElse) {
   EXPECT_EQ(differing(R"({"a": 1})", R"({"a": 1.0, "b": 2})"), "");
   EXPECT_EQ(differing(R"({"a": 1, "c/d": null})", R"({"a": 1})"), "/at/c~1d-");
   EXPECT_EQ(differing("[1, 2]", "[1, 3, 4]"), "/at/1 /at/2+");
@@ -29,7 +29,7 @@ TEST(Expectation, LeavesMembersOutButNothingElse) {
   EXPECT_EQ(differing("{}", "[]"), "/at");
 }
 
-TEST(Expectation, IsAcceptedWithoutWhatItLeavesOut) {
+TEST(ExpectationTest, IsAcceptedWithoutWhatItLeavesOut) {
   const auto acceptedText = [](const char* expected, const char* found) {
     return accepted(Json::parse(expected), Json::parse(found)).dump();
   };
@@ -38,7 +38,7 @@ TEST(Expectation, IsAcceptedWithoutWhatItLeavesOut) {
   EXPECT_EQ(acceptedText(R"([{"b": 1}])", R"([{"b": 7}, 2])"), R"([{"b":7},2])");
 }
 
-TEST(SceneText, ChangesOneMemberAndKeepsTheLayout) {
+TEST(SceneTextTest, ChangesOneMemberAndKeepsTheLayout) {
   const std::string scene =
       "{ \"steps\": [\n  {\"ask\": \"a\\\"]}\" , \"of\":\"x\"},\n  {\n    \"read\": \"k\"\n  }\n] }\n";
   EXPECT_EQ(
@@ -52,12 +52,12 @@ TEST(SceneText, ChangesOneMemberAndKeepsTheLayout) {
   EXPECT_EQ(withMember("{}", "", "expect", 1, "f"), "{\"expect\": 1}");
 }
 
-TEST(SceneText, RefusesWhatItWouldChangeBeyondTheMember) {
+TEST(SceneTextTest, RefusesWhatItWouldChangeBeyondTheMember) {
   const std::string escaped = "{\"st\\u0065ps\": [{\"of\": 1}]}";
   EXPECT_THROW(withMember(escaped, "/steps/0", "expect", 1, "f"), Fault);
 }
 
-TEST(SceneText, BreaksLinesThatWouldGrowTooLong) {
+TEST(SceneTextTest, BreaksLinesThatWouldGrowTooLong) {
   const std::string text = laidOut(Json::array({std::string(60, 'a'), std::string(60, 'b')}), 0, 0);
   EXPECT_EQ(text, "[\n  \"" + std::string(60, 'a') + "\",\n  \"" + std::string(60, 'b') + "\"\n]");
   Json members = Json::object();

@@ -84,7 +84,7 @@ class Slices : public View {
   std::uint64_t hoursPerSlice = 0;
 };
 
-TEST(Graph, ReadsASeriesWithBothAxes) {
+TEST(GraphTest, ReadsASeriesWithBothAxes) {
   const Snapshot snapshot = takeSnapshot(view({view<Series>({})}));
   ASSERT_EQ(charts(snapshot).size(), 1u);
   const Node& chart = *charts(snapshot)[0];
@@ -98,7 +98,7 @@ TEST(Graph, ReadsASeriesWithBothAxes) {
   EXPECT_EQ(snapshot.timesRaised(), 2u);
 }
 
-TEST(Graph, DescribesASeriesWithItsElements) {
+TEST(GraphTest, DescribesASeriesWithItsElements) {
   const Ref<View> chart = view<Series>({}, {10, 20, 200, 100});
   const Ref<AccessibilityElement> bar = element("Noon", chart);
   messages::setAccessibilityValue(bar, string("3 calories"));
@@ -113,7 +113,7 @@ TEST(Graph, DescribesASeriesWithItsElements) {
                    "    Noon, 3 calories, left 15, top 26, width 7, height 8"}));
 }
 
-TEST(Graph, NamesTheUnitOfAnAxis) {
+TEST(GraphTest, NamesTheUnitOfAnAxis) {
   const Ref<View> screen = view<Series>({}, {10, 20, 200, 100});
   const Snapshot snapshot = takeSnapshot(screen);
   Node chart = *charts(snapshot).at(0);
@@ -129,7 +129,7 @@ TEST(Graph, NamesTheUnitOfAnAxis) {
   }
 }
 
-TEST(Graph, AsksConsecutiveSlices) {
+TEST(GraphTest, AsksConsecutiveSlices) {
   const Ref<Slices> chart = view<Slices>({});
   Snapshot snapshot = takeSnapshot(chart);
   const DataSeries& series = *charts(snapshot).at(0)->series;
@@ -160,7 +160,7 @@ class TimedSlices : public Slices {
   static constexpr double start = 1772943300;  // 2026-03-07T23:15 in New York
 };
 
-TEST(Graph, TellsTheTimeOfDayOfASliceWhereTheChartHasOne) {
+TEST(GraphTest, TellsTheTimeOfDayOfASliceWhereTheChartHasOne) {
   setEnvironment({.timeZone = "America/New_York"});
   const Ref<TimedSlices> chart = view<TimedSlices>({});
   chart->secondsPerSlice = 5400;
@@ -172,7 +172,7 @@ TEST(Graph, TellsTheTimeOfDayOfASliceWhereTheChartHasOne) {
   setEnvironment({});
 }
 
-TEST(Graph, NamesASliceChartByItsLabelItsCellOrItsKind) {
+TEST(GraphTest, NamesASliceChartByItsLabelItsCellOrItsKind) {
   const auto heading = [](const Ref<View>& screen) {
     const Snapshot snapshot = takeSnapshot(screen);
     return describeChart(snapshot, *charts(snapshot).at(0)).at(0);
@@ -195,7 +195,7 @@ TEST(Graph, NamesASliceChartByItsLabelItsCellOrItsKind) {
   EXPECT_EQ(heading(headed), "Chart: Stairs of the week");
 }
 
-TEST(Graph, TellsTheLengthOfASlice) {
+TEST(GraphTest, TellsTheLengthOfASlice) {
   const Ref<Slices> chart = view<Slices>({});
   const auto length = [&chart] {
     const Snapshot snapshot = takeSnapshot(chart);
@@ -207,7 +207,7 @@ TEST(Graph, TellsTheLengthOfASlice) {
   EXPECT_EQ(length(), "  2 slices, 1 hour, 30 minutes per slice");
 }
 
-TEST(Graph, BoundsWhatABrokenHostCounts) {
+TEST(GraphTest, BoundsWhatABrokenHostCounts) {
   const Ref<Slices> chart = view<Slices>({});
   chart->count = std::numeric_limits<std::uint64_t>::max();
   chart->hoursPerSlice = std::numeric_limits<std::uint64_t>::max();
@@ -221,7 +221,7 @@ TEST(Graph, BoundsWhatABrokenHostCounts) {
   EXPECT_EQ(describeChart(none, *charts(none).at(0)).back(), "  No data in the chart");
 }
 
-TEST(Graph, PrintsJson) {
+TEST(GraphTest, PrintsJson) {
   const Snapshot snapshot = takeSnapshot(view({view<Series>({}), view<Slices>({}, {0, 900, 10, 10})}));
   const auto found = charts(snapshot);
   ASSERT_EQ(found.size(), 2u);

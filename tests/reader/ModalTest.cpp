@@ -22,7 +22,7 @@ class Shade : public View {
   bool isUp = true;
 };
 
-TEST(Modal, TheInnermostOfNestedOnesHoldsTheReader) {
+TEST(ModalTest, TheInnermostOfNestedOnesHoldsTheReader) {
   const Ref<Shade> inner = view<Shade>({label("Sure?")});
   const Ref<Shade> outer = view<Shade>({label("Share"), view({inner}), label("Cancel", {0, 900, 10, 10})});
   const Ref<View> screen = view({label("behind"), view({view({outer})})});
@@ -33,7 +33,7 @@ TEST(Modal, TheInnermostOfNestedOnesHoldsTheReader) {
   EXPECT_EQ(labels(takeSnapshot(screen)), (Labels{"behind", "Share", "Sure?", "Cancel"}));
 }
 
-TEST(Modal, WhatIsDrawnLastIsInFrontWhereverItStands) {
+TEST(ModalTest, WhatIsDrawnLastIsInFrontWhereverItStands) {
   const Ref<Shade> low = view<Shade>({label("low")}, {0, 600, 400, 200});
   const Ref<Shade> high = view<Shade>({label("high")}, {0, 0, 400, 200});
   const Ref<View> screen = view({low, high});
@@ -43,7 +43,7 @@ TEST(Modal, WhatIsDrawnLastIsInFrontWhereverItStands) {
   EXPECT_EQ(labels(takeSnapshot(screen)), Labels{"low"});
 }
 
-TEST(Modal, OneThatCannotBeSeenCoversNothing) {
+TEST(ModalTest, OneThatCannotBeSeenCoversNothing) {
   const Ref<View> hidden = view({view<Shade>({label("in a hidden view")})});
   hidden->setHidden(true);
   const Ref<Shade> faded = view<Shade>({label("faded")});
@@ -54,7 +54,7 @@ TEST(Modal, OneThatCannotBeSeenCoversNothing) {
   EXPECT_EQ(snapshot.hitTest({5, 5})->label->text, "read");
 }
 
-TEST(Modal, TheScreenItselfAndAnElementCanBeOne) {
+TEST(ModalTest, TheScreenItselfAndAnElementCanBeOne) {
   const Snapshot whole = takeSnapshot(view<Shade>({label("a"), label("b", {0, 40, 10, 10})}));
   EXPECT_EQ(transcript(whole, "T"), (Labels{"Screen: T", "a, covers the rest of the screen", "b"}));
 
@@ -66,7 +66,7 @@ TEST(Modal, TheScreenItselfAndAnElementCanBeOne) {
   EXPECT_EQ(one.hitTest({5, 5})->label->text, "Please wait");
 }
 
-TEST(Modal, ItsElementsAreThoseThatItLists) {
+TEST(ModalTest, ItsElementsAreThoseThatItLists) {
   const Ref<Shade> sheet = view<Shade>({label("drawn")});
   messages::setAccessibilityElements(sheet, array({element("listed", sheet)}));
   EXPECT_EQ(labels(takeSnapshot(view({label("behind"), sheet}))), Labels{"listed"});
@@ -75,7 +75,7 @@ TEST(Modal, ItsElementsAreThoseThatItLists) {
             (Labels{"Screen: T", "Nothing to speak"}));
 }
 
-TEST(SnapshotActions, AnElementMayTakeItselfAway) {
+TEST(SnapshotActionsTest, AnElementMayTakeItselfAway) {
   Ref<Label> closing = label("Close");
   const Ref<View> screen = view({closing, label("stays", {0, 40, 10, 10})});
   _setAccessibilityActivateBlock(closing, [&] {

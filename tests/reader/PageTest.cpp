@@ -36,7 +36,7 @@ class PageChart : public View {
 
 }  // namespace
 
-TEST(Page, LetsNoTextOfTheHostBecomeMarkup) {
+TEST(PageTest, LetsNoTextOfTheHostBecomeMarkup) {
   const Ref<Button> odd = button("<script>alert('1')</script>");
   messages::setAccessibilityValue(odd, string("\"><img src=x>"));
   messages::setAccessibilityHint(odd, string("</style>&amp;"));
@@ -48,7 +48,7 @@ TEST(Page, LetsNoTextOfTheHostBecomeMarkup) {
   EXPECT_TRUE(document.load_string(html.substr(html.find("<html")).c_str())) << "every element is closed";
 }
 
-TEST(Page, GivesEachRoleItsElement) {
+TEST(PageTest, GivesEachRoleItsElement) {
   const Ref<Button> off = button("Off", {0, 60, 100, 20});
   messages::setAccessibilityTraits(off, TraitButton | TraitNotEnabled | TraitSelected);
   const Ref<Label> heading = label("Head");
@@ -66,7 +66,7 @@ TEST(Page, GivesEachRoleItsElement) {
   EXPECT_TRUE(has(html, "disabled=\"\" aria-current=\"true\">Off</button>"));
 }
 
-TEST(Page, KeepsTheOrderOfAChartInListsAndTables) {
+TEST(PageTest, KeepsTheOrderOfAChartInListsAndTables) {
   const Ref<View> chart = view<PageChart>({}, {0, 0, 100, 100});
   const Ref<AccessibilityElement> first = element("Monday", chart), head = element("Then", chart),
                                   last = element("Sunday", chart);
@@ -82,7 +82,7 @@ TEST(Page, KeepsTheOrderOfAChartInListsAndTables) {
   EXPECT_LT(lastRow, html.size());
 }
 
-TEST(Page, GivesEachScreenItsLanguage) {
+TEST(PageTest, GivesEachScreenItsLanguage) {
   Page page;
   setEnvironment({.locale = "de_DE"});
   page.add(takeSnapshot(view({label("Eins")})), "");

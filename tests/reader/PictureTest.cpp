@@ -86,7 +86,7 @@ std::vector<double> heights(const DataSeries& series) {
 
 }  // namespace
 
-TEST(Picture, NumbersEveryFrameInReadingOrder) {
+TEST(PictureTest, NumbersEveryFrameInReadingOrder) {
   const Ref<Label> hidden = label("Hidden", {0, 100, 400, 20});
   hidden->setHidden(true);
   const Ref<View> screen =
@@ -98,7 +98,7 @@ TEST(Picture, NumbersEveryFrameInReadingOrder) {
   EXPECT_EQ(std::string(picture.root().attribute("viewBox").value()), "-8 -8 416 96");
 }
 
-TEST(Picture, SetsNumbersOfElementsWithoutAFrameAboveTheScreen) {
+TEST(PictureTest, SetsNumbersOfElementsWithoutAFrameAboveTheScreen) {
   std::vector<Ref<View>> labels;
   const Ref<View> screen = view({label("Here", {0, 0, 320, 20})});
   const double far = 1e300;
@@ -120,12 +120,12 @@ TEST(Picture, SetsNumbersOfElementsWithoutAFrameAboveTheScreen) {
   EXPECT_EQ(above, 44);
 }
 
-TEST(Picture, StandsWhateverTheTextsHold) {
+TEST(PictureTest, StandsWhateverTheTextsHold) {
   const Picture picture(view({label("a")}), "Ada's \"<1>\" & \xFF\x01 \U0001F3C3");
   EXPECT_EQ(std::string(picture.root().attribute("aria-label").value()), "Ada's \"<1>\" & \uFFFD \U0001F3C3");
 }
 
-TEST(Picture, BeginsOnTheRightWhereTheLanguageDoes) {
+TEST(PictureTest, BeginsOnTheRightWhereTheLanguageDoes) {
   setEnvironment({.locale = "ar_EG"});
   const Picture picture(view({label("a", {0, 0, 400, 40})}));
   EXPECT_EQ(picture.numbers().at(0), "\u0661");
@@ -133,7 +133,7 @@ TEST(Picture, BeginsOnTheRightWhereTheLanguageDoes) {
   setEnvironment({});
 }
 
-TEST(NumberMarks, ShareAFrameAndShrinkIntoSmallOnes) {
+TEST(NumberMarksTest, ShareAFrameAndShrinkIntoSmallOnes) {
   NumberMarks marks(false);
   const Rect frame = {10, 10, 60, 40};
   std::vector<Rect> placed;
@@ -148,7 +148,7 @@ TEST(NumberMarks, ShareAFrameAndShrinkIntoSmallOnes) {
   EXPECT_LE(small.maxX(), 208);
 }
 
-TEST(ChartDrawing, DrawsBarsOfTheirHeight) {
+TEST(ChartDrawingTest, DrawsBarsOfTheirHeight) {
   DataSeries series = bars({0, 1, 2, 23}, {2, 0, 4, 99});
   series.axes[horizontalAxis].maximum = 24;
   series.axes[verticalAxis].maximum = 8;
@@ -164,7 +164,7 @@ TEST(ChartDrawing, DrawsBarsOfTheirHeight) {
   EXPECT_TRUE(drawChart(bars({}, {}), plot).bars.empty());
 }
 
-TEST(ChartDrawing, ShowsNothingWhereTheChartHasNoBar) {
+TEST(ChartDrawingTest, ShowsNothingWhereTheChartHasNoBar) {
   const Snapshot screen = takeSnapshot(view({label("a", {0, 0, 10, 80}), label("b", {20, 0, 10, 80})}));
   Node chart;
   chart.frame = {0, 0, 30, 80};
@@ -178,13 +178,13 @@ TEST(ChartDrawing, ShowsNothingWhereTheChartHasNoBar) {
   EXPECT_EQ(drawn({2, 1, 4}).size(), 3u) << "a value is no gap";
 }
 
-TEST(ChartDrawing, SetsBarsOfOneDaySideBySide) {
+TEST(ChartDrawingTest, SetsBarsOfOneDaySideBySide) {
   const ChartDrawing drawing = drawChart(bars({0, 0.1, 1, 1.1, 2, 2.1}, {1, 2, 1, 2, 1, 2}), plot);
   ASSERT_EQ(drawing.bars.size(), 6u);
   for (const Rect& bar : drawing.bars) EXPECT_NEAR(bar.width, 32, 1e-9);
 }
 
-TEST(ChartDrawing, BreaksLinesAtGaps) {
+TEST(ChartDrawingTest, BreaksLinesAtGaps) {
   const auto drawing = drawChart(line({0, 1, 2, 3, 7, 8, 9, 10}, {10, 20, none, 15, 10, 10, 20, 10}), plot);
   ASSERT_EQ(drawing.lines.size(), 3u);  // for want of a number, and of a reading
   EXPECT_EQ(drawing.lines[0], (std::vector<Point>{{100, 150}, {124, 50}}));
@@ -193,7 +193,7 @@ TEST(ChartDrawing, BreaksLinesAtGaps) {
   EXPECT_EQ(drawChart(line({5}, {7}), plot).lines.size(), 1u);
 }
 
-TEST(ChartDrawing, ReadsTheNumbersOfSlices) {
+TEST(ChartDrawingTest, ReadsTheNumbersOfSlices) {
   const auto ranges = drawChart(slices({"100 to 1,200 beats", "", "650 beats"}), plot).bars;
   ASSERT_EQ(ranges.size(), 2u);
   EXPECT_EQ(ranges[0].y, 50);
@@ -207,7 +207,7 @@ TEST(ChartDrawing, ReadsTheNumbersOfSlices) {
   setEnvironment({});
 }
 
-TEST(ChartDrawing, SurvivesValuesOfABrokenHost) {
+TEST(ChartDrawingTest, SurvivesValuesOfABrokenHost) {
   const double huge = std::numeric_limits<double>::max();
   for (const double odd : {huge, -huge, none, HUGE_VAL}) {
     DataSeries series = bars({odd, 1, odd}, {1, odd, 2});

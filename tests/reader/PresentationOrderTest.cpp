@@ -82,37 +82,37 @@ std::vector<std::string> heardOf(const std::string& members) {
 
 using Heard = std::vector<std::string>;
 
-TEST(PresentationOrder, LaysOutFromTheTopAndThenLoadsChildrenFirst) {
+TEST(PresentationOrderTest, LaysOutFromTheTopAndThenLoadsChildrenFirst) {
   const std::string tree = named("a", named("b", named("c")) + ", " + named("d"));
   EXPECT_EQ(heardOf(R"("screen": )" + tree),
             (Heard{"layout a", "layout b", "layout c", "layout d", "load c", "load b", "load d", "load a"}));
 }
 
-TEST(PresentationOrder, TheControllerComesFirstAndLast) {
+TEST(PresentationOrderTest, TheControllerComesFirstAndLast) {
   const std::string view = named("a", named("b"));
   EXPECT_EQ(
       heardOf(R"("screen": {"class": "Tests.WitnessController", "set": {"view": )" + view + "}}"),
       (Heard{"loadView", "viewDidLoad", "layout a", "layout b", "load b", "load a", "load controller"}));
 }
 
-TEST(PresentationOrder, AControllerWithoutAViewMakesItOnce) {
+TEST(PresentationOrderTest, AControllerWithoutAViewMakesItOnce) {
   EXPECT_EQ(heardOf(R"("screen": {"class": "Tests.WitnessController"})"),
             (Heard{"loadView", "viewDidLoad", "load controller"}));
 }
 
-TEST(PresentationOrder, RowsMadeByTheLayoutAreShownToo) {
+TEST(PresentationOrderTest, RowsMadeByTheLayoutAreShownToo) {
   EXPECT_EQ(heardOf(R"("screen": )" + named("table")),
             (Heard{"layout table", "layout row", "load row", "load table"}));
 }
 
-TEST(PresentationOrder, AHostThatRaisesDoesNotKeepTheOthersOut) {
+TEST(PresentationOrderTest, AHostThatRaisesDoesNotKeepTheOthersOut) {
   heard().clear();
   const StandingScene standing(R"("screen": )" + named("a", named("broken") + ", " + named("b")));
   EXPECT_EQ(heard(), (Heard{"layout a", "layout broken", "layout b", "load broken", "load b", "load a"}));
   EXPECT_EQ(standing.run.hostFaults(), Heard{"Tests.Witness layoutSubviews: no room"});
 }
 
-TEST(PresentationOrder, WhatIsOnlyHeldOrLiesBesideHearsNothing) {
+TEST(PresentationOrderTest, WhatIsOnlyHeldOrLiesBesideHearsNothing) {
   EXPECT_EQ(heardOf(R"("objects": [)" + named("beside") + R"(, {"class": "Tests.WitnessController"}],
       "screen": {"class": "Tests.SceneProbe", "set": {"_partner": )" +
                     named("held") + R"(}})"),

@@ -33,7 +33,7 @@ std::size_t countOf(const nlohmann::ordered_json& tree) {
   return count;
 }
 
-TEST(RandomScreen, SpeaksEverythingThatIsSeenOnceAndInOrder) {
+TEST(RandomScreenTest, SpeaksEverythingThatIsSeenOnceAndInOrder) {
   for (unsigned seed = 0; seed < screens; ++seed) {
     const RandomScreen screen(seed);
     const Snapshot snapshot = takeSnapshot(screen.root());
@@ -42,7 +42,7 @@ TEST(RandomScreen, SpeaksEverythingThatIsSeenOnceAndInOrder) {
   }
 }
 
-TEST(RandomScreen, IsReadFromTheOtherSideInArabic) {
+TEST(RandomScreenTest, IsReadFromTheOtherSideInArabic) {
   const RegionScope region("ar_EG");
   for (unsigned seed = 0; seed < screens; ++seed) {
     const RandomScreen screen(seed, true);
@@ -50,7 +50,7 @@ TEST(RandomScreen, IsReadFromTheOtherSideInArabic) {
   }
 }
 
-TEST(RandomScreen, LosesNoNodeOnTheWayDown) {
+TEST(RandomScreenTest, LosesNoNodeOnTheWayDown) {
   for (unsigned seed = 0; seed < screens; ++seed) {
     const RandomScreen screen(seed);
     const Snapshot snapshot = takeSnapshot(screen.root());
@@ -66,7 +66,7 @@ TEST(RandomScreen, LosesNoNodeOnTheWayDown) {
   }
 }
 
-TEST(RandomScreen, SaysTheSameAgainUnderNewIds) {
+TEST(RandomScreenTest, SaysTheSameAgainUnderNewIds) {
   std::set<NodeId> used;
   std::size_t nodes = 0;
   for (unsigned seed = 0; seed < screens; ++seed) {
@@ -96,7 +96,7 @@ const Node* drawnLast(const NodesOfViews& nodes, const Ref<View>& view, Point po
   return last;
 }
 
-TEST(RandomScreen, FindsWhatIsDrawnLastUnderAPoint) {
+TEST(RandomScreenTest, FindsWhatIsDrawnLastUnderAPoint) {
   for (unsigned seed = 0; seed < screens; ++seed) {
     const RandomScreen screen(seed);
     const Snapshot snapshot = takeSnapshot(screen.root());
@@ -113,7 +113,7 @@ TEST(RandomScreen, FindsWhatIsDrawnLastUnderAPoint) {
   }
 }
 
-TEST(RandomScreen, ActsOnNothingThatIsGone) {
+TEST(RandomScreenTest, ActsOnNothingThatIsGone) {
   for (unsigned seed = 0; seed < screens; ++seed) {
     std::optional<RandomScreen> screen(std::in_place, seed);
     for (const Ref<View>& speaker : screen->speakers()) {

@@ -21,7 +21,7 @@ void expectFaults(const std::vector<Malformed>& scenes) {
   }
 }
 
-TEST(SceneFault, JsonIsReadStrictly) {
+TEST(SceneFaultTest, JsonIsReadStrictly) {
   expectFaults({
       {"", "line 1, column 1", "unexpected end of input"},
       {"{\n \"format\": 1,,\n}", "line 2, column 14", "unexpected ','"},
@@ -39,7 +39,7 @@ TEST(SceneFault, JsonIsReadStrictly) {
       "environment, host, days, screen, objects, steps, expect");
 }
 
-TEST(SceneFault, TheFrameIsChecked) {
+TEST(SceneFaultTest, TheFrameIsChecked) {
   expectFaults({
       {"{}", "", "no \"format\""},
       {R"({"format": "axvelto-scene/2"})", "/format", "expected \"axvelto-scene/1\""},
@@ -61,7 +61,7 @@ TEST(SceneFault, TheFrameIsChecked) {
   });
 }
 
-TEST(SceneFault, ObjectsAreCheckedAgainstTheirClasses) {
+TEST(SceneFaultTest, ObjectsAreCheckedAgainstTheirClasses) {
   expectFaults({
       {R"("screen": {"id": "x"})", "/screen", "no \"class\""},
       {R"("screen": {"class": "Labell"})", "/screen/class", "unknown class \"Labell\""},
@@ -94,7 +94,7 @@ Malformed probeSetting(const std::string& key, const std::string& value, const s
           "/screen/set/" + key + below, told};
 }
 
-TEST(SceneFault, ValuesAreOfTheKindThatTheMemberTakes) {
+TEST(SceneFaultTest, ValuesAreOfTheKindThatTheMemberTakes) {
   expectFaults({
       probeSetting("_flag", "1", "", "true or false"),
       probeSetting("_flag", "null", "", "null for _flag"),
@@ -124,7 +124,7 @@ TEST(SceneFault, ValuesAreOfTheKindThatTheMemberTakes) {
   });
 }
 
-TEST(SceneFault, StepsAreChecked) {
+TEST(SceneFaultTest, StepsAreChecked) {
   const std::string screen = R"("screen": {"class": "Tests.SceneProbe", "id": "p"}, "steps": )";
   expectFaults({
       {screen + R"([{"of": "p"}])", "/steps/0", "a step of no known kind"},

@@ -25,7 +25,7 @@ Replies repliesOf(std::string_view members) {
   return repliesOf(standing.run);
 }
 
-TEST(SceneRun, ValuesReturnAsTheyAreWritten) {
+TEST(SceneRunTest, ValuesReturnAsTheyAreWritten) {
   const std::vector<std::pair<std::string, std::string>> values = {
       {"null", "null"},
       {"true", "true"},
@@ -60,7 +60,7 @@ TEST(SceneRun, ValuesReturnAsTheyAreWritten) {
   }
 }
 
-TEST(SceneRun, TextsCarryTheirSpokenForms) {
+TEST(SceneRunTest, TextsCarryTheirSpokenForms) {
   EXPECT_EQ(repliesOf(R"("environment": {"locale": "de_DE"}, "objects": [
       {"class": "Label", "id": "a", "set": {"text": {"localized": "unit.km"}}},
       {"class": "Label", "id": "b", "set": {"attributedText": {"attributed": "0:42", "label": "42 Sekunden"}}},
@@ -71,7 +71,7 @@ TEST(SceneRun, TextsCarryTheirSpokenForms) {
                      R"({"id":null,"class":"AttributedString","attributed":"0:42","label":"42 Sekunden"})"}));
 }
 
-TEST(SceneRun, ReferencesReachWhatStandsLaterAndWhatIsHeldWeakly) {
+TEST(SceneRunTest, ReferencesReachWhatStandsLaterAndWhatIsHeldWeakly) {
   const Replies replies = repliesOf(R"("objects": [
       {"class": "Tests.SceneProbe", "id": "first",
        "set": {"_partner": {"ref": "second"}, "_weakly": {"class": "Label", "id": "inner"}}},
@@ -84,7 +84,7 @@ TEST(SceneRun, ReferencesReachWhatStandsLaterAndWhatIsHeldWeakly) {
             (Replies{"true", "true", "true", "false"}));
 }
 
-TEST(SceneRun, AnswersAreScripted) {
+TEST(SceneRunTest, AnswersAreScripted) {
   EXPECT_EQ(repliesOf(R"("screen": {"class": "Tests.SceneProbe", "id": "p", "answers": {
       "isReady": true, "note": {"raises": "no note"}, "valueAt:for:": {"indexed": [10, {"raises": "no second"}, 30]}}},
       "objects": [{"class": "Tests.SceneProbe", "id": "other"}],
@@ -96,7 +96,7 @@ TEST(SceneRun, AnswersAreScripted) {
                      R"({"raised":"no reply for 3"})", R"({"raised":"no reply for -1"})", "-3", "false"}));
 }
 
-TEST(SceneRun, TheScreenIsPresentedOnceAndObjectsAreLeftAlone) {
+TEST(SceneRunTest, TheScreenIsPresentedOnceAndObjectsAreLeftAlone) {
   StandingScene standing(R"("screen": {"class": "Tests.SceneProbe", "id": "outer",
         "answers": {"_accessibilityLoadAccessibilityInformation": {"raises": "not today"}},
         "subviews": [{"class": "Tests.SceneProbe", "id": "inner"}]},
@@ -112,13 +112,13 @@ TEST(SceneRun, TheScreenIsPresentedOnceAndObjectsAreLeftAlone) {
             R"({"step":4,"ask":"log","reply":"layout "}])");
 }
 
-TEST(SceneRun, AControllerLoadsItsViewAndPresentsIt) {
+TEST(SceneRunTest, AControllerLoadsItsViewAndPresentsIt) {
   EXPECT_EQ(repliesOf(R"("screen": {"class": "ViewController", "id": "c", "set": {"view":
         {"class": "Tests.SceneProbe", "id": "v"}}}, "steps": [{"ask": "log", "of": "v"}])"),
             Replies{"\"layout load \""});
 }
 
-TEST(SceneRun, StepsChangeWhatLaterStepsSee) {
+TEST(SceneRunTest, StepsChangeWhatLaterStepsSee) {
   EXPECT_EQ(
       repliesOf(
           R"("environment": {"now": "2026-03-08T09:00:00", "timeZone": "Asia/Tokyo", "firstName": "Ada"},
@@ -134,7 +134,7 @@ TEST(SceneRun, StepsChangeWhatLaterStepsSee) {
   EXPECT_EQ(environment().firstName, "Ada");
 }
 
-TEST(SceneRun, ShownObjectsAnswerWithTheirProperties) {
+TEST(SceneRunTest, ShownObjectsAnswerWithTheirProperties) {
   EXPECT_EQ(
       repliesOf(R"("screen": {"class": "View", "set": {"frame": {"rect": [10, 20, 300, 400]}}, "subviews": [
         {"class": "Button", "id": "b", "set": {"title": "Start", "enabled": false, "frame": {"rect": [1, 2, 3, 4]},
@@ -171,7 +171,7 @@ Class& Frail::staticClass() {
 
 const RegisteredClass<Frail> registeredFrail;
 
-TEST(SceneRun, AHostWithoutMembersStillCarriesTheScene) {
+TEST(SceneRunTest, AHostWithoutMembersStillCarriesTheScene) {
   StandingScene standing(
       R"("host": {"without": ["Tests.Frail._title", "Tests.Frail.setTitle:", "Tests.Frail.motto",
                               "Tests.Frail.Breakable", "Tests.Frail"]},
@@ -189,7 +189,7 @@ TEST(SceneRun, AHostWithoutMembersStillCarriesTheScene) {
   EXPECT_EQ(cast<Frail>(kept)->detail()->text(), "kept");
 }
 
-TEST(SceneRun, AHostThatKeepsNoDaysIsNotedAndStopsNothing) {
+TEST(SceneRunTest, AHostThatKeepsNoDaysIsNotedAndStopsNothing) {
   Class& cache = *Class::named("ActivitySummaryCache");
   const Ref<Object> shared = cache.safeValueForKey("sharedInstance");
   const auto answer = [&](const ScriptedAnswer& given) {
@@ -202,7 +202,7 @@ TEST(SceneRun, AHostThatKeepsNoDaysIsNotedAndStopsNothing) {
   EXPECT_NE(standing.run.screen(), nullptr);
 }
 
-TEST(SceneRun, LetsGoOfObjectsThatHoldThemselves) {
+TEST(SceneRunTest, LetsGoOfObjectsThatHoldThemselves) {
   Weak<Object> listed, own, answered;
   {
     const StandingScene standing(R"("objects": [

@@ -32,7 +32,7 @@ std::string withSteps(const std::string& steps) {
          steps + "]";
 }
 
-TEST(SceneStep, ResultsAreTargetsAndSoAreTheirItems) {
+TEST(SceneStepTest, ResultsAreTargetsAndSoAreTheirItems) {
   const Replies replies = repliesOf(withSteps(R"(
       {"ask": "subviews", "of": "v", "as": "all"}, {"same": ["all.0", "one"]}, {"same": ["all.1", "two"]},
       {"ask": "subviews", "of": "all.1", "as": "inner"}, {"read": "text", "of": "inner.0"},
@@ -47,7 +47,7 @@ TEST(SceneStep, ResultsAreTargetsAndSoAreTheirItems) {
 }
 
 // The module's classes are known once it is open, and what a scene reads need not be there.
-TEST(SceneStep, AsksThePrincipalClassAndReadsWhatThereIsNot) {
+TEST(SceneStepTest, AsksThePrincipalClassAndReadsWhatThereIsNot) {
   host::linkHost();
   const std::string scene = R"("objects": [{"class": "Label", "id": "label"}], "steps": [
       {"same": ["AXVeltoGlue", "AXVeltoGlue"]}, {"ask": "accessibilityBundles", "of": "AXVeltoGlue"},
@@ -57,7 +57,7 @@ TEST(SceneStep, AsksThePrincipalClassAndReadsWhatThereIsNot) {
 }
 
 // A raised result is nil, and a nil target answers nil to everything.
-TEST(SceneStep, NothingComesOfNil) {
+TEST(SceneStepTest, NothingComesOfNil) {
   EXPECT_EQ(
       repliesOf(withSteps(R"(
       {"ask": "fail", "of": "p", "as": "raised"}, {"ask": "anything at all", "of": "raised"},
@@ -67,7 +67,7 @@ TEST(SceneStep, NothingComesOfNil) {
       (Replies{R"({"raised":"out of order"})", "null", "null", "null", "null", "true", "false", "null"}));
 }
 
-TEST(SceneStep, FaultsOfTheRunPointAtTheStep) {
+TEST(SceneStepTest, FaultsOfTheRunPointAtTheStep) {
   const std::string bound = R"({"ask": "subviews", "of": "v", "as": "all"}, )";
   const std::tuple<std::string, std::string, std::string> faults[] = {
       {R"({"ask": "subviews", "of": "all.2"})", "/steps/1/of", "no item \"all.2\" in a list of 2"},
@@ -92,14 +92,14 @@ TEST(SceneStep, FaultsOfTheRunPointAtTheStep) {
   }
 }
 
-TEST(SceneStep, StepsBeforeAFaultAreDone) {
+TEST(SceneStepTest, StepsBeforeAFaultAreDone) {
   StandingScene standing(withSteps(
       R"({"set": {"text": "done"}, "on": "one"}, {"set": {"text": "too", "hidden": 3}, "on": "one"})"));
   EXPECT_THROW(standing.run.runSteps(), Fault);
   EXPECT_EQ(cast<Label>(standing.run.objectWithId("one"))->text()->text(), "too");
 }
 
-TEST(SceneStep, IndexedRepliesEndAtBothEnds) {
+TEST(SceneStepTest, IndexedRepliesEndAtBothEnds) {
   const std::string probe =
       R"("objects": [{"class": "Tests.SceneProbe", "id": "p", "answers": {"valueAt:for:":
       {"indexed": [5, {"raises": "broken"}]}}}, {"class": "Tests.SceneProbe", "id": "none",
@@ -114,7 +114,7 @@ TEST(SceneStep, IndexedRepliesEndAtBothEnds) {
                      raised + "-9223372036854775808\"}", raised + "0\"}", "null"}));
 }
 
-TEST(SceneStep, EnvironmentsAddUp) {
+TEST(SceneStepTest, EnvironmentsAddUp) {
   StandingScene standing(R"("environment": {"locale": "de_DE", "timeZone": "Asia/Tokyo",
         "now": "2026-03-08T09:00:00", "wheelchair": "yes", "firstDayOfWeek": 2, "energyUnit": "kJ"}, "steps": [
       {"environment": {}}, {"environment": {"timeZone": "America/New_York", "screenReader": false}},
@@ -133,7 +133,7 @@ TEST(SceneStep, EnvironmentsAddUp) {
 }
 
 // The rings of a day belong to the calendar day of whoever looks, from its first second to its last.
-TEST(SceneDays, AreThoseOfTheLocalCalendar) {
+TEST(SceneDaysTest, AreThoseOfTheLocalCalendar) {
   host::linkHost();
   using namespace std::chrono;
   const auto index = sys_days(2026y / March / 8).time_since_epoch().count();
@@ -191,7 +191,7 @@ const RegisteredClass<DottedBase> registeredBase;
 const RegisteredClass<DottedLeaf> registeredLeaf;
 
 // Names with dots in them, members of classes above, names with blanks, and one name twice.
-TEST(SceneOmissions, AreFoundUnderEveryKindOfName) {
+TEST(SceneOmissionsTest, AreFoundUnderEveryKindOfName) {
   const std::string rest = R"("objects": [{"class": "Tests.Dotted.Leaf", "id": "leaf", "set": {"_held": "x"}},
         {"class": "Tests.Dotted.Base", "id": "base"}], "steps": [
         {"ask": "own", "of": "leaf"}, {"read": "_held", "of": "leaf"}, {"ask": "inherited", "of": "leaf"},

@@ -44,7 +44,7 @@ Json readBack(const std::vector<Json>& values, const std::string& zone = "UTC",
 }
 
 // Written and read kinds are spelt alike, so that a reply can be copied into a scene.
-TEST(SceneValue, GeometryAndMeasuresReturnAsTheyAreSpelt) {
+TEST(SceneValueTest, GeometryAndMeasuresReturnAsTheyAreSpelt) {
   std::vector<Json> values;
   for (const char* text :
        {R"({"point": [-0.5, 1e-300]})", R"({"size": [0.0, 390.25]})", R"({"insets": [1.0, 2.0, 3.0, -4.0]})",
@@ -59,7 +59,7 @@ TEST(SceneValue, GeometryAndMeasuresReturnAsTheyAreSpelt) {
   for (std::size_t i = 0; i < values.size(); ++i) EXPECT_EQ(replies[i].dump(), values[i].dump());
 }
 
-TEST(SceneValue, NoNumberChangesOnItsWay) {
+TEST(SceneValueTest, NoNumberChangesOnItsWay) {
   std::mt19937_64 random(7);
   std::vector<Json> values, expected;
   const auto add = [&](const Json& value, const char* as) {
@@ -84,7 +84,7 @@ TEST(SceneValue, NoNumberChangesOnItsWay) {
   }
 }
 
-TEST(SceneValue, FloatsAreToldByTheirShortestDecimal) {
+TEST(SceneValueTest, FloatsAreToldByTheirShortestDecimal) {
   std::mt19937 random(8);
   std::vector<float> floats = {0.1F, 16777216.F, std::numeric_limits<float>::max(),
                                std::numeric_limits<float>::denorm_min(), -0.F};
@@ -117,7 +117,7 @@ std::int64_t instantOf(const std::string& iso) {
   return days * 86400 + hour * 3600 + minute * 60 + second - offset;
 }
 
-TEST(SceneValue, DatesKeepTheirInstantInEveryZone) {
+TEST(SceneValueTest, DatesKeepTheirInstantInEveryZone) {
   std::mt19937_64 random(9);
   for (const char* zone : {"America/New_York", "Asia/Kathmandu", "Pacific/Kiritimati", "Pacific/Pago_Pago",
                            "Australia/Lord_Howe", "Europe/Dublin"}) {
@@ -145,7 +145,7 @@ TEST(SceneValue, DatesKeepTheirInstantInEveryZone) {
   }
 }
 
-TEST(SceneValue, LocalTimesFollowTheClocks) {
+TEST(SceneValueTest, LocalTimesFollowTheClocks) {
   const std::pair<const char*, const char*> times[] = {
       {"2026-03-08T01:59:59", "2026-03-08T01:59:59-05:00"},
       {"2026-03-08T02:30:00", "2026-03-08T03:30:00-04:00"},  // skipped
@@ -160,7 +160,7 @@ TEST(SceneValue, LocalTimesFollowTheClocks) {
   }
 }
 
-TEST(Reply, AttributesAreCountedInTheBytesOfTheText) {
+TEST(ReplyTest, AttributesAreCountedInTheBytesOfTheText) {
   const Ref<AccessibilityAttributedString> text =
       make<AccessibilityAttributedString>("\u0635 5\u203230\u2033 \U0001F6B4");
   text->setAttributeForKeyWithRange(array({number(std::int64_t(1)), string("é")}), DurationTimeMMSS, {3, 9});
@@ -171,7 +171,7 @@ TEST(Reply, AttributesAreCountedInTheBytesOfTheText) {
             "{\"key\":\"Tone\",\"range\":[0,17],\"value\":\"all\"}]}");
 }
 
-TEST(Reply, WhatIsNoNumberIsNamed) {
+TEST(ReplyTest, WhatIsNoNumberIsNamed) {
   EXPECT_EQ(written(array({number(notANumber), number(infinity), number(-infinity)})),
             R"(["nan","inf","-inf"])");
   EXPECT_EQ(written(make<Value>(Value::Content(Rect{notANumber, -infinity, infinity, 1}))),
@@ -179,7 +179,7 @@ TEST(Reply, WhatIsNoNumberIsNamed) {
   EXPECT_EQ(written(quantity(infinity, Unit::unitFromString("kcal"))), R"({"quantity":["inf","kcal"]})");
 }
 
-TEST(Reply, ClassesAndStrangersAreKnownByName) {
+TEST(ReplyTest, ClassesAndStrangersAreKnownByName) {
   EXPECT_EQ(written(Ref<Object>(&View::staticClass())), R"({"classNamed":"View"})");
   EXPECT_EQ(written(make<Object>()), R"({"id":null,"class":"Object"})");
   EXPECT_EQ(traitNames((Traits(1) << 63) | (Traits(1) << 8) | TraitButton),

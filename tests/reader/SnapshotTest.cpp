@@ -70,7 +70,7 @@ const Node& only(const Snapshot& snapshot) {
   return snapshot.nodes().front();
 }
 
-TEST(Snapshot, ReadsRowsInTheDirectionOfTheLanguage) {
+TEST(SnapshotTest, ReadsRowsInTheDirectionOfTheLanguage) {
   const Ref<View> screen = view(
       {label("below", {0, 50, 100, 20}), label("right", {200, 2, 100, 20}), label("left", {0, 0, 100, 20})});
   EXPECT_EQ(labels(takeSnapshot(screen)), (Labels{"left", "right", "below"}));
@@ -80,7 +80,7 @@ TEST(Snapshot, ReadsRowsInTheDirectionOfTheLanguage) {
   setEnvironment({});
 }
 
-TEST(Snapshot, ReadsTheNavigationBarAroundTheTitleAndThenTheView) {
+TEST(SnapshotTest, ReadsTheNavigationBarAroundTheTitleAndThenTheView) {
   const Ref<ViewController> screen = make<ViewController>();
   screen->setTitle(string("Friends"));
   screen->setView(view({label("content")}));
@@ -95,7 +95,7 @@ TEST(Snapshot, ReadsTheNavigationBarAroundTheTitleAndThenTheView) {
   EXPECT_EQ(snapshot.nodes()[2].role, Role::button);
 }
 
-TEST(Snapshot, FollowsListedElementsAndVisitsEachOnce) {
+TEST(SnapshotTest, FollowsListedElementsAndVisitsEachOnce) {
   const Ref<View> screen = view({label("not listed")});
   const Ref<View> group = view({label("in the group")});
   const Ref<AccessibilityElement> bar = element("bar", screen);
@@ -109,12 +109,12 @@ TEST(Snapshot, FollowsListedElementsAndVisitsEachOnce) {
   messages::setAccessibilityElements(loop, nullptr);  // it held itself
 }
 
-TEST(Snapshot, EndsWhereTheHostDoesNot) {
+TEST(SnapshotTest, EndsWhereTheHostDoesNot) {
   EXPECT_TRUE(takeSnapshot(make<Endless>()).nodes().empty());
   EXPECT_TRUE(takeSnapshot(nullptr).nodes().empty());
 }
 
-TEST(Snapshot, DoesNotEnterElements) {
+TEST(SnapshotTest, DoesNotEnterElements) {
   const Ref<View> cell = view({label("inside")});
   messages::setIsAccessibilityElement(cell, true);
   messages::setAccessibilityLabel(cell, string("cell"));
@@ -122,7 +122,7 @@ TEST(Snapshot, DoesNotEnterElements) {
   EXPECT_EQ(only(takeSnapshot(cell)).label->text, "cell");
 }
 
-TEST(Snapshot, LeavesOutWhatCannotBeSeen) {
+TEST(SnapshotTest, LeavesOutWhatCannotBeSeen) {
   const Ref<Label> hidden = label("hidden");
   hidden->setHidden(true);
   const Ref<Label> badge = label("badge"), neighbour = label("neighbour");
@@ -141,7 +141,7 @@ TEST(Snapshot, LeavesOutWhatCannotBeSeen) {
   EXPECT_EQ(labels(takeSnapshot(screen)), Labels{"badge"});
 }
 
-TEST(Snapshot, ShowsOnlyTheFrontMostModalView) {
+TEST(SnapshotTest, ShowsOnlyTheFrontMostModalView) {
   const Ref<ViewController> screen = make<ViewController>();
   screen->setTitle(string("Friends"));
   const Ref<View> front = view<Curtain>({label("loading")});
@@ -154,7 +154,7 @@ TEST(Snapshot, ShowsOnlyTheFrontMostModalView) {
   EXPECT_EQ(labels(takeSnapshot(screen)), Labels{"covered"});
 }
 
-TEST(Snapshot, KeepsContainersThatSayWhatTheyAre) {
+TEST(SnapshotTest, KeepsContainersThatSayWhatTheyAre) {
   const Ref<View> named = view({label("a"), label("b", {0, 40, 100, 20})});
   messages::setAccessibilityLabel(named, string("named"));
   const Ref<View> empty = view({view({})});
@@ -169,7 +169,7 @@ TEST(Snapshot, KeepsContainersThatSayWhatTheyAre) {
   EXPECT_EQ(snapshot.topNodes(), std::vector<NodeId>{container.id});
 }
 
-TEST(Snapshot, CopiesTextsWithTheirAttributes) {
+TEST(SnapshotTest, CopiesTextsWithTheirAttributes) {
   const Ref<AccessibilityAttributedString> text = make<AccessibilityAttributedString>("Pace 330, 12 km");
   text->setAttributeForKeyWithRange(number(true), DurationTimeHHMMSS, {10, 2});
   text->setAttributeForKeyWithRange(number(true), DurationTimeMMSS, {5, 3});
@@ -184,7 +184,7 @@ TEST(Snapshot, CopiesTextsWithTheirAttributes) {
   EXPECT_EQ(node.value->attributes[1].range, (TextRange{10, 2}));
 }
 
-TEST(Snapshot, AbsorbsAndCountsWhatTheHostRaises) {
+TEST(SnapshotTest, AbsorbsAndCountsWhatTheHostRaises) {
   const Ref<View> broken = make<Broken>();
   const Snapshot snapshot = takeSnapshot(view({broken, label("whole")}));
   EXPECT_EQ(labels(snapshot), (Labels{"(nil)", "whole"}));
@@ -192,7 +192,7 @@ TEST(Snapshot, AbsorbsAndCountsWhatTheHostRaises) {
   EXPECT_EQ(snapshot.perform(Action::activate, snapshot.nodes()[0].id), ActionResult::raised);
 }
 
-TEST(Snapshot, NeverUsesAnIdTwice) {
+TEST(SnapshotTest, NeverUsesAnIdTwice) {
   const Ref<View> screen = view({label("a"), label("b")});
   std::set<NodeId> ids;
   std::size_t nodes = 0;
@@ -206,7 +206,7 @@ TEST(Snapshot, NeverUsesAnIdTwice) {
   EXPECT_EQ(takeSnapshot(screen).node(*ids.begin()), nullptr);
 }
 
-TEST(SnapshotActions, ReachTheLiveObjectWhileItLives) {
+TEST(SnapshotActionsTest, ReachTheLiveObjectWhileItLives) {
   int activations = 0;
   Ref<Label> tappable = label("tap");
   _setAccessibilityActivateBlock(tappable, [&] { return ++activations < 2; });
@@ -225,7 +225,7 @@ TEST(SnapshotActions, ReachTheLiveObjectWhileItLives) {
   EXPECT_EQ(activations, 2);
 }
 
-TEST(SnapshotActions, MovePagesAndRefuseWhatIsDisabled) {
+TEST(SnapshotActionsTest, MovePagesAndRefuseWhatIsDisabled) {
   const Ref<PageControl> pages = make<PageControl>();
   pages->setNumberOfPages(3);
   Snapshot snapshot = takeSnapshot(pages);

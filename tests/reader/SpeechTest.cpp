@@ -8,7 +8,7 @@ namespace ax::reader::testing {
 
 namespace {
 
-TEST(Speech, TakesTheVoiceOfTheLanguage) {
+TEST(SpeechTest, TakesTheVoiceOfTheLanguage) {
   for (const char* locale : {"en_US", "en", "de_DE", "de_AT", "fr_CA", "es_MX", "ar_EG"}) {
     EXPECT_TRUE(hasVoice(locale)) << locale;
   }
@@ -24,7 +24,7 @@ TEST(Speech, TakesTheVoiceOfTheLanguage) {
   EXPECT_NEAR(speakingTime("١٬٣٣٧\u200F", "ar_EG"), speakingTime("1337", "ar_EG"), 0.05);
 }
 
-TEST(Speech, TakesAsLongAsItsSound) {
+TEST(SpeechTest, TakesAsLongAsItsSound) {
   const std::string line = "Heart rate, from 60 to 189 beats per minute, chart";
   const double seconds = speakingTime(line, "en_US");
   EXPECT_GT(seconds, 2.5);

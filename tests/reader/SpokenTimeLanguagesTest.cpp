@@ -34,7 +34,7 @@ constexpr Language languages[] = {
     {"ar_EG", "٥ دقائق وثانية واحدة", "ساعة واحدة ودقيقة واحدة وثانيتان", "٦١ دقيقة وثانيتان"},
 };
 
-TEST(SpokenTimeLanguages, SpeakInWholeWords) {
+TEST(SpokenTimeLanguagesTest, SpeakInWholeWords) {
   for (const Language& language : languages) {
     const RegionScope region(language.locale);
     EXPECT_EQ(withTime("", "5:01", "", DurationTimeHHMMSS), language.minutes) << language.locale;
@@ -58,7 +58,7 @@ std::string inDigitsOf(const std::string& locale, const std::string& text) {
 }
 
 // However a time is written, it is spoken alike, and nothing of what stands around it is lost.
-TEST(SpokenTimeLanguages, SpeakEveryWritingOfATimeAlike) {
+TEST(SpokenTimeLanguagesTest, SpeakEveryWritingOfATimeAlike) {
   std::mt19937 random(10);
   for (const Language& language : languages) {
     const RegionScope region(language.locale);
@@ -80,7 +80,7 @@ TEST(SpokenTimeLanguages, SpeakEveryWritingOfATimeAlike) {
   }
 }
 
-TEST(SpokenTimeLanguages, RoundFractionsOnce) {
+TEST(SpokenTimeLanguagesTest, RoundFractionsOnce) {
   const RegionScope region("en_US");
   EXPECT_EQ(withTime("", "59.5", "", DurationTimeMMSS), "1 minute");
   EXPECT_EQ(withTime("", "0:59.4", "", DurationTimeMMSS), "59 seconds");
@@ -89,7 +89,7 @@ TEST(SpokenTimeLanguages, RoundFractionsOnce) {
   EXPECT_EQ(withTime("", "3599.5", "", DurationTimeMMSS), "60 minutes") << "as a pace, not an hour";
 }
 
-TEST(SpokenTimeLanguages, TheWordsOfTheReaderChangeWithTheLanguageAndTheTextsDoNot) {
+TEST(SpokenTimeLanguagesTest, TheWordsOfTheReaderChangeWithTheLanguageAndTheTextsDoNot) {
   const Ref<View> screen = view({button("OK")});
   const Snapshot snapshot = takeSnapshot(screen);
   const std::pair<const char*, const char*> words[] = {{"en_US", "OK, button"}, {"de_DE", "OK, Taste"},

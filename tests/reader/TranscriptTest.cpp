@@ -35,7 +35,7 @@ std::string withTime(const char* text, Key key, TextRange range) {
   return withSpokenTimes(attributedText(*attributed));
 }
 
-TEST(SpokenLine, SaysLabelValueRolesStatesAndHintInThisOrder) {
+TEST(SpokenLineTest, SaysLabelValueRolesStatesAndHintInThisOrder) {
   EXPECT_EQ(spoken(described("Share", "3", TraitButton | TraitSelected | TraitNotEnabled, "Opens a list")),
             "Share, 3, button, selected, not available, Opens a list");
   EXPECT_EQ(spoken(described("Today", "", TraitHeader | TraitStaticText, "")), "Today, heading");
@@ -43,18 +43,18 @@ TEST(SpokenLine, SaysLabelValueRolesStatesAndHintInThisOrder) {
   EXPECT_EQ(spoken(described("", "", 0, "")), "");
 }
 
-TEST(SpokenLine, SaysNothingTwice) {
+TEST(SpokenLineTest, SaysNothingTwice) {
   EXPECT_EQ(spoken(described("42", "42", 0, "42")), "42");
   EXPECT_EQ(spoken(described("Move, 5 minutes", "5 minutes", TraitButton, "button")),
             "Move, 5 minutes, button");
   EXPECT_EQ(spoken(described("Lap 11", "1", 0, "Lap")), "Lap 11, 1, Lap");
 }
 
-TEST(SpokenLine, IsOneLineWithoutStrayBlanks) {
+TEST(SpokenLineTest, IsOneLineWithoutStrayBlanks) {
   EXPECT_EQ(spoken(described(" First\nsecond \r\n third  ", " \t", 0, "\n")), "First, second, third");
 }
 
-TEST(SpokenLine, SpeaksTheReadersLanguage) {
+TEST(SpokenLineTest, SpeaksTheReadersLanguage) {
   setEnvironment({.locale = "ja_JP"});
   EXPECT_EQ(spoken(described("共有", "三", TraitButton, "")).substr(0, 12), "共有、三");
   setEnvironment({.locale = "ar_EG"});
@@ -62,7 +62,7 @@ TEST(SpokenLine, SpeaksTheReadersLanguage) {
   setEnvironment({});
 }
 
-TEST(SpokenTime, CountsSecondsMinutesAndHours) {
+TEST(SpokenTimeTest, CountsSecondsMinutesAndHours) {
   EXPECT_EQ(secondsFromText("330"), 330);
   EXPECT_EQ(secondsFromText("42:10"), 2530);
   EXPECT_EQ(secondsFromText(" 1:05:30 "), 3930);
@@ -73,14 +73,14 @@ TEST(SpokenTime, CountsSecondsMinutesAndHours) {
   }
 }
 
-TEST(SpokenTime, UnderstandsTheDigitsOfTheRegion) {
+TEST(SpokenTimeTest, UnderstandsTheDigitsOfTheRegion) {
   const RegionScope region("ar_EG");
   EXPECT_EQ(secondsFromText("\u200f٤٢:١٠"), 2530);
   EXPECT_EQ(secondsFromText("٣٣٠"), 330);
   EXPECT_EQ(secondsFromText("42:10"), 2530);
 }
 
-TEST(SpokenTime, ReplacesTheMarkedRangeAlone) {
+TEST(SpokenTimeTest, ReplacesTheMarkedRangeAlone) {
   EXPECT_EQ(withTime("330 per mile", DurationTimeMMSS, {0, 3}), "5 minutes, 30 seconds per mile");
   EXPECT_EQ(withTime("Total 1:05:30.", DurationTimeHHMMSS, {6, 7}), "Total 1 hour, 5 minutes, 30 seconds.");
   EXPECT_EQ(withTime("12:34", DurationTimeHHMMSS, {0, 5}), "12 minutes, 34 seconds");
@@ -92,7 +92,7 @@ TEST(SpokenTime, ReplacesTheMarkedRangeAlone) {
   EXPECT_EQ(withTime("3700", DurationTimeHHMMSS, {0, 4}), "1 hour, 1 minute, 40 seconds");
 }
 
-TEST(SpokenTime, ReplacesSeveralRangesAndIgnoresOverlaps) {
+TEST(SpokenTimeTest, ReplacesSeveralRangesAndIgnoresOverlaps) {
   const Ref<AccessibilityAttributedString> text = make<AccessibilityAttributedString>("1:00 ä 2:00");
   text->setAttributeForKeyWithRange(number(true), DurationTimeMMSS, {8, 4});
   text->setAttributeForKeyWithRange(number(true), DurationTimeMMSS, {0, 4});
@@ -124,23 +124,23 @@ class Row : public Label {
   bool isOpen = false;
 };
 
-TEST(Transcript, BeginsWithTheTitle) {
+TEST(TranscriptTest, BeginsWithTheTitle) {
   EXPECT_EQ(transcript(takeSnapshot(label("Hello")), "Day"), (Lines{"Screen: Day", "Hello"}));
   EXPECT_EQ(transcript(takeSnapshot(nullptr), ""), (Lines{"Screen without a title", "Nothing to speak"}));
 }
 
-TEST(Transcript, LeavesOutElementsThatSayNothing) {
+TEST(TranscriptTest, LeavesOutElementsThatSayNothing) {
   const Ref<View> screen = view({label("a"), label(" ", {0, 40, 100, 20})});
   EXPECT_EQ(transcript(takeSnapshot(screen), "T"), (Lines{"Screen: T", "a"}));
 }
 
-TEST(Transcript, TellsOnceThatTheRestIsCovered) {
+TEST(TranscriptTest, TellsOnceThatTheRestIsCovered) {
   const Ref<View> screen = view({view<Sheet>({label("Loading"), label("Please wait", {0, 40, 100, 20})})});
   EXPECT_EQ(transcript(takeSnapshot(screen), "T"),
             (Lines{"Screen: T", "Loading, covers the rest of the screen", "Please wait"}));
 }
 
-TEST(Transcript, TellsWhatIsOpenAndWhatIsClosed) {
+TEST(TranscriptTest, TellsWhatIsOpenAndWhatIsClosed) {
   const Ref<Row> row = make<Row>();
   row->setText(string("Splits"));
   EXPECT_EQ(spoken(row), "Splits, collapsed");

@@ -37,7 +37,7 @@ Result unpackAll(const std::string& bytes, bool readsDamaged = false) {
 
 using Files = std::vector<std::pair<std::string, std::string>>;
 
-TEST(Unpacking, HandsOverWhatIsPackedAndWhatIsNot) {
+TEST(UnpackingTest, HandsOverWhatIsPackedAndWhatIsNot) {
   EXPECT_EQ(unpackAll("plain").files, (Files{{"a", "plain"}}));
   EXPECT_EQ(unpackAll(gzipped("one") + gzipped(" two")).files, (Files{{"a", "one two"}}));
   const Files packed = {{"rides/b.tcx", "<b/>"},
@@ -48,7 +48,7 @@ TEST(Unpacking, HandsOverWhatIsPackedAndWhatIsNot) {
   EXPECT_EQ(unpackAll(zipped(packed)).files, (Files{{"a/rides/b.tcx", "<b/>"}, {"a/c.fit.gz", "fit"}}));
 }
 
-TEST(Unpacking, TellsWhatIsDamaged) {
+TEST(UnpackingTest, TellsWhatIsDamaged) {
   const std::string whole = gzipped(std::string(5000, 'x') + "end");
   const std::string cut = whole.substr(0, whole.size() - 9);
   EXPECT_EQ(unpackAll(cut).thrown, "the archive is cut off");
@@ -69,7 +69,7 @@ TEST(Unpacking, TellsWhatIsDamaged) {
   EXPECT_TRUE(unpackAll(two.substr(0, two.size() / 2)).thrown.starts_with("the archive cannot be opened"));
 }
 
-TEST(Unpacking, BoundsBombs) {
+TEST(UnpackingTest, BoundsBombs) {
   const std::string large(60 << 20, '\0');
   const std::string bomb = gzipped(large);
   ASSERT_LT(bomb.size() * 200, large.size());
@@ -81,7 +81,7 @@ TEST(Unpacking, BoundsBombs) {
       << "all files of an archive count together";
 }
 
-TEST(Unpacking, HoldsAgainstAnyBytes) {
+TEST(UnpackingTest, HoldsAgainstAnyBytes) {
   std::mt19937 random(20261123);
   const std::string packed[] = {gzipped(std::string(500, 'x') + "end"),
                                 zipped({{"a.gz", gzipped("inner")}, {"b", std::string(200, 'b')}})};
@@ -97,7 +97,7 @@ TEST(Unpacking, HoldsAgainstAnyBytes) {
   }
 }
 
-TEST(FileKind, TellsFilesByTheirFirstBytes) {
+TEST(FileKindTest, TellsFilesByTheirFirstBytes) {
   using namespace std::string_literals;
   const std::pair<std::string, std::string> names[] = {
       {"", "an empty file"},

@@ -89,7 +89,7 @@ constexpr std::string_view pausedRun = R"(
  </t:Activity>
 </t:Activities></t:TrainingCenterDatabase>)";
 
-TEST(TcxFile, ReadsLapsPausesAndPrefixedElements) {
+TEST(TcxFileTest, ReadsLapsPausesAndPrefixedElements) {
   const WorkoutActivity run = readOne(pausedRun);
   EXPECT_EQ(run.title, "Along the canal");
   EXPECT_EQ(run.sport, "running");
@@ -114,7 +114,7 @@ TEST(TcxFile, ReadsLapsPausesAndPrefixedElements) {
   EXPECT_EQ(run.segments[1].count, 1U);
 }
 
-TEST(TcxFile, LeavesOutValuesThatCannotBe) {
+TEST(TcxFileTest, LeavesOutValuesThatCannotBe) {
   for (const char* rate : {"0", "-3", "nan", "inf", "1e999", "12,5", "12 bpm", "256", ""}) {
     const auto beats = "<HeartRateBpm><Value>" + std::string(rate) + "</Value></HeartRateBpm>";
     const auto run = readOne(inLap("<Track>" + tcxPoint(0, beats + position("60", "+10")) + "</Track>"));
@@ -128,7 +128,7 @@ TEST(TcxFile, LeavesOutValuesThatCannotBe) {
   }
 }
 
-TEST(TcxFile, MeasuresWhatTheLapsDoNotTell) {
+TEST(TcxFileTest, MeasuresWhatTheLapsDoNotTell) {
   const std::string recorded = "<Track>" + tcxPoint(0, "<DistanceMeters>5</DistanceMeters>") + tcxPoint(9) +
                                tcxPoint(20, "<DistanceMeters>70</DistanceMeters>") + "</Track>";
   const auto zeroLap = readOne(inLap("<DistanceMeters>0.0</DistanceMeters>" + recorded));
@@ -154,7 +154,7 @@ TEST(TcxFile, MeasuresWhatTheLapsDoNotTell) {
   EXPECT_EQ(still.metres, 0);
 }
 
-TEST(TcxFile, MeasuresLapsThatCountFromZeroAgain) {
+TEST(TcxFileTest, MeasuresLapsThatCountFromZeroAgain) {
   const auto track = [](const char* metres, int second) {
     return "<Track>" + tcxPoint(second, "<DistanceMeters>" + std::string(metres) + "</DistanceMeters>") +
            "</Track></Lap>";
@@ -168,7 +168,7 @@ TEST(TcxFile, MeasuresLapsThatCountFromZeroAgain) {
   EXPECT_EQ(run.laps[2].metres, 100);
 }
 
-TEST(TcxFile, TakesTheFiguresOfItsLaps) {
+TEST(TcxFileTest, TakesTheFiguresOfItsLaps) {
   const auto lap = [](const char* seconds, const char* figures) {
     return "<Lap StartTime='2026-03-08T07:00:00Z'><TotalTimeSeconds>" + std::string(seconds) +
            "</TotalTimeSeconds>" + figures + "<Track>" +
@@ -189,7 +189,7 @@ TEST(TcxFile, TakesTheFiguresOfItsLaps) {
   EXPECT_TRUE(run.laps[1].isRest);
 }
 
-TEST(TcxFile, BeginsTheDistanceOfEachActivityAtZero) {
+TEST(TcxFileTest, BeginsTheDistanceOfEachActivityAtZero) {
   const auto activity = [](int from, int to) {
     const auto at = [](int metres) {
       return "<DistanceMeters>" + std::to_string(metres) + "</DistanceMeters>";
@@ -204,7 +204,7 @@ TEST(TcxFile, BeginsTheDistanceOfEachActivityAtZero) {
   EXPECT_EQ(file.activities[2].laps[0].metres, 70) << "this one counts anew";
 }
 
-TEST(TcxFile, TakesTimesInAnyOrder) {
+TEST(TcxFileTest, TakesTimesInAnyOrder) {
   const auto run = readOne(inLap("<Track>" + tcxPoint(30) + tcxPoint(10) + tcxPoint(10) + tcxPoint(50) +
                                  tcxPoint(40) + "</Track>"));
   EXPECT_EQ(run.start, seven + 10);
@@ -213,7 +213,7 @@ TEST(TcxFile, TakesTimesInAnyOrder) {
   EXPECT_EQ(run.points[0].time, seven + 30);
 }
 
-TEST(TcxFile, ReadsEveryActivityThatTellsSomething) {
+TEST(TcxFileTest, ReadsEveryActivityThatTellsSomething) {
   const std::string lap = "<Lap StartTime='2026-03-08T07:00:00Z'><TotalTimeSeconds>600</TotalTimeSeconds>";
   const std::string leg =
       "<Activity Sport='Swimming'>" + lap + "<Track>" + tcxPoint(1) + "</Track></Lap></Activity>";
@@ -230,7 +230,7 @@ TEST(TcxFile, ReadsEveryActivityThatTellsSomething) {
   EXPECT_EQ(file.activities[2].sourceName, "Log");
 }
 
-TEST(GpxFile, ReadsTracksSegmentsAndHeartRates) {
+TEST(GpxFileTest, ReadsTracksSegmentsAndHeartRates) {
   const std::string direct = "<extensions><hr>100</hr></extensions>";
   const std::string nested =
       "<g:extensions><p:TrackPointExtension><p:atemp>9</p:atemp><p:hr> 101.5 </p:hr>"
@@ -265,7 +265,7 @@ TEST(GpxFile, ReadsTracksSegmentsAndHeartRates) {
   EXPECT_EQ(file.activities[1].start, seven);
 }
 
-TEST(GpxFile, CountsTheWholeSpanWhenEverySegmentIsOnePoint) {
+TEST(GpxFileTest, CountsTheWholeSpanWhenEverySegmentIsOnePoint) {
   const auto walk =
       readOne(inGpx("<trk><type>walking</type><trkseg>" + gpxPoint("50", "2026-03-08T07:00:00Z") +
                     "</trkseg><trkseg>" + gpxPoint("50", "2026-03-08T07:10:00Z") + "</trkseg></trk>"));
@@ -273,7 +273,7 @@ TEST(GpxFile, CountsTheWholeSpanWhenEverySegmentIsOnePoint) {
 }
 
 // A hundredth of a thousandth of a degree is 1.1 m.
-TEST(GpxFile, LeavesOutTheTimeInWhichNobodyMovedAndNothingWasWritten) {
+TEST(GpxFileTest, LeavesOutTheTimeInWhichNobodyMovedAndNothingWasWritten) {
   const auto at = [](const char* latitude, const char* clock, const std::string& more = "") {
     return gpxPoint(latitude, "2026-03-08T07:" + std::string(clock) + "Z", more);
   };
@@ -286,7 +286,7 @@ TEST(GpxFile, LeavesOutTheTimeInWhichNobodyMovedAndNothingWasWritten) {
   EXPECT_EQ(ride.duration, 380);
 }
 
-TEST(GpxFile, WeighsHeartRatesByTimeAndClimbsByWhatIsMoreThanNoise) {
+TEST(GpxFileTest, WeighsHeartRatesByTimeAndClimbsByWhatIsMoreThanNoise) {
   const auto hr = [](const char* rate, const std::string& altitude) {
     return "<ele>" + altitude + "</ele><extensions><hr>" + rate +
            "</hr><cad>80</cad><power>200</power></extensions>";
@@ -309,7 +309,7 @@ TEST(GpxFile, WeighsHeartRatesByTimeAndClimbsByWhatIsMoreThanNoise) {
   EXPECT_EQ(walk.secondsEastOfUtc, -5 * 3600);
 }
 
-TEST(WorkoutFileReader, UnderstandsTheEncodingsThatFilesComeIn) {
+TEST(WorkoutFileReaderTest, UnderstandsTheEncodingsThatFilesComeIn) {
   const std::string start = "<?xml version='1.0'?>" + inGpx("<trk><name>Caf");
   const std::string cut = start.substr(0, start.size() - std::string("</gpx>").size());
   const std::string rest =
@@ -337,7 +337,7 @@ struct FaultCase {
   std::string bytes, what, place, expected;
 };
 
-TEST(WorkoutFileReader, TellsWhatIsWrongWithAFileAndWhere) {
+TEST(WorkoutFileReaderTest, TellsWhatIsWrongWithAFileAndWhere) {
   const FaultCase cases[] = {
       {" ", "there is no element", "line 1, column 1", "an XML document"},
       {"<?xml version='1.0'?>\n <k:kml xmlns:k='u'/>", "the root element is kml", "line 2, column 3",
@@ -368,7 +368,7 @@ TEST(WorkoutFileReader, TellsWhatIsWrongWithAFileAndWhere) {
   }
 }
 
-TEST(WorkoutFileReader, BoundsWhatElementsMayTake) {
+TEST(WorkoutFileReaderTest, BoundsWhatElementsMayTake) {
   std::string deep;
   for (int i = 0; i < 101; ++i) deep += "<a>";
   const WorkoutFileResult nested = readWorkoutFile(deep, "deep");
@@ -389,7 +389,7 @@ TEST(WorkoutFileReader, BoundsWhatElementsMayTake) {
       seven);
 }
 
-TEST(WorkoutFileReader, ReadsADamagedFileAsFarAsItGoesWhenAsked) {
+TEST(WorkoutFileReaderTest, ReadsADamagedFileAsFarAsItGoesWhenAsked) {
   const std::string cut = "<gpx><trk><trkseg>" + gpxPoint("50", "2026-03-08T07:00:00Z") +
                           gpxPoint("50.001", "2026-03-08T07:01:00Z");
   const WorkoutFileResult result = readWorkoutFile(cut, "cut.gpx", {.readsDamaged = true});
@@ -401,14 +401,14 @@ TEST(WorkoutFileReader, ReadsADamagedFileAsFarAsItGoesWhenAsked) {
   EXPECT_EQ(file->damage->what, "the file is cut off");
 }
 
-TEST(WorkoutFileReader, RefusesAFileCutAnywhere) {
+TEST(WorkoutFileReaderTest, RefusesAFileCutAnywhere) {
   for (std::size_t length = 0; length < pausedRun.size(); ++length) {
     const WorkoutFileResult result = readWorkoutFile(pausedRun.substr(0, length), "test");
     ASSERT_TRUE(std::holds_alternative<WorkoutFileFault>(result)) << length;
   }
 }
 
-TEST(WorkoutTime, IsInUtcUnlessTheFileTellsAnOffset) {
+TEST(WorkoutTimeTest, IsInUtcUnlessTheFileTellsAnOffset) {
   const auto parsed = [](const char* text) { return parseTime(text).value_or(FileTime{}); };
   for (const char* text : {"2026-03-08T07:00:00", " 2026-03-08T07:00:00Z\n", "2026-03-07T23:00:00-0800"}) {
     EXPECT_EQ(parsed(text).time, seven) << text;
@@ -418,7 +418,7 @@ TEST(WorkoutTime, IsInUtcUnlessTheFileTellsAnOffset) {
   EXPECT_FALSE(parseTime("2026-03-08")) << "a day is no moment";
 }
 
-TEST(WorkoutSport, KnowsTheWordsOfFiles) {
+TEST(WorkoutSportTest, KnowsTheWordsOfFiles) {
   const std::pair<const char*, const char*> cases[] = {{"Running", "running"},
                                                        {"TrailRun", "running"},
                                                        {"Biking", "cycling"},

@@ -108,7 +108,7 @@ std::string poolSwim() {
 }
 
 // With AXVELTO_WRITE_SAMPLES in the environment it is written anew.
-TEST(FitFile, IsTheSampleOfThePool) {
+TEST(FitFileTest, IsTheSampleOfThePool) {
   const auto sample = tour::samplesFolder() / "workouts/pool-swim.fit";
   if (std::getenv("AXVELTO_WRITE_SAMPLES") != nullptr) {
     std::ofstream(sample, std::ios::binary) << poolSwim();
@@ -116,7 +116,7 @@ TEST(FitFile, IsTheSampleOfThePool) {
   EXPECT_TRUE(tour::fileText(sample) == poolSwim());
 }
 
-TEST(WorkoutScene, RoundsADistanceOnceWhenItIsSpoken) {
+TEST(WorkoutSceneTest, RoundsADistanceOnceWhenItIsSpoken) {
   WorkoutActivity activity = fileOf(ride(false, 14)).activities.at(0);
   const std::pair<double, const char*> distances[] = {
       {15964.9, "Distance, Total, 15.96 k"}, {15964.999, "15.96 k"}, {15965, "Distance, Total, 15.97 k"}};
@@ -126,7 +126,7 @@ TEST(WorkoutScene, RoundsADistanceOnceWhenItIsSpoken) {
   }
 }
 
-TEST(FitFile, TellsASessionInEitherByteOrder) {
+TEST(FitFileTest, TellsASessionInEitherByteOrder) {
   for (const bool isBigEndian : {false, true}) {
     const WorkoutFile file = fileOf(ride(isBigEndian, isBigEndian ? 12 : 14));
     ASSERT_EQ(file.activities.size(), 1U);
@@ -158,7 +158,7 @@ TEST(FitFile, TellsASessionInEitherByteOrder) {
   }
 }
 
-TEST(FitFile, WorksFiguresOutWhereNoSessionTellsThem) {
+TEST(FitFileTest, WorksFiguresOutWhereNoSessionTellsThem) {
   FitWriter file;
   defineRecords(file);
   // The time goes on by compressed headers, over the end of their five bits.
@@ -175,7 +175,7 @@ TEST(FitFile, WorksFiguresOutWhereNoSessionTellsThem) {
 }
 
 // A swim, a change of clothes and a ride, in one file; distances count on.
-TEST(FitFile, MakesAWorkoutOfEachSession) {
+TEST(FitFileTest, MakesAWorkoutOfEachSession) {
   FitWriter file;
   file.define(0, 20, {{253, fitU32, 4}, {3, fitU8, 1}, {5, fitU32, 4}});
   for (int second = 0; second < 300; second += 10)
@@ -213,7 +213,7 @@ struct DamageCase {
   std::string bytes, what, place;
 };
 
-TEST(FitFile, TellsDamageAndItsPlace) {
+TEST(FitFileTest, TellsDamageAndItsPlace) {
   const std::string whole = ride(false, 14);
   std::string flipped = whole;
   flipped[whole.size() - 20] ^= 1;
@@ -244,14 +244,14 @@ TEST(FitFile, TellsDamageAndItsPlace) {
   EXPECT_EQ(partial->damage.value_or(WorkoutFileFault{}).place, "byte 300");
 }
 
-TEST(FitFile, ReadsChainedFilesOneAfterTheOther) {
+TEST(FitFileTest, ReadsChainedFilesOneAfterTheOther) {
   const WorkoutFile both = fileOf(ride(false, 14) + ride(true, 12));
   ASSERT_EQ(both.activities.size(), 2U);
   EXPECT_EQ(both.activities[1].metres, 401.23);
 }
 
 // Whatever bytes change, the reader answers, and with figures that can be.
-TEST(FitFile, HoldsAgainstAnyBytes) {
+TEST(FitFileTest, HoldsAgainstAnyBytes) {
   const std::string whole = ride(false, 12);
   std::mt19937 random(20261123);
   for (int run = 0; run < 3000; ++run) {

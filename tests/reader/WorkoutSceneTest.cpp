@@ -72,7 +72,7 @@ std::string faultOf(const Json& scene) {
   return "";
 }
 
-TEST(WorkoutScene, HasEveryRowOfAFullWorkout) {
+TEST(WorkoutSceneTest, HasEveryRowOfAFullWorkout) {
   const Json scene = sceneOfFile(fileOf(tcx(run())), {.locale = "de_DE", .timeZone = "Asia/Tokyo"});
   EXPECT_EQ(faultOf(scene), "");
   EXPECT_EQ(rowsOf(scene),
@@ -99,7 +99,7 @@ TEST(WorkoutScene, HasEveryRowOfAFullWorkout) {
   EXPECT_EQ(figure(scene, "figure.started")["date"], "2026-04-01T08:50:00+09:00");
 }
 
-TEST(WorkoutScene, CountsInTheUnitOfTheRegion) {
+TEST(WorkoutSceneTest, CountsInTheUnitOfTheRegion) {
   const WorkoutFile file = fileOf(tcx(run()));
   const auto unitWith = [&](const WorkoutSceneOptions& options) {
     return all(sceneOfFile(file, options), "Workout")[0]["totalDistance"]["quantity"][1].get<std::string>();
@@ -113,7 +113,7 @@ TEST(WorkoutScene, CountsInTheUnitOfTheRegion) {
   EXPECT_EQ(unitWith({.locale = "de_DE", .units = DistanceUnits::imperial}), "mi");
 }
 
-TEST(WorkoutScene, LeavesOutWhatTheFileDoesNotTell) {
+TEST(WorkoutSceneTest, LeavesOutWhatTheFileDoesNotTell) {
   const Json scene = sceneOfFile(fileOf(tcx(bareActivity("Other", "2026-03-08T07:00:00Z"))));
   EXPECT_EQ(faultOf(scene), "");
   EXPECT_EQ(rowsOf(scene),
@@ -134,7 +134,7 @@ TEST(WorkoutScene, LeavesOutWhatTheFileDoesNotTell) {
   EXPECT_EQ(all(ride, "_CHWorkoutDetailMapView").size(), 1u);
 }
 
-TEST(WorkoutScene, SeveralWorkoutsMakeAListAndEachAScreen) {
+TEST(WorkoutSceneTest, SeveralWorkoutsMakeAListAndEachAScreen) {
   const WorkoutFile file = fileOf(tcx(activity("Biking", lap("2026-03-07T07:00:00Z", 60, 500, "")) + run() +
                                       bareActivity("Other", "2026-03-09T07:00:00Z")));
   const Json list = sceneOfFile(file);
@@ -146,7 +146,7 @@ TEST(WorkoutScene, SeveralWorkoutsMakeAListAndEachAScreen) {
   EXPECT_EQ(bare["screen"]["set"]["title"]["localized"], "workout.cycling");
 }
 
-TEST(WorkoutScene, ThinsOutMoreReadingsThanAChartShows) {
+TEST(WorkoutSceneTest, ThinsOutMoreReadingsThanAChartShows) {
   WorkoutActivity ride = fileOf(tcx(run())).activities.front();
   ride.points.clear();
   for (int i = 0; i < 50000; ++i) {
@@ -182,7 +182,7 @@ std::string steadyRun() {
   return activity("Running", lap("2026-03-08T07:00:00Z", 800, 2400, points));
 }
 
-TEST(WorkoutScene, HasTheFilesHeartRateInEachSliceOfTheChart) {
+TEST(WorkoutSceneTest, HasTheFilesHeartRateInEachSliceOfTheChart) {
   const Scene scene = readScene(sceneOfFile(fileOf(tcx(steadyRun()))).dump(), "steady run");
   const SceneRun run(scene, {.modulePath = tour::modulePath()});
   const Ref<Object> chart = run.objectWithId("heart-rate");
@@ -201,7 +201,7 @@ TEST(WorkoutScene, HasTheFilesHeartRateInEachSliceOfTheChart) {
   }
 }
 
-TEST(WorkoutListScene, GroupsByTheMonthOfTheTimeZone) {
+TEST(WorkoutListSceneTest, GroupsByTheMonthOfTheTimeZone) {
   const std::vector<WorkoutActivity> files =
       fileOf(tcx(bareActivity("Other", "2026-03-08T07:00:00Z") + run() +
                  bareActivity("Other", "2025-04-08T07:00:00Z")))
@@ -223,7 +223,7 @@ TEST(WorkoutListScene, GroupsByTheMonthOfTheTimeZone) {
   EXPECT_EQ(scene["environment"]["now"], "2026-04-01T00:05:00+00:00");
 }
 
-TEST(WorkoutScene, LeavesTheRegionOfTheProcessAlone) {
+TEST(WorkoutSceneTest, LeavesTheRegionOfTheProcessAlone) {
   const formatting::Region before = formatting::currentRegion();
   sceneOfFile(fileOf(tcx(run())), {.locale = "ja_JP", .timeZone = "Asia/Tokyo"});
   EXPECT_EQ(formatting::currentRegion(), before);

@@ -35,7 +35,7 @@ std::string spoken(const Json& json) {
 }
 
 // Twenty minutes from each start, told by the clocks of New York.
-TEST(WorkoutTimes, FollowTheClocksOfTheZone) {
+TEST(WorkoutTimesTest, FollowTheClocksOfTheZone) {
   const std::tuple<std::string, std::string, std::string, std::string> workouts[] = {
       {"2026-03-08T06:50:00Z", "2026-03-08T07:10:00Z", "2026-03-08T01:50:00-05:00",
        "2026-03-08T03:10:00-04:00"},
@@ -59,7 +59,7 @@ TEST(WorkoutTimes, FollowTheClocksOfTheZone) {
 }
 
 // One over midnight, at the end of a month, belongs to the month in which it begins.
-TEST(WorkoutTimes, OverMidnightCountWhereTheyBegin) {
+TEST(WorkoutTimesTest, OverMidnightCountWhereTheyBegin) {
   const std::string night = track(point("2026-03-31T23:50:00Z") + point("2026-04-01T00:10:00Z"));
   const std::string morning = track(point("2026-04-01T07:00:00Z") + point("2026-04-01T07:10:00Z"));
   const Json scene = workoutListScene(fileOf(gpx(night + morning)).activities, {.timeZone = "UTC"});
@@ -72,7 +72,7 @@ TEST(WorkoutTimes, OverMidnightCountWhereTheyBegin) {
   EXPECT_NE(text.find("March"), std::string::npos) << text;
 }
 
-TEST(WorkoutTimes, TracksOfOneFileAreWorkoutsOfTheirOwn) {
+TEST(WorkoutTimesTest, TracksOfOneFileAreWorkoutsOfTheirOwn) {
   const std::string first = track(point("2026-03-08T07:00:00Z") + point("2026-03-08T07:10:00Z"), "First");
   const std::string second = track(point("2026-03-09T07:00:00Z") + point("2026-03-09T07:30:00Z"), "Second");
   const WorkoutFile file = fileOf(gpx(first + second));
@@ -87,7 +87,7 @@ TEST(WorkoutTimes, TracksOfOneFileAreWorkoutsOfTheirOwn) {
 }
 
 // A run in the evening of New York is none of the next day, nor one beside it that was begun in Berlin.
-TEST(WorkoutTimes, AreToldByTheClockOfTheFile) {
+TEST(WorkoutTimesTest, AreToldByTheClockOfTheFile) {
   const WorkoutFile evening =
       fileOf(gpx(track(point("2026-03-08T21:44:00-05:00") + point("2026-03-08T22:00:00-05:00", 50.01))));
   EXPECT_NE(spoken(sceneOfFile(evening)).find("Sunday, March 8, 2026 at 9:44"), std::string::npos)
@@ -101,7 +101,7 @@ TEST(WorkoutTimes, AreToldByTheClockOfTheFile) {
   EXPECT_NE(list.find("Sunday, March 8"), std::string::npos) << list;
 }
 
-TEST(WorkoutTimes, UnknownHeartRatesCountNeitherAsBeatsNorAsNothing) {
+TEST(WorkoutTimesTest, UnknownHeartRatesCountNeitherAsBeatsNorAsNothing) {
   std::mt19937 random(11);
   for (int run = 0; run < 20; ++run) {
     std::string points;
@@ -138,7 +138,7 @@ TEST(WorkoutTimes, UnknownHeartRatesCountNeitherAsBeatsNorAsNothing) {
 }
 
 // A degree of latitude is some 111 kilometres, and the words are those of the region.
-TEST(WorkoutTimes, DistancesAreSpokenInTheUnitsOfTheRegion) {
+TEST(WorkoutTimesTest, DistancesAreSpokenInTheUnitsOfTheRegion) {
   const WorkoutFile file =
       fileOf(gpx(track(point("2026-03-08T07:00:00Z", 50) + point("2026-03-08T08:00:00Z", 50.1))));
   const std::pair<const char*, const char*> regions[] = {

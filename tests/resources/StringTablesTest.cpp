@@ -225,7 +225,7 @@ bool hasArgument(const UnicodeString& text, const std::set<UMessagePatternArgTyp
   return false;
 }
 
-class StringTables : public testing::TestWithParam<TablePlace> {
+class StringTablesTest : public testing::TestWithParam<TablePlace> {
  protected:
   const Table english = load(GetParam(), "root");
 
@@ -241,7 +241,7 @@ class StringTables : public testing::TestWithParam<TablePlace> {
   }
 };
 
-TEST_P(StringTables, HoldTheSameKeysAndArgumentsInEveryLanguage) {
+TEST_P(StringTablesTest, HoldTheSameKeysAndArgumentsInEveryLanguage) {
   EXPECT_EQ(formatting::tableLanguages(folderOf(GetParam())), languages());
   for (const std::string& language : languages()) {
     SCOPED_TRACE(language);
@@ -259,7 +259,7 @@ TEST_P(StringTables, HoldTheSameKeysAndArgumentsInEveryLanguage) {
   });
 }
 
-TEST_P(StringTables, HaveThePluralFormsOfTheirLanguage) {
+TEST_P(StringTablesTest, HaveThePluralFormsOfTheirLanguage) {
   everyText([](const std::string& language, const std::string&, const UnicodeString& value) {
     UErrorCode status = U_ZERO_ERROR;
     const std::unique_ptr<icu::PluralRules> rules(icu::PluralRules::forLocale(localeOf(language), status));
@@ -277,7 +277,7 @@ TEST_P(StringTables, HaveThePluralFormsOfTheirLanguage) {
   });
 }
 
-TEST_P(StringTables, AreTranslated) {
+TEST_P(StringTablesTest, AreTranslated) {
   everyText([this](const std::string& language, const std::string& key, const UnicodeString& value) {
     if (language == "root" || isAbbreviation(english, key) || !hasWordOfThreeLetters(value)) return;
     const auto original = english.find(key);
@@ -287,7 +287,7 @@ TEST_P(StringTables, AreTranslated) {
   });
 }
 
-TEST_P(StringTables, AreFitToBeSpoken) {
+TEST_P(StringTablesTest, AreFitToBeSpoken) {
   everyText([this](const std::string&, const std::string& key, const UnicodeString& value) {
     ASSERT_FALSE(value.isEmpty());
     EXPECT_FALSE(u_isUWhiteSpace(value[0]) || u_isUWhiteSpace(value[value.length() - 1]));
@@ -297,7 +297,7 @@ TEST_P(StringTables, AreFitToBeSpoken) {
   });
 }
 
-TEST_P(StringTables, AgreeWithEveryNumberAsTheirLanguageHasIt) {
+TEST_P(StringTablesTest, AgreeWithEveryNumberAsTheirLanguageHasIt) {
   everyText([](const std::string& language, const std::string&, const UnicodeString& value) {
     EXPECT_FALSE(hasArgument(value, {UMSGPAT_ARG_TYPE_SELECT, UMSGPAT_ARG_TYPE_CHOICE}))
         << "the form depends on a text";
@@ -317,7 +317,7 @@ TEST_P(StringTables, AgreeWithEveryNumberAsTheirLanguageHasIt) {
 }
 
 // A table's patterns with numbers alone, and every pattern around one of them, by pattern and by unit.
-TEST_P(StringTables, SayNoValueAloneHoweverPatternsNest) {
+TEST_P(StringTablesTest, SayNoValueAloneHoweverPatternsNest) {
   using Arguments = std::vector<formatting::MessageArgument>;
   everyText([](const std::string& language, const std::string&, const UnicodeString& value) {
     const std::map<int, bool> arguments = argumentsOf(value);
@@ -340,7 +340,7 @@ TEST_P(StringTables, SayNoValueAloneHoweverPatternsNest) {
 }
 
 // English shows best where a number meets a noun: every other place there takes a name or a percentage.
-TEST_P(StringTables, LeaveNoNounBesideANumberThatItDoesNotAgreeWith) {
+TEST_P(StringTablesTest, LeaveNoNounBesideANumberThatItDoesNotAgreeWith) {
   static const std::set<std::string> withoutNumber = {"achievement.badge.format", "weather.humidity"};
   for (const auto& [key, value] : english) {
     for (int32_t end = value.indexOf(u'}'); end >= 0; end = value.indexOf(u'}', end + 1)) {
@@ -354,10 +354,10 @@ TEST_P(StringTables, LeaveNoNounBesideANumberThatItDoesNotAgreeWith) {
   }
 }
 
-INSTANTIATE_TEST_SUITE_P(All, StringTables, testing::ValuesIn(places),
+INSTANTIATE_TEST_SUITE_P(All, StringTablesTest, testing::ValuesIn(places),
                          [](const auto& place) { return place.param.name; });
 
-TEST(AccessibilityTable, TakesTheArgumentsThatTheCategoriesGive) {
+TEST(AccessibilityTableTest, TakesTheArgumentsThatTheCategoriesGive) {
   using Arguments = std::map<int, bool>;
   const Arguments none, oneText = {{0, false}}, twoTexts = {{0, false}, {1, false}}, count = {{0, true}};
   const Arguments amountOfGoal = {{0, false}, {1, true}};
@@ -377,7 +377,7 @@ TEST(AccessibilityTable, TakesTheArgumentsThatTheCategoriesGive) {
   }
 }
 
-TEST(AccessibilityTable, SpeaksAnAmountOfAGoal) {
+TEST(AccessibilityTableTest, SpeaksAnAmountOfAGoal) {
   const struct {
     const char* language;
     double goal;
@@ -399,7 +399,7 @@ TEST(AccessibilityTable, SpeaksAnAmountOfAGoal) {
   }
 }
 
-TEST(PlatformTable, TellsFortyEightWeatherConditionsApart) {
+TEST(PlatformTableTest, TellsFortyEightWeatherConditionsApart) {
   for (const std::string& language : languages()) {
     const Table table = load(places[1], language);
     std::set<std::string> descriptions;

@@ -35,7 +35,7 @@ reader::AuditScreen audited(const std::filesystem::path& file, const std::string
 
 }  // namespace
 
-TEST(Tour, SpeaksEveryScreenInEveryLanguageWithoutAFault) {
+TEST(TourTest, SpeaksEveryScreenInEveryLanguageWithoutAFault) {
   ASSERT_FALSE(sampleScenes().empty());
   for (const auto& file : sampleScenes()) {
     reader::Audit audit;
@@ -49,7 +49,7 @@ TEST(Tour, SpeaksEveryScreenInEveryLanguageWithoutAFault) {
   }
 }
 
-TEST(Tour, NamesTheTargetOfEveryCategory) {
+TEST(TourTest, NamesTheTargetOfEveryCategory) {
   std::string samples;
   for (const auto& file : sampleScenes()) samples += fileText(file);
   const Presented started(sampleScenes().front(), "");

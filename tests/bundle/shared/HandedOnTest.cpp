@@ -45,7 +45,7 @@ Arguments handedOn(const Class& target, Selector selector, const Arguments& give
   return got;
 }
 
-TEST(HandedOn, EveryArgumentReachesTheHost) {
+TEST(HandedOnTest, EveryArgumentReachesTheHost) {
   ASSERT_NO_FATAL_FAILURE(startBundle());
   std::set<std::string> handing;
   for (const InstallationRequest& request : ValidationManager::sharedInstance()->installationRequests()) {

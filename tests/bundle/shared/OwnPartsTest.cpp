@@ -36,7 +36,7 @@ class OwnPart : public Host {
   Weak<Object> part_;
 };
 
-TEST(OwnParts, AddNothingToWhatTheirObjectsAnswer) {
+TEST(OwnPartsTest, AddNothingToWhatTheirObjectsAnswer) {
   ASSERT_NO_FATAL_FAILURE(startBundle());
   using namespace host;
   for (const auto& made : {&OwnPart<ActivityThreeRingCell, "_dateLabel">::made,
@@ -74,10 +74,10 @@ void PrintTo(const RaisingMethod& method, std::ostream* out) {
   *out << method.name;
 }
 
-class RaisingProvider : public testing::TestWithParam<RaisingMethod> {};
+class RaisingProviderTest : public testing::TestWithParam<RaisingMethod> {};
 
 // The provider is made once in a process, so each of these is whole in one of its own alone.
-TEST_P(RaisingProvider, CostsNoMoreThanTheTitle) {
+TEST_P(RaisingProviderTest, CostsNoMoreThanTheTitle) {
   ASSERT_NO_FATAL_FAILURE(startBundle());
   Class& provider = *Class::named("ODUIAchievementLocalizationProvider");
   const Method before = *provider.ownMethod(Selector::find(GetParam().name));
@@ -92,7 +92,7 @@ TEST_P(RaisingProvider, CostsNoMoreThanTheTitle) {
 }
 
 INSTANTIATE_TEST_SUITE_P(
-    OwnParts, RaisingProvider,
+    OwnParts, RaisingProviderTest,
     testing::Values(
         RaisingMethod{"setName:", [](auto& provider) { provider.template method<&raiseFor>("setName:"); },
                       "Gold"},
