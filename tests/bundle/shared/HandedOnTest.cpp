@@ -6,6 +6,7 @@
 #include "platform/accessibility/ValidationManager.h"
 #include "platform/runtime/Number.h"
 #include "platform/runtime/ScriptedAnswers.h"
+#include "platform/toolkit/AccessibilityMessages.h"
 #include "tests/bundle/StartedBundle.h"
 
 // Categories stand in front of the host's methods: what they hand on is all that the sender gave.
@@ -77,6 +78,32 @@ TEST(HandedOnTest, EveryArgumentReachesTheHost) {
       "initWithNavigationPalette:",
       "setTemperature:humidity:weatherCondition:formattingManager:"};
   EXPECT_EQ(handing, expected);
+}
+
+// What a category loads comes on top of what the host, or a class above, loads for itself.
+TEST(HandedOnTest, EveryLoadReachesTheHostFirst) {
+  ASSERT_NO_FATAL_FAILURE(startBundle());
+  const Selector selector = messages::_accessibilityLoadAccessibilityInformation.selector();
+  std::set<std::string> kept;
+  int checked = 0;
+  for (const InstallationRequest& request : ValidationManager::sharedInstance()->installationRequests()) {
+    Class& category = *Class::named(request.category);
+    bool loads = false;
+    category.forEachOwnMethod([&](const Method& method) { loads |= method.selector == selector; });
+    const Ref<Object> receiver = Class::named(categoryTargetClassName(category))->instantiate();
+    if (!loads || !receiver) continue;
+    int calls = 0;
+    const bool isReplaced = setScriptedAnswer(*receiver, selector, [&calls](auto) {
+      ++calls;
+      return nullptr;
+    });
+    if (!isReplaced) continue;
+    messages::_accessibilityLoadAccessibilityInformation(receiver);
+    ++checked;
+    if (calls != 1) kept.insert(request.category);
+  }
+  EXPECT_EQ(kept, std::set<std::string>());
+  EXPECT_GT(checked, 20);
 }
 
 }  // namespace
